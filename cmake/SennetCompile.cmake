@@ -1,0 +1,29 @@
+# How every target of the project is compiled: link a target to sennet_compile to get it.
+
+add_library(sennet_compile INTERFACE)
+target_compile_options(sennet_compile INTERFACE -Wall -Wextra -Wpedantic -Werror)
+
+if(CMAKE_BUILD_TYPE STREQUAL "Release")
+    # Level 2 of the fortified library functions and the stack protector: the programs run as root.
+    target_compile_options(sennet_compile INTERFACE -fstack-protector-strong)
+    target_compile_definitions(sennet_compile INTERFACE _FORTIFY_SOURCE=2)
+    target_link_options(sennet_compile INTERFACE -Wl,-z,relro,-z,now)
+endif()
+
+if(SENNET_SANITIZE)
+    target_compile_options(sennet_compile INTERFACE -fsanitize=${SENNET_SANITIZE}
+                           -fno-sanitize-recover=all -fno-omit-frame-pointer)
+    target_link_options(sennet_compile INTERFACE -fsanitize=${SENNET_SANITIZE})
+endif()
+
+if(SENNET_BUILD_FUZZERS)
+    if(NOT CMAKE_CXX_COMPILER_ID STREQUAL "Clang")
+        message(FATAL_ERROR "SENNET_BUILD_FUZZERS needs clang++: use the preset fuzz")
+    endif()
+    target_compile_options(sennet_compile INTERFACE -fsanitize=fuzzer-no-link)
+endif()
+
+if(SENNET_COVERAGE)
+    target_compile_options(sennet_compile INTERFACE --coverage -fprofile-update=atomic)
+    target_link_options(sennet_compile INTERFACE --coverage)
+endif()
