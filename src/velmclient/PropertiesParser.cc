@@ -1,0 +1,222 @@
+#include "velmclient/PropertiesParser.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <optional>
+#include <utility>
+
+namespace Velm {
+
+namespace {
+
+constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+constexpr char32_t kReplacementCharacter = 0xFFFD;
+constexpr std::size_t kHexDigits = 4;
+
+bool isBlank(char c) {
+    return c == ' ' || c == '\t';
+}
+
+bool isSeparator(char c) {
+    return c == '=' || c == ':';
+}
+
+bool isHighSurrogate(char32_t unit) {
+    return unit >= 0xD800 && unit < 0xDC00;
+}
+
+bool isLowSurrogate(char32_t unit) {
+    return unit >= 0xDC00 && unit < 0xE000;
+}
+
+std::string_view withoutLeadingBlanks(std::string_view text) {
+    std::size_t count = 0;
+    while (count < text.size() && isBlank(text[count])) {
+        ++count;
+    }
+    return text.substr(count);
+}
+
+std::size_t trailingBackslashes(std::string_view text) {
+    std::size_t count = 0;
+    while (count < text.size() && text[text.size() - 1 - count] == '\\') {
+        ++count;
+    }
+    return count;
+}
+
+// The last blank stays when a backslash escapes it.
+std::string_view withoutTrailingBlanks(std::string_view text) {
+    std::size_t length = text.size();
+    while (length > 0 && isBlank(text[length - 1])) {
+        --length;
+    }
+    const bool escaped = trailingBackslashes(text.substr(0, length)) % 2 == 1;
+    return text.substr(0, escaped && length < text.size() ? length + 1 : length);
+}
+
+bool isContinued(std::string_view line) {
+    return trailingBackslashes(line) % 2 == 1;
+}
+
+bool isCommentOrEmpty(std::string_view unindentedLine) {
+    return unindentedLine.empty() || unindentedLine[0] == '#' || unindentedLine[0] == '!';
+}
+
+std::size_t findSeparator(std::string_view line) {
+    std::size_t i = 0;
+    while (i < line.size() && !isSeparator(line[i])) {
+        i += line[i] == '\\' ? 2 : 1;
+    }
+    return i < line.size() ? i : std::string_view::npos;
+}
+
+void appendUtf8(std::string& out, char32_t c) {
+    const auto continuation = [](char32_t bits) { return static_cast<char>(0x80 | (bits & 0x3F)); };
+    if (c < 0x80) {
+        out += static_cast<char>(c);
+    } else if (c < 0x800) {
+        out += static_cast<char>(0xC0 | (c >> 6));
+        out += continuation(c);
+    } else if (c < 0x10000) {
+        out += static_cast<char>(0xE0 | (c >> 12));
+        out += continuation(c >> 6);
+        out += continuation(c);
+    } else {
+        out += static_cast<char>(0xF0 | (c >> 18));
+        out += continuation(c >> 12);
+        out += continuation(c >> 6);
+        out += continuation(c);
+    }
+}
+
+int hexValue(char c) {
+    if (c >= '0' && c <= '9') {
+        return c - '0';
+    }
+    if (c >= 'a' && c <= 'f') {
+        return c - 'a' + 10;
+    }
+    return c >= 'A' && c <= 'F' ? c - 'A' + 10 : -1;
+}
+
+// The code unit of a `\uXXXX` at the start of the text.
+std::optional<char32_t> codeUnit(std::string_view text) {
+    if (text.size() < 2 + kHexDigits || text[0] != '\\' || text[1] != 'u') {
+        return std::nullopt;
+    }
+    char32_t unit = 0;
+    for (const char c : text.substr(2, kHexDigits)) {
+        const int value = hexValue(c);
+        if (value < 0) {
+            return std::nullopt;
+        }
+        unit = unit * 16 + static_cast<char32_t>(value);
+    }
+    return unit;
+}
+
+// Both return how many bytes of the text, which starts with a backslash, they have decoded.
+std::size_t appendUnicodeEscape(std::string& out, std::string_view text, char32_t unit) {
+    constexpr std::size_t kLength = 2 + kHexDigits;
+    if (isHighSurrogate(unit)) {
+        const std::optional<char32_t> low = codeUnit(text.substr(kLength));
+        if (low && isLowSurrogate(*low)) {
+            appendUtf8(out, 0x10000 + ((unit - 0xD800) << 10) + (*low - 0xDC00));
+            return 2 * kLength;
+        }
+    }
+    const bool unpaired = isHighSurrogate(unit) || isLowSurrogate(unit);
+    appendUtf8(out, unpaired ? kReplacementCharacter : unit);
+    return kLength;
+}
+
+std::size_t appendEscape(std::string& out, std::string_view text) {
+    if (const std::optional<char32_t> unit = codeUnit(text)) {
+        return appendUnicodeEscape(out, text, *unit);
+    }
+    const char next = text.size() > 1 ? text[1] : '\0';
+    if (next == 't') {
+        out += '\t';
+    } else if (next == 'n') {
+        out += '\n';
+    } else if (next == 'r') {
+        out += '\r';
+    } else if (next == '\\' || isBlank(next) || isSeparator(next)) {
+        out += next;
+    } else {
+        out += '\\';
+        return 1;
+    }
+    return 2;
+}
+
+std::string decode(std::string_view text) {
+    std::string out;
+    out.reserve(text.size());
+    while (!text.empty()) {
+        const std::size_t plain = text.find('\\');
+        out.append(text.substr(0, plain));
+        text.remove_prefix(plain == std::string_view::npos ? text.size() : plain);
+        if (!text.empty()) {
+            text.remove_prefix(appendEscape(out, text));
+        }
+    }
+    return out;
+}
+
+}  // namespace
+
+PropertiesParser::PropertiesParser(std::string_view text) : text(text) {
+    if (text.substr(0, kByteOrderMark.size()) == kByteOrderMark) {
+        position = kByteOrderMark.size();
+    }
+}
+
+Properties PropertiesParser::parse() {
+    Properties properties;
+    while (!atEnd()) {
+        const std::string_view line = takeContinuedLine();
+        if (line.empty()) {
+            continue;
+        }
+        const std::size_t separator = findSeparator(line);
+        std::string key = decode(withoutTrailingBlanks(line.substr(0, separator)));
+        std::string value = separator == std::string_view::npos
+                                ? std::string()
+                                : decode(withoutLeadingBlanks(line.substr(separator + 1)));
+        properties.set(std::move(key), std::move(value));
+    }
+    return properties;
+}
+
+std::string_view PropertiesParser::takeLine() {
+    const std::size_t start = position;
+    const std::size_t found = text.find_first_of("\r\n", start);
+    const std::size_t lineEnd = found == std::string_view::npos ? text.size() : found;
+    position = lineEnd + 1;
+    if (text.substr(lineEnd, 2) == "\r\n") {
+        ++position;
+    }
+    return withoutLeadingBlanks(text.substr(start, lineEnd - start));
+}
+
+// A line with those that continue it, without leading blanks; empty for a comment.
+std::string_view PropertiesParser::takeContinuedLine() {
+    std::string_view line = takeLine();
+    if (isCommentOrEmpty(line)) {
+        return {};
+    }
+    if (!isContinued(line)) {
+        return line;
+    }
+    joined.clear();
+    while (isContinued(line)) {
+        joined.append(line.substr(0, line.size() - 1));
+        line = atEnd() ? std::string_view() : takeLine();
+    }
+    joined.append(line);
+    return joined;
+}
+
+}  // namespace Velm

@@ -1,0 +1,213 @@
+#include "velmclient/ReplacingFile.h"
+
+#include <fcntl.h>
+#include <sys/random.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdint>
+#include <cstdio>
+#include <utility>
+
+#include "velmclient/SystemLog.h"
+
+namespace Velm {
+
+namespace {
+
+constexpr std::size_t kBufferSize = 64 * 1024;
+constexpr int kNameAttempts = 100;
+constexpr unsigned int kNewFileMode = 0666;
+constexpr unsigned int kPermissionBits = 0777;
+
+// Does not hold the target's name, which may be as long as a name can be.
+std::string randomHiddenName() {
+    std::uint64_t number = 0;
+    if (::getrandom(&number, sizeof number, 0) != static_cast<ssize_t>(sizeof number)) {
+        return {};
+    }
+    char text[64];
+    std::snprintf(text, sizeof text, ".velm-%016llx.tmp", static_cast<unsigned long long>(number));
+    return text;
+}
+
+std::string descriptorPath(int descriptor) {
+    return "/proc/self/fd/" + std::to_string(descriptor);
+}
+
+// Calls `make` with random hidden names until one is free; make returns 0 or an error number.
+template <typename Make>
+int withFreeName(std::string& hiddenName, Make make) {
+    for (int attempt = 0; attempt < kNameAttempts; ++attempt) {
+        std::string candidate = randomHiddenName();
+        if (candidate.empty()) {
+            return errno;
+        }
+        const int error = make(candidate.c_str());
+        if (error == 0) {
+            hiddenName = std::move(candidate);
+        }
+        if (error != EEXIST) {
+            return error;
+        }
+    }
+    return EEXIST;
+}
+
+}  // namespace
+
+ReplacingFile::ReplacingFile(std::string path, Temporary temporary)
+    : path(std::move(path)), temporary(temporary) {}
+
+ReplacingFile::~ReplacingFile() {
+    discard();
+}
+
+bool ReplacingFile::open() {
+    return note("write", openTemporary());
+}
+
+int ReplacingFile::openTemporary() {
+    const std::size_t slash = path.rfind('/');
+    const std::size_t nameStart = slash == std::string::npos ? 0 : slash + 1;
+    name = path.substr(nameStart);
+    if (name.empty()) {
+        return path.empty() ? ENOENT : EISDIR;
+    }
+    const std::string parent = nameStart == 0 ? "." : path.substr(0, nameStart);
+    directory = FileDescriptor(::open(parent.c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC));
+    if (!directory.isOpen()) {
+        return errno;
+    }
+
+    struct stat previous {};
+    unsigned int mode = kNewFileMode;
+    bool keepMode = false;
+    if (::fstatat(directory.get(), name.c_str(), &previous, AT_SYMLINK_NOFOLLOW) == 0) {
+        // A rename would put a file where a device, a FIFO or a socket stood.
+        if (!S_ISREG(previous.st_mode) && !S_ISLNK(previous.st_mode)) {
+            return S_ISDIR(previous.st_mode) ? EISDIR : EINVAL;
+        }
+        keepMode = S_ISREG(previous.st_mode);
+        mode = keepMode ? previous.st_mode & kPermissionBits : kNewFileMode;
+    } else if (errno != ENOENT) {
+        return errno;
+    }
+
+    if (temporary == Temporary::kNamelessWherePossible) {
+        file =
+            FileDescriptor(::openat(directory.get(), ".", O_TMPFILE | O_WRONLY | O_CLOEXEC, mode));
+        // A nameless file gets its name through /proc, which may not be mounted.
+        if (file.isOpen() && ::access(descriptorPath(file.get()).c_str(), F_OK) != 0) {
+            file.close();
+        }
+    }
+    if (!file.isOpen()) {
+        const int error = openHidden(mode);
+        if (error != 0) {
+            return error;
+        }
+    }
+    // The umask has narrowed the mode. Where the file system keeps no modes, nothing is lost.
+    if (keepMode) {
+        (void)::fchmod(file.get(), mode);
+    }
+    buffer.reserve(kBufferSize);
+    return 0;
+}
+
+int ReplacingFile::openHidden(unsigned int mode) {
+    return withFreeName(hiddenName, [&](const char* candidate) {
+        file = FileDescriptor(::openat(directory.get(), candidate,
+                                       O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC, mode));
+        return file.isOpen() ? 0 : errno;
+    });
+}
+
+bool ReplacingFile::write(std::string_view bytes) {
+    if (failed) {
+        return false;
+    }
+    if (buffer.size() + bytes.size() <= kBufferSize) {
+        buffer.append(bytes);
+        return true;
+    }
+    int error = flush();
+    if (error == 0 && bytes.size() < kBufferSize) {
+        buffer.append(bytes);
+    } else if (error == 0) {
+        error = file.writeAll(bytes.data(), bytes.size());
+    }
+    return note("write", error);
+}
+
+int ReplacingFile::flush() {
+    const int error = file.writeAll(buffer.data(), buffer.size());
+    buffer.clear();
+    return error;
+}
+
+bool ReplacingFile::commit() {
+    if (failed) {
+        return false;
+    }
+    const bool done = note("write", finish());
+    discard();
+    return done;
+}
+
+int ReplacingFile::finish() {
+    int error = flush();
+    // Network and thin file systems tell only now that the bytes did not fit; and after a power cut
+    // the new name must not stand for an empty file. EINVAL: the file system cannot synchronise.
+    if (error == 0 && ::fdatasync(file.get()) != 0 && errno != EINVAL) {
+        error = errno;
+    }
+    if (error == 0 && hiddenName.empty()) {
+        error = linkHidden();
+    }
+    if (error == 0) {
+        error = file.close();
+    }
+    if (error == 0 &&
+        ::renameat(directory.get(), hiddenName.c_str(), directory.get(), name.c_str()) != 0) {
+        error = errno;
+    }
+    if (error == 0) {
+        hiddenName.clear();
+    }
+    return error;
+}
+
+// A link cannot replace a file, so the nameless file gets a hidden name first.
+int ReplacingFile::linkHidden() {
+    const std::string source = descriptorPath(file.get());
+    return withFreeName(hiddenName, [&](const char* candidate) {
+        const int result =
+            ::linkat(AT_FDCWD, source.c_str(), directory.get(), candidate, AT_SYMLINK_FOLLOW);
+        return result == 0 ? 0 : errno;
+    });
+}
+
+bool ReplacingFile::note(const char* action, int error) {
+    if (error != 0) {
+        logFailure(action, path, error);
+        failed = true;
+        discard();
+    }
+    return error == 0;
+}
+
+void ReplacingFile::discard() {
+    file.close();
+    if (!hiddenName.empty()) {
+        if (::unlinkat(directory.get(), hiddenName.c_str(), 0) != 0) {
+            logFailure("remove", hiddenName, errno);
+        }
+        hiddenName.clear();
+    }
+    directory.close();
+}
+
+}  // namespace Velm

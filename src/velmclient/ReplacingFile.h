@@ -1,0 +1,59 @@
+// A file that takes the place of another one only when it is complete. Its bytes go into a
+// temporary file of the same directory, one without a name where the file system knows such, else
+// one with a hidden name; commit renames it. So no reader sees a half-written file, and a process
+// that is killed leaves the previous file whole. Failures are reported to the system log.
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+#include "velmclient/FileDescriptor.h"
+
+namespace Velm {
+
+class ReplacingFile {
+  public:
+    enum class Temporary { kNamelessWherePossible, kHidden };
+
+    // Remembers the path to be replaced; nothing is opened.
+    explicit ReplacingFile(std::string path,
+                           Temporary temporary = Temporary::kNamelessWherePossible);
+
+    // Throws away what was not committed.
+    ~ReplacingFile();
+
+    ReplacingFile(const ReplacingFile&) = delete;
+    ReplacingFile& operator=(const ReplacingFile&) = delete;
+
+    // Makes the temporary file; called once, before the rest. What stands at the path must be
+    // nothing, a regular file or a symbolic link. Returns whether it succeeded.
+    bool open();
+
+    // Appends bytes. Returns false once any write has failed.
+    bool write(std::string_view bytes);
+
+    // Puts the file in its place, with the permissions of the regular file it replaces. Returns
+    // false, the previous file untouched, when this or any write failed. Ends the object's use.
+    bool commit();
+
+  private:
+    int openTemporary();
+    int openHidden(unsigned int mode);
+    int flush();
+    int finish();
+    int linkHidden();
+    bool note(const char* action, int error);
+    void discard();
+
+    std::string path;
+    std::string name;
+    std::string hiddenName;
+    Temporary temporary;
+    FileDescriptor directory;
+    FileDescriptor file;
+    std::string buffer;
+    bool failed = false;
+};
+
+}  // namespace Velm
