@@ -1,0 +1,542 @@
+#include "xml/XmlTokenizer.h"
+
+#include <algorithm>
+#include <array>
+#include <cstring>
+#include <utility>
+
+#include "xml/XmlCharacters.h"
+
+namespace Pegasus {
+
+namespace {
+
+using OctetTable = std::array<bool, 256>;
+
+// The octets at which a scan stops. NUL is among them because it ends the window.
+constexpr OctetTable makeTable(std::string_view stops) {
+    OctetTable table{};
+    table[0] = true;
+    for (const char c : stops) {
+        table[static_cast<unsigned char>(c)] = true;
+    }
+    return table;
+}
+
+constexpr OctetTable kTextStops = makeTable("<>&\r");
+constexpr OctetTable kTagStops = makeTable("<>\"'");
+
+std::size_t skipTo(const OctetTable& stops, const char* data, std::size_t from) {
+    while (!stops[static_cast<unsigned char>(data[from])]) {
+        ++from;
+    }
+    return from;
+}
+
+// A value of 16 or more for what is no digit.
+std::uint32_t digitValue(char c) {
+    if (c >= '0' && c <= '9') {
+        return static_cast<std::uint32_t>(c - '0');
+    }
+    const char lower = static_cast<char>(c | 0x20);
+    return lower >= 'a' && lower <= 'f' ? static_cast<std::uint32_t>(lower - 'a') + 10 : 16;
+}
+
+char* skipSpace(char* p, const char* end) {
+    while (p != end && isXmlSpace(*p)) {
+        ++p;
+    }
+    return p;
+}
+
+}  // namespace
+
+XmlTokenizer::XmlTokenizer(ByteSource& source, Limits limits)
+    : window(source, limits.tokenSize), limits(limits) {}
+
+XmlTokenizer::Token XmlTokenizer::next() {
+    holding = false;
+    return advance();
+}
+
+XmlTokenizer::Token XmlTokenizer::nextHoldingText() {
+    holding = true;
+    heldBegin = textBegin;
+    heldEnd = textEnd;
+    return advance();
+}
+
+XmlTokenizer::Token XmlTokenizer::advance() {
+    if (!started) {
+        begin();
+    }
+    if (emptyElement) {
+        emptyElement = false;
+        return closeElement();
+    }
+    for (;;) {
+        tokenStart = pos;
+        if (!available(1)) {
+            return finish();
+        }
+        if (*at(pos) == '<') {
+            if (startsWith("<?")) {
+                skipInstruction();
+            } else if (startsWith("<!--")) {
+                skipComment();
+            } else {
+                return readMarkup();
+            }
+        } else if (depth() == 0) {
+            skipOuterSpace();
+        } else {
+            return readText();
+        }
+    }
+}
+
+void XmlTokenizer::begin() {
+    started = true;
+    if (startsWith("\xEF\xBB\xBF")) {
+        pos += 3;
+    }
+    declarationOffset = window.offsetOf(pos);
+}
+
+XmlTokenizer::Token XmlTokenizer::finish() {
+    if (depth() != 0 || !rootSeen) {
+        failTruncated();
+    }
+    return Token::End;
+}
+
+XmlTokenizer::Token XmlTokenizer::readMarkup() {
+    if (startsWith("</")) {
+        return readEndTag();
+    }
+    if (startsWith("<![CDATA[")) {
+        return readCData();
+    }
+    if (startsWith("<!")) {
+        const bool isDoctype = startsWith("<!DOCTYPE");
+        fail(XmlError::Kind::Syntax, offset(),
+             isDoctype ? "a document type declaration is refused"
+                       : "\"<!\" begins neither a comment nor a CDATA section");
+    }
+    return readStartTag();
+}
+
+void XmlTokenizer::skipOuterSpace() {
+    if (!isXmlSpace(*at(pos))) {
+        failAt(at(pos), std::string("text stands ") +
+                            (rootSeen ? "after the root element; expected the end"
+                                      : "before the root element; expected a tag"));
+    }
+    while (isXmlSpace(*at(pos))) {
+        ++pos;
+    }
+}
+
+XmlTokenizer::Token XmlTokenizer::readText() {
+    bool isPlain = true;
+    for (;;) {
+        pos = skipTo(kTextStops, window.data(), pos);
+        const char stop = *at(pos);
+        if (stop == '<') {
+            break;
+        }
+        if (stop == '\0') {
+            if (!more()) {
+                failTruncated();
+            }
+            continue;
+        }
+        if (stop == '>') {
+            if (view(tokenStart, pos).ends_with("]]")) {
+                failAt(at(pos), "\"]]>\" stands in a text; expected \"]]&gt;\"");
+            }
+        } else {
+            isPlain = false;
+        }
+        ++pos;
+    }
+    textBegin = tokenStart;
+    textEnd = pos;
+    if (textEnd - textBegin > limits.tokenSize) {
+        fail(XmlError::Kind::Limit, offset(), "a text is too long");
+    }
+    if (!isPlain) {
+        const char* decodedEnd = decode(at(textBegin), at(textEnd), false);
+        textEnd = static_cast<std::size_t>(decodedEnd - window.data());
+    }
+    return Token::Text;
+}
+
+XmlTokenizer::Token XmlTokenizer::readStartTag() {
+    if (depth() == 0 && rootSeen) {
+        fail(XmlError::Kind::Syntax, offset(), "a second root element begins; expected the end");
+    }
+    ++pos;
+    scanTag();
+    char* const nameBegin = at(tokenStart + 1);
+    const char* end = at(pos - 1);
+    if (end[-1] == '/') {
+        emptyElement = true;
+        --end;
+    }
+    char* const nameEnd = parseName(nameBegin, "an element's name");
+    currentName = {nameBegin, static_cast<std::size_t>(nameEnd - nameBegin)};
+    if (depth() == limits.depth) {
+        fail(XmlError::Kind::Limit, offset(),
+             "element " + quotedForMessage(currentName) + " is nested deeper than " +
+                 std::to_string(limits.depth) + " elements");
+    }
+    currentAttributes.clear();
+    parseAttributes(nameEnd, end);
+    rootSeen = true;
+    nameStarts.push_back(openNames.size());
+    openNames += currentName;
+    return Token::StartElement;
+}
+
+XmlTokenizer::Token XmlTokenizer::readEndTag() {
+    pos += 2;
+    scanTo(">", "end tag");
+    char* const begin = at(tokenStart + 2);
+    char* const nameEnd = parseName(begin, "an element's name");
+    currentName = {begin, static_cast<std::size_t>(nameEnd - begin)};
+    const char* rest = skipSpace(nameEnd, at(pos - 1));
+    if (rest != at(pos - 1)) {
+        failAt(rest, "end tag of " + quotedForMessage(currentName) + " goes on; expected \">\"");
+    }
+    if (depth() == 0 || currentName != innermostName()) {
+        fail(XmlError::Kind::Syntax, offset(),
+             "end tag of " + quotedForMessage(currentName) + " closes nothing; expected " +
+                 (depth() == 0 ? "the end" : "that of " + quotedForMessage(innermostName())));
+    }
+    return closeElement();
+}
+
+XmlTokenizer::Token XmlTokenizer::readCData() {
+    if (depth() == 0) {
+        fail(XmlError::Kind::Syntax, offset(), "a CDATA section stands outside the root element");
+    }
+    constexpr std::string_view kOpening = "<![CDATA[";
+    constexpr std::string_view kClosing = "]]>";
+    pos += kOpening.size();
+    scanTo(kClosing, "CDATA section");
+    textBegin = tokenStart + kOpening.size();
+    textEnd = pos - kClosing.size();
+    char* const begin = at(textBegin);
+    if (std::memchr(begin, '\r', textEnd - textBegin) != nullptr) {
+        char* out = begin;
+        for (const char* p = begin; p != at(textEnd); ++p) {
+            if (*p == '\r') {
+                *out++ = '\n';
+                p += p[1] == '\n' ? 1 : 0;
+            } else {
+                *out++ = *p;
+            }
+        }
+        textEnd = static_cast<std::size_t>(out - window.data());
+    }
+    return Token::CData;
+}
+
+XmlTokenizer::Token XmlTokenizer::closeElement() {
+    openNames.resize(nameStarts.back());
+    nameStarts.pop_back();
+    return Token::EndElement;
+}
+
+void XmlTokenizer::skipInstruction() {
+    const bool mayDeclare = offset() == declarationOffset;
+    pos += 2;
+    scanTo("?>", "processing instruction");
+    char* const target = at(tokenStart + 2);
+    char* const targetEnd = parseName(target, "a processing instruction's name");
+    const char* const end = at(pos - 2);
+    if (targetEnd != end && !isXmlSpace(*targetEnd)) {
+        failAt(targetEnd, "a processing instruction's name goes on; expected white space");
+    }
+    const std::string_view name(target, static_cast<std::size_t>(targetEnd - target));
+    if (name == "xml" && mayDeclare) {
+        checkDeclaration(targetEnd, end);
+    } else if (equalsIgnoringCase(name, "xml")) {
+        failAt(target, "an XML declaration stands elsewhere than at the beginning");
+    }
+}
+
+void XmlTokenizer::skipComment() {
+    pos += 4;
+    scanTo("--", "comment");
+    if (!available(1)) {
+        failTruncated();
+    }
+    if (*at(pos) != '>') {
+        failAt(at(pos), "\"--\" stands in a comment; expected \"-->\"");
+    }
+    ++pos;
+}
+
+// A declaration reads like a tag's attributes, but which of them and in which order is fixed.
+void XmlTokenizer::checkDeclaration(char* begin, const char* end) {
+    currentAttributes.clear();
+    parseAttributes(begin, end);
+    auto next = currentAttributes.cbegin();
+    const auto take = [&](std::string_view name) {
+        const bool found = next != currentAttributes.cend() && next->name == name;
+        return found ? (next++)->value : std::string_view();
+    };
+    if (!take("version").starts_with("1.")) {
+        failAt(begin, "the XML declaration names no version 1.x");
+    }
+    const std::string_view encoding = take("encoding");
+    if (!encoding.empty() && !equalsIgnoringCase(encoding, "utf-8") &&
+        !equalsIgnoringCase(encoding, "us-ascii")) {
+        failAt(begin, "the encoding is " + quotedForMessage(encoding) + "; expected UTF-8");
+    }
+    const std::string_view standalone = take("standalone");
+    if (next != currentAttributes.cend() ||
+        (!standalone.empty() && standalone != "yes" && standalone != "no")) {
+        failAt(begin, "the XML declaration is malformed");
+    }
+}
+
+// Leaves the position behind the ">" that ends the tag.
+void XmlTokenizer::scanTag() {
+    char quote = '\0';
+    for (;;) {
+        if (quote == '\0') {
+            pos = skipTo(kTagStops, window.data(), pos);
+        } else {
+            while (*at(pos) != quote && *at(pos) != '<' && *at(pos) != '\0') {
+                ++pos;
+            }
+        }
+        const char stop = *at(pos);
+        if (stop == '\0') {
+            if (!more()) {
+                failTruncated();
+            }
+            continue;
+        }
+        if (stop == '<') {
+            failAt(at(pos), "\"<\" stands inside a tag; expected \">\" or \"&lt;\"");
+        }
+        ++pos;
+        if (quote != '\0') {
+            quote = '\0';
+        } else if (stop == '>') {
+            return;
+        } else {
+            quote = stop;
+        }
+    }
+}
+
+// Leaves the position behind the terminator.
+void XmlTokenizer::scanTo(std::string_view terminator, const char* where) {
+    for (;;) {
+        const std::string_view rest = view(pos, window.size());
+        const std::size_t found = rest.find(terminator);
+        if (found != std::string_view::npos) {
+            pos += found + terminator.size();
+            break;
+        }
+        pos += rest.size() - std::min(rest.size(), terminator.size() - 1);
+        if (!more()) {
+            failTruncated();
+        }
+    }
+    if (pos - tokenStart > limits.tokenSize) {
+        fail(XmlError::Kind::Limit, offset(), std::string(where) + " is too long");
+    }
+}
+
+char* XmlTokenizer::parseName(char* p, const char* expected) {
+    if (!isNameStart(*p)) {
+        failAt(p, std::string("expected ") + expected);
+    }
+    while (isNameCharacter(*p)) {
+        ++p;
+    }
+    return p;
+}
+
+void XmlTokenizer::parseAttributes(char* p, const char* end) {
+    for (;;) {
+        char* const begin = skipSpace(p, end);
+        if (begin == end) {
+            return;
+        }
+        if (begin == p) {
+            failAt(p, "expected white space, \"/>\" or \">\"");
+        }
+        p = parseAttribute(begin, end);
+    }
+}
+
+char* XmlTokenizer::parseAttribute(char* p, const char* end) {
+    Attribute attribute;
+    char* const nameEnd = parseName(p, "an attribute's name");
+    attribute.name = {p, static_cast<std::size_t>(nameEnd - p)};
+    checkNewAttribute(attribute.name);
+    p = skipSpace(nameEnd, end);
+    if (p == end || *p != '=') {
+        failAt(p,
+               "attribute " + quotedForMessage(attribute.name) + " has no value; expected \"=\"");
+    }
+    p = skipSpace(p + 1, end);
+    if (p == end || (*p != '"' && *p != '\'')) {
+        failAt(p, "attribute " + quotedForMessage(attribute.name) +
+                      " has no quoted value; expected a quotation mark");
+    }
+    const char quote = *p++;
+    char* const valueBegin = p;
+    bool isPlain = true;
+    while (p != end && *p != quote) {
+        isPlain = isPlain && *p != '&' && (*p == ' ' || !isXmlSpace(*p));
+        ++p;
+    }
+    if (p == end) {
+        failAt(p, "attribute " + quotedForMessage(attribute.name) + " does not end");
+    }
+    const char* valueEnd = isPlain ? p : decode(valueBegin, p, true);
+    attribute.value = {valueBegin, static_cast<std::size_t>(valueEnd - valueBegin)};
+    currentAttributes.push_back(attribute);
+    return p + 1;
+}
+
+void XmlTokenizer::checkNewAttribute(std::string_view name) const {
+    for (const Attribute& earlier : currentAttributes) {
+        if (earlier.name == name) {
+            failAt(name.data(), "attribute " + quotedForMessage(name) + " is given twice");
+        }
+    }
+    if (currentAttributes.size() == limits.attributes) {
+        fail(XmlError::Kind::Limit, offset(),
+             "element " + quotedForMessage(currentName) + " has more than " +
+                 std::to_string(limits.attributes) + " attributes");
+    }
+}
+
+// Replaces references and normalises line ends in place; in attribute values line ends and tabs
+// become blanks (XML 1.0, 2.11 and 3.3.3). Returns the new end.
+char* XmlTokenizer::decode(char* begin, const char* end, bool isAttribute) {
+    char* out = begin;
+    const char* p = begin;
+    while (p != end) {
+        if (*p == '&') {
+            p = decodeReference(p, end, out);
+            continue;
+        }
+        char c = *p++;
+        if (c == '\r') {
+            c = '\n';
+            p += p != end && *p == '\n' ? 1 : 0;
+        }
+        *out++ = isAttribute && isXmlSpace(c) ? ' ' : c;
+    }
+    return out;
+}
+
+// Takes the reference at `p`, writes what it stands for and returns where it ends.
+const char* XmlTokenizer::decodeReference(const char* p, const char* end, char*& out) {
+    const char* const begin = p + 1;
+    const char* const semicolon =
+        static_cast<const char*>(std::memchr(begin, ';', static_cast<std::size_t>(end - begin)));
+    if (semicolon == nullptr) {
+        failAt(p, "\"&\" begins no reference; expected \"&amp;\"");
+    }
+    const std::string_view name(begin, static_cast<std::size_t>(semicolon - begin));
+    if (name.starts_with('#')) {
+        out = putUtf8(out, parseCharacterNumber(begin, semicolon));
+        return semicolon + 1;
+    }
+    using Entity = std::pair<std::string_view, char>;
+    constexpr std::array<Entity, 5> kEntities{
+        {{"lt", '<'}, {"gt", '>'}, {"amp", '&'}, {"quot", '"'}, {"apos", '\''}}};
+    for (const Entity& entity : kEntities) {
+        if (entity.first == name) {
+            *out++ = entity.second;
+            return semicolon + 1;
+        }
+    }
+    failAt(p, "entity " + quotedForMessage(name) + " is not defined");
+}
+
+// `begin` is at the "#", `end` at the semicolon.
+std::uint32_t XmlTokenizer::parseCharacterNumber(const char* begin, const char* end) const {
+    const bool isHex = begin[1] == 'x';
+    const char* p = begin + (isHex ? 2 : 1);
+    const std::uint32_t radix = isHex ? 16 : 10;
+    bool isValid = p != end;
+    std::uint32_t code = 0;
+    for (; isValid && p != end; ++p) {
+        const std::uint32_t digit = digitValue(*p);
+        isValid = digit < radix && code <= 0x10FFFF;
+        code = code * radix + digit;
+    }
+    if (!isValid || !isReferable(code)) {
+        failAt(begin, "character reference " +
+                          quotedForMessage({begin, static_cast<std::size_t>(end - begin)}) +
+                          " names no character");
+    }
+    return code;
+}
+
+bool XmlTokenizer::more() {
+    std::size_t removed = 0;
+    const bool extended = window.extend(holding ? heldBegin : tokenStart, removed);
+    pos -= removed;
+    tokenStart -= removed;
+    textBegin -= removed;
+    textEnd -= removed;
+    heldBegin -= removed;
+    heldEnd -= removed;
+    return extended;
+}
+
+bool XmlTokenizer::available(std::size_t count) {
+    while (window.size() - pos < count) {
+        if (!more()) {
+            return false;
+        }
+    }
+    return true;
+}
+
+bool XmlTokenizer::startsWith(std::string_view expected) {
+    for (std::size_t i = 0; i < expected.size(); ++i) {
+        if (!available(i + 1) || *at(pos + i) != expected[i]) {
+            return false;
+        }
+    }
+    return true;
+}
+
+std::string_view XmlTokenizer::innermostName() const {
+    return std::string_view(openNames).substr(nameStarts.back());
+}
+
+void XmlTokenizer::fail(XmlError::Kind kind, std::uint64_t where, std::string message) const {
+    throw XmlError{kind, where, std::move(message) + "; at byte " + std::to_string(where)};
+}
+
+void XmlTokenizer::failAt(const char* place, std::string message) const {
+    const auto index = static_cast<std::size_t>(place - window.data());
+    fail(XmlError::Kind::Syntax, window.offsetOf(index), std::move(message));
+}
+
+void XmlTokenizer::failTruncated() const {
+    std::string message = "the document ends too early; expected ";
+    if (depth() != 0) {
+        message += "the end of element " + quotedForMessage(innermostName());
+    } else {
+        message += rootSeen ? "the end of a comment or instruction" : "a root element";
+    }
+    fail(XmlError::Kind::Truncated, window.offsetOf(window.size()), std::move(message));
+}
+
+}  // namespace Pegasus
