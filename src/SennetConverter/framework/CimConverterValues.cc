@@ -72,7 +72,7 @@ String readMaxLen(CIMProperty& property, bool& hasValues) {
     String maxLength("-1");
     for (Uint32 i = 0; i < property.getQualifierCount() && !hasValues; ++i) {
         const CIMQualifier qualifier = property.getQualifier(i);
-        const String& name = qualifier.getName().getString();
+        const String name = qualifier.getName().getString();
         if (String::equalNoCase(name, "values")) {
             hasValues = true;
         } else if (String::equalNoCase(name, "maxlen")) {

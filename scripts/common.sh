@@ -1,0 +1,58 @@
+# Functions of ./run, ./test and .ci/run.
+
+step() {
+    printf '==> %s\n' "$*" >&2
+}
+
+fail() {
+    printf '%s: %s\n' "$(basename "$0")" "$*" >&2
+    exit 1
+}
+
+# Installs those of the named Debian packages that are missing.
+need_packages() {
+    command -v dpkg-query >/dev/null || fail "this script installs Debian packages, and dpkg is not here"
+    local missing=() package
+    for package in "$@"; do
+        dpkg-query -W -f='${db:Status-Status}' "$package" 2>/dev/null | grep -qx installed ||
+            missing+=("$package")
+    done
+    [ ${#missing[@]} -eq 0 ] && return
+    local as_root=()
+    if [ "$(id -u)" -ne 0 ]; then
+        command -v sudo >/dev/null || fail "packages are missing and need root or sudo: ${missing[*]}"
+        as_root=(sudo)
+    fi
+    step "installing ${missing[*]}"
+    local log
+    log=$(mktemp)
+    if ! { "${as_root[@]}" apt-get update &&
+        "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
+            apt-get install -y --no-install-recommends "${missing[@]}"; } >"$log" 2>&1 </dev/null; then
+        cat "$log" >&2
+        rm -f "$log"
+        fail "could not install ${missing[*]}"
+    fi
+    rm -f "$log"
+}
+
+BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev libcli11-dev
+    libfmt-dev)
+TEST_PACKAGES=(libgtest-dev libgmock-dev)
+
+# Configures a preset unless that is done, and builds it. What a quiet build prints is shown when
+# it fails.
+build_preset() {
+    local preset=$1 log
+    shift
+    log=$(mktemp)
+    if [ ! -f "$ROOT/build/$preset/build.ninja" ]; then
+        step "configuring $preset"
+        (cd "$ROOT" && cmake --preset "$preset") >"$log" 2>&1 ||
+            { cat "$log" >&2; rm -f "$log"; fail "configuring $preset failed"; }
+    fi
+    step "building $preset"
+    (cd "$ROOT" && cmake --build --preset "$preset" "$@") >"$log" 2>&1 ||
+        { cat "$log" >&2; rm -f "$log"; fail "building $preset failed"; }
+    rm -f "$log"
+}
