@@ -6,6 +6,7 @@
 
 #include <cerrno>
 #include <cstddef>
+#include <cstdint>
 
 namespace Velm {
 
@@ -28,7 +29,7 @@ class Converter {
     Converter(const Converter&) = delete;
     Converter& operator=(const Converter&) = delete;
 
-    bool isOpen() const { return handle != reinterpret_cast<iconv_t>(-1); }
+    bool isOpen() const { return reinterpret_cast<std::intptr_t>(handle) != -1; }
 
     // Appends what can be converted from the front of the text and takes it away from there.
     void convert(std::string_view& text, std::string& out) const {

@@ -65,10 +65,35 @@ ReplacingFile::~ReplacingFile() {
 }
 
 bool ReplacingFile::open() {
-    return note("write", openTemporary());
+    return succeeded(prepare());
 }
 
-int ReplacingFile::openTemporary() {
+int ReplacingFile::prepare() {
+    int error = openDirectory();
+    if (error == 0) {
+        error = readPreviousMode();
+    }
+    if (error != 0) {
+        return error;
+    }
+    const unsigned int mode = previousMode.value_or(kNewFileMode);
+    if (temporary == Temporary::kNamelessWherePossible) {
+        openNameless(mode);
+    }
+    if (!file.isOpen()) {
+        error = openHidden(mode);
+    }
+    // The umask has narrowed the mode. Where the file system keeps no modes, nothing is lost.
+    if (error == 0 && previousMode) {
+        (void)::fchmod(file.get(), mode);
+    }
+    buffer.reserve(kBufferSize);
+    return error;
+}
+
+// Everything else is done relative to the directory, so that neither a change of the working
+// directory nor a rename of this one parts the temporary file from its target.
+int ReplacingFile::openDirectory() {
     const std::size_t slash = path.rfind('/');
     const std::size_t nameStart = slash == std::string::npos ? 0 : slash + 1;
     name = path.substr(nameStart);
@@ -77,44 +102,31 @@ int ReplacingFile::openTemporary() {
     }
     const std::string parent = nameStart == 0 ? "." : path.substr(0, nameStart);
     directory = FileDescriptor(::open(parent.c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC));
-    if (!directory.isOpen()) {
-        return errno;
-    }
+    return directory.isOpen() ? 0 : errno;
+}
 
+int ReplacingFile::readPreviousMode() {
     struct stat previous {};
-    unsigned int mode = kNewFileMode;
-    bool keepMode = false;
-    if (::fstatat(directory.get(), name.c_str(), &previous, AT_SYMLINK_NOFOLLOW) == 0) {
-        // A rename would put a file where a device, a FIFO or a socket stood.
-        if (!S_ISREG(previous.st_mode) && !S_ISLNK(previous.st_mode)) {
-            return S_ISDIR(previous.st_mode) ? EISDIR : EINVAL;
-        }
-        keepMode = S_ISREG(previous.st_mode);
-        mode = keepMode ? previous.st_mode & kPermissionBits : kNewFileMode;
-    } else if (errno != ENOENT) {
-        return errno;
+    if (::fstatat(directory.get(), name.c_str(), &previous, AT_SYMLINK_NOFOLLOW) != 0) {
+        return errno == ENOENT ? 0 : errno;
     }
+    if (S_ISREG(previous.st_mode)) {
+        previousMode = previous.st_mode & kPermissionBits;
+        return 0;
+    }
+    if (S_ISLNK(previous.st_mode)) {
+        return 0;
+    }
+    // A rename would put a file where a device, a FIFO or a socket stood.
+    return S_ISDIR(previous.st_mode) ? EISDIR : EINVAL;
+}
 
-    if (temporary == Temporary::kNamelessWherePossible) {
-        file =
-            FileDescriptor(::openat(directory.get(), ".", O_TMPFILE | O_WRONLY | O_CLOEXEC, mode));
-        // A nameless file gets its name through /proc, which may not be mounted.
-        if (file.isOpen() && ::access(descriptorPath(file.get()).c_str(), F_OK) != 0) {
-            file.close();
-        }
+void ReplacingFile::openNameless(unsigned int mode) {
+    file = FileDescriptor(::openat(directory.get(), ".", O_TMPFILE | O_WRONLY | O_CLOEXEC, mode));
+    // It gets its name through /proc, which may not be mounted.
+    if (file.isOpen() && ::access(descriptorPath(file.get()).c_str(), F_OK) != 0) {
+        file.close();
     }
-    if (!file.isOpen()) {
-        const int error = openHidden(mode);
-        if (error != 0) {
-            return error;
-        }
-    }
-    // The umask has narrowed the mode. Where the file system keeps no modes, nothing is lost.
-    if (keepMode) {
-        (void)::fchmod(file.get(), mode);
-    }
-    buffer.reserve(kBufferSize);
-    return 0;
 }
 
 int ReplacingFile::openHidden(unsigned int mode) {
@@ -139,7 +151,7 @@ bool ReplacingFile::write(std::string_view bytes) {
     } else if (error == 0) {
         error = file.writeAll(bytes.data(), bytes.size());
     }
-    return note("write", error);
+    return succeeded(error);
 }
 
 int ReplacingFile::flush() {
@@ -152,7 +164,7 @@ bool ReplacingFile::commit() {
     if (failed) {
         return false;
     }
-    const bool done = note("write", finish());
+    const bool done = succeeded(finish());
     discard();
     return done;
 }
@@ -190,9 +202,9 @@ int ReplacingFile::linkHidden() {
     });
 }
 
-bool ReplacingFile::note(const char* action, int error) {
+bool ReplacingFile::succeeded(int error) {
     if (error != 0) {
-        logFailure(action, path, error);
+        logFailure("write", path, error);
         failed = true;
         discard();
     }

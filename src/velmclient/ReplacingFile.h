@@ -4,7 +4,7 @@
 // that is killed leaves the previous file whole. Failures are reported to the system log.
 #pragma once
 
-#include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -38,18 +38,26 @@ class ReplacingFile {
     bool commit();
 
   private:
-    int openTemporary();
+    // These return 0 or the error number.
+    int prepare();
+    int openDirectory();
+    int readPreviousMode();
     int openHidden(unsigned int mode);
     int flush();
     int finish();
     int linkHidden();
-    bool note(const char* action, int error);
+
+    void openNameless(unsigned int mode);
+
+    // Returns whether there was no error; after one it is reported and everything thrown away.
+    bool succeeded(int error);
     void discard();
 
     std::string path;
     std::string name;
     std::string hiddenName;
     Temporary temporary;
+    std::optional<unsigned int> previousMode;
     FileDescriptor directory;
     FileDescriptor file;
     std::string buffer;

@@ -1,0 +1,109 @@
+// The road that is taken where the file system knows no nameless files; the other one is that of
+// the TextFile tests wherever it does.
+#include "velmclient/ReplacingFile.h"
+
+#include <fcntl.h>
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <string>
+#include <vector>
+
+#include "SyslogSpy.h"
+#include "TempDirectory.h"
+
+namespace Velm {
+namespace {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::MatchesRegex;
+
+TEST(ReplacingFile, TheHiddenFileBecomesTheFile) {
+    const TempDirectory directory;
+    directory.write("a", "old");
+    ReplacingFile file(directory.path("a"), ReplacingFile::Temporary::kHidden);
+    ASSERT_TRUE(file.open());
+    EXPECT_THAT(directory.names(),
+                ElementsAre(MatchesRegex("\\.velm-[0-9a-f]+\\.tmp"), std::string("a")));
+    EXPECT_TRUE(file.write("new"));
+    EXPECT_EQ(directory.read("a"), "old");
+    EXPECT_TRUE(file.commit());
+    EXPECT_EQ(directory.read("a"), "new");
+    EXPECT_THAT(directory.names(), ElementsAre("a"));
+}
+
+TEST(ReplacingFile, TheHiddenFileGoesWithTheObject) {
+    const TempDirectory directory;
+    directory.write("a", "old");
+    {
+        ReplacingFile file(directory.path("a"), ReplacingFile::Temporary::kHidden);
+        ASSERT_TRUE(file.open());
+        EXPECT_TRUE(file.write(std::string(100000, 'x')));
+    }
+    EXPECT_EQ(directory.read("a"), "old");
+    EXPECT_THAT(directory.names(), ElementsAre("a"));
+}
+
+TEST(ReplacingFile, TheHiddenFileGoesWhenTheRenameFails) {
+    const TempDirectory directory;
+    ReplacingFile file(directory.path("a"), ReplacingFile::Temporary::kHidden);
+    ASSERT_TRUE(file.open());
+    ASSERT_EQ(::mkdir(directory.path("a").c_str(), 0700), 0);
+    takeSyslog();
+    EXPECT_FALSE(file.commit());
+    EXPECT_THAT(directory.names(), ElementsAre("a"));
+    const auto log = takeSyslog();
+    ASSERT_EQ(log.size(), 1U);
+    EXPECT_EQ(log[0].text, "cannot write " + directory.path("a") + ": Is a directory");
+}
+
+TEST(ReplacingFile, TwoWritersOfOneFileDoNotMeet) {
+    const TempDirectory directory;
+    ReplacingFile first(directory.path("a"), ReplacingFile::Temporary::kHidden);
+    ReplacingFile second(directory.path("a"), ReplacingFile::Temporary::kHidden);
+    ASSERT_TRUE(first.open());
+    ASSERT_TRUE(second.open());
+    EXPECT_TRUE(first.write("first"));
+    EXPECT_TRUE(second.write("second"));
+    EXPECT_TRUE(second.commit());
+    EXPECT_EQ(directory.read("a"), "second");
+    EXPECT_TRUE(first.commit());
+    EXPECT_EQ(directory.read("a"), "first");
+    EXPECT_THAT(directory.names(), ElementsAre("a"));
+}
+
+TEST(ReplacingFile, ANamelessFileIsNotSeenAtAll) {
+    const TempDirectory directory;
+    const int probe = ::open(directory.path().c_str(), O_TMPFILE | O_WRONLY, 0600);
+    if (probe < 0) {
+        GTEST_SKIP() << "no nameless files in " << directory.path();
+    }
+    ::close(probe);
+    ReplacingFile file(directory.path("a"));
+    ASSERT_TRUE(file.open());
+    EXPECT_TRUE(file.write(std::string(100000, 'x')));
+    EXPECT_THAT(directory.names(), IsEmpty());
+    EXPECT_TRUE(file.commit());
+    EXPECT_THAT(directory.names(), ElementsAre("a"));
+}
+
+TEST(ReplacingFile, TheModeIsKeptOnBothRoads) {
+    const TempDirectory directory;
+    const std::string path = directory.write("a", "old");
+    for (const auto temporary :
+         {ReplacingFile::Temporary::kHidden, ReplacingFile::Temporary::kNamelessWherePossible}) {
+        ASSERT_EQ(::chmod(path.c_str(), 0604), 0);
+        ReplacingFile file(path, temporary);
+        ASSERT_TRUE(file.open());
+        ASSERT_TRUE(file.commit());
+        struct stat status {};
+        ASSERT_EQ(::stat(path.c_str(), &status), 0);
+        EXPECT_EQ(status.st_mode & 07777U, 0604U);
+    }
+}
+
+}  // namespace
+}  // namespace Velm
