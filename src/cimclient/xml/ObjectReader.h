@@ -1,0 +1,57 @@
+// Reads the elements of DSP0201 that declare classes and instances.
+
+#pragma once
+
+#include <Pegasus/Common/Array.h>
+#include <Pegasus/Common/CIMClass.h>
+#include <Pegasus/Common/CIMInstance.h>
+#include <Pegasus/Common/CIMProperty.h>
+#include <Pegasus/Common/CIMQualifier.h>
+
+#include <string_view>
+
+#include "xml/DecodeContext.h"
+#include "xml/ElementReader.h"
+#include "xml/PathReader.h"
+#include "xml/ValueReader.h"
+
+namespace Pegasus {
+
+/// Each function reads the element that it is named after, which the reader has just entered.
+/// Failures are XmlError; the context then says in which class and property.
+class ObjectReader {
+  public:
+    /// Both must outlive the object reader.
+    ObjectReader(ElementReader& reader, DecodeContext& context)
+        : reader(reader), context(context), values(reader, context), paths(reader, context) {}
+
+    /// VALUE.NAMEDINSTANCE: an instance with its path.
+    CIMInstance readNamedInstance();
+    /// INSTANCE.
+    CIMInstance readInstance();
+    /// CLASS. Its methods are checked and left out.
+    CIMClass readClass();
+
+  private:
+    template <typename Owner>
+    bool readMember(Owner& owner);
+    template <typename Owner, typename Member>
+    void add(Owner& owner, Member member, const char* kind) const;
+
+    CIMProperty readProperty();
+    CIMProperty readPropertyArray();
+    CIMProperty readPropertyReference();
+    CIMProperty readPropertyBody(CIMValue value, std::string_view valueElement,
+                                 Uint32 arraySize = 0, const CIMName& referenceClass = CIMName());
+    Uint32 readArraySize() const;
+    CIMQualifier readQualifier();
+    void skipMethod();
+    void skipParameter();
+
+    ElementReader& reader;
+    DecodeContext& context;
+    ValueReader values;
+    PathReader paths;
+};
+
+}  // namespace Pegasus
