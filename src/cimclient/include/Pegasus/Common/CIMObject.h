@@ -7,9 +7,11 @@
 namespace Pegasus {
 
 class ObjectBody;
+class CIMClass;
 class CIMConstClass;
 class CIMConstInstance;
 class CIMConstProperty;
+class CIMInstance;
 
 /// A handle on a class or an instance, shared with the handle it was made of. Getters of a
 /// default-constructed handle raise UninitializedObjectException. For what is not here make a
@@ -18,8 +20,8 @@ class CIMObject {
   public:
     CIMObject() = default;
     /// Raise UninitializedObjectException for a default-constructed handle.
-    CIMObject(const CIMConstClass& cimClass);
-    CIMObject(const CIMConstInstance& instance);
+    explicit CIMObject(const CIMClass& cimClass);
+    explicit CIMObject(const CIMInstance& instance);
 
     Boolean isClass() const;
     Boolean isInstance() const;
@@ -34,7 +36,9 @@ class CIMObject {
   private:
     friend class CIMConstClass;
     friend class CIMConstInstance;
+    explicit CIMObject(ObjectBody* newBody);
     ObjectBody& access() const;
+
     BodyRef<ObjectBody> body;
 };
 

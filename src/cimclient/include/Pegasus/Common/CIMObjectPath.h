@@ -16,12 +16,13 @@ class CIMObjectPath {
   public:
     /// An empty path.
     CIMObjectPath();
-    /// `host` may be empty, `nameSpace` null, `className` null in an empty path only. Raises
-    /// MalformedObjectNameException for a host that setHost() would refuse.
+    /// `host` may be empty, `nameSpace` and `className` null. Raises MalformedObjectNameException
+    /// for a host that setHost() would refuse.
     CIMObjectPath(const String& host, CIMNamespaceName nameSpace, CIMName className,
                   Array<CIMKeyBinding> keyBindings = Array<CIMKeyBinding>());
     /// Reads [//host/][namespace:]Class[.key=value,key=value]. A value in quotes is read as a
-    /// string, also when it is the text of a path. Raises MalformedObjectNameException.
+    /// string, also when it is the text of a path; the empty text is the empty path. Raises
+    /// MalformedObjectNameException.
     CIMObjectPath(const String& text);
     CIMObjectPath(const char* text);
 

@@ -9,6 +9,9 @@
 #include <Pegasus/Common/Char16.h>
 #include <Pegasus/Common/String.h>
 
+#include <utility>
+#include <variant>
+
 namespace Pegasus {
 
 /// Copies are values of their own, but the embedded objects, instances and paths in them are
@@ -57,6 +60,15 @@ class CIMValue {
         else if constexpr (CimTypeTraits<T>::kIsArray)
             out.clear();
     }
+
+    /// Calls `visitor` with the data in their own type, or with std::monostate for null.
+    template <class Visitor>
+    decltype(auto) visit(Visitor&& visitor) const {
+        return std::visit(std::forward<Visitor>(visitor), storage);
+    }
+
+    /// A copy that shares no embedded object, instance or path either.
+    CIMValue clone() const;
 
     /// The value as text, empty for null. Booleans are TRUE or FALSE; reals have the form of
     /// "%.16e" in any locale; a char16 outside 1 to 127 is \x and four hexadecimal digits;

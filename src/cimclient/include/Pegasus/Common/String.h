@@ -7,14 +7,13 @@
 #include <Pegasus/Common/CString.h>
 #include <Pegasus/Common/Char16.h>
 #include <Pegasus/Common/Config.h>
+#include <Pegasus/Common/StringBody.h>
 
 #include <iosfwd>
 #include <string>
 #include <utility>
 
 namespace Pegasus {
-
-struct StringBody;
 
 /// Lengths and positions are counted in 16-bit characters. A string too long for a Uint32 length
 /// raises std::bad_alloc.
@@ -23,7 +22,10 @@ class String {
     static const String EMPTY;
 
     String() noexcept = default;
-    String(const String& other) noexcept;
+    String(const String& other) noexcept : body(other.body) {
+        if (body)
+            body->retain();
+    }
     String(String&& other) noexcept : body(std::exchange(other.body, nullptr)) {}
     /// The first `n` characters of `other`, or all of them when it has fewer.
     String(const String& other, Uint32 n);
@@ -35,9 +37,12 @@ class String {
     String(const char* utf8);
     /// `n` bytes of UTF-8, NULs included. Raises Exception for bytes that are not UTF-8.
     String(const char* utf8, Uint32 n);
-    ~String();
+    ~String() {
+        if (body)
+            body->release();
+    }
 
-    String& operator=(const String& other) noexcept;
+    String& operator=(const String& other) noexcept { return *this = String(other); }
     String& operator=(String&& other) noexcept {
         std::swap(body, other.body);
         return *this;
@@ -48,13 +53,13 @@ class String {
     String& assign(const char* utf8);
     String& assign(const char* utf8, Uint32 n);
 
-    void clear() noexcept;
+    void clear() noexcept { *this = String(); }
     /// Makes room for `capacity` characters, so that appending up to there allocates no more.
     void reserveCapacity(Uint32 capacity);
 
-    Uint32 size() const noexcept;
+    Uint32 size() const noexcept { return body ? body->size() : 0; }
     /// NUL-terminated; valid until this string is changed, assigned or destroyed.
-    const Char16* getChar16Data() const noexcept;
+    const Char16* getChar16Data() const noexcept { return body ? body->text() : &kNul; }
     /// UTF-8; a surrogate without its partner becomes U+FFFD.
     CString getCString() const;
 
@@ -96,7 +101,10 @@ class String {
     static Boolean equalNoCase(const String& a, const String& b);
 
   private:
-    void unshare(Uint32 capacity);
+    void makeRoom(Uint32 capacity);
+    void setUtf8(const char* bytes, Uint32 n);
+
+    static const Char16 kNul;
     StringBody* body = nullptr;
 };
 

@@ -1,0 +1,28 @@
+// What the copies of a CIMProperty share.
+#pragma once
+
+#include <Pegasus/Common/CIMName.h>
+#include <Pegasus/Common/CIMQualifier.h>
+#include <Pegasus/Common/CIMValue.h>
+#include <Pegasus/Common/SharedBody.h>
+
+#include <utility>
+
+#include "NamedList.h"
+
+namespace Pegasus {
+
+class PropertyBody : public SharedBody {
+  public:
+    PropertyBody(CIMName name, CIMValue value) : name(std::move(name)), value(std::move(value)) {}
+
+    CIMName name;
+    CIMValue value;
+    Uint32 arraySize = 0;
+    Boolean propagated = false;
+    CIMName referenceClass;
+    CIMName classOrigin;
+    NamedList<CIMQualifier> qualifiers;
+};
+
+}  // namespace Pegasus

@@ -1,0 +1,78 @@
+#include "ValueText.h"
+
+#include <array>
+#include <charconv>
+
+#include "EmbeddedXml.h"
+
+namespace Pegasus {
+
+namespace {
+
+/// Room for any integer and any real of 17 digits.
+using NumberText = std::array<char, 32>;
+
+void appendAscii(String& out, const char* begin, const char* end) {
+    out.append(String(begin, static_cast<Uint32>(end - begin)));
+}
+
+template <class Integer>
+void appendInteger(String& out, Integer value) {
+    NumberText text;
+    appendAscii(out, text.data(), std::to_chars(text.begin(), text.end(), value).ptr);
+}
+
+}  // namespace
+
+void appendValueText(String& out, Boolean value) {
+    out.append(value ? "TRUE" : "FALSE");
+}
+
+void appendValueText(String& out, Uint64 value) {
+    appendInteger(out, value);
+}
+
+void appendValueText(String& out, Sint64 value) {
+    appendInteger(out, value);
+}
+
+void appendValueText(String& out, Real64 value) {
+    NumberText text;
+    const auto [end, error] =
+        std::to_chars(text.begin(), text.end(), value, std::chars_format::scientific, 16);
+    static_cast<void>(error);
+    appendAscii(out, text.data(), end);
+}
+
+void appendValueText(String& out, Char16 value) {
+    if (value >= 1 && value <= 127) {
+        out.append(value);
+        return;
+    }
+    static constexpr char kDigits[] = "0123456789ABCDEF";
+    out.append('\\').append('x');
+    for (int shift = 12; shift >= 0; shift -= 4)
+        out.append(static_cast<Uint16>(kDigits[value >> shift & 0xF]));
+}
+
+void appendValueText(String& out, const String& value) {
+    out.append(value);
+}
+
+void appendValueText(String& out, const CIMDateTime& value) {
+    out.append(value.toString());
+}
+
+void appendValueText(String& out, const CIMObjectPath& value) {
+    out.append(value.toString());
+}
+
+void appendValueText(String& out, const CIMObject& value) {
+    EmbeddedXml(out).append(value);
+}
+
+void appendValueText(String& out, const CIMInstance& value) {
+    EmbeddedXml(out).append(value);
+}
+
+}  // namespace Pegasus
