@@ -59,6 +59,12 @@ void endReturnValue(std::string& xml);
 /// ERROR with the status code as defined in DSP0200.
 void appendError(std::string& xml, Uint32 code, const String& description);
 
+/// LOCALNAMESPACEPATH: one NAMESPACE for each part of the name.
+void appendLocalNamespacePath(std::string& xml, const CIMNamespaceName& nameSpace);
+
+/// CLASSNAME.
+void appendClassName(std::string& xml, const CIMName& className);
+
 /// CLASS with its qualifiers and properties. The class must be initialized.
 void appendClass(std::string& xml, const CIMConstClass& cimClass,
                  const ObjectXmlOptions& options = ObjectXmlOptions());
@@ -67,11 +73,12 @@ void appendClass(std::string& xml, const CIMConstClass& cimClass,
 void appendInstance(std::string& xml, const CIMConstInstance& instance,
                     const ObjectXmlOptions& options = ObjectXmlOptions());
 
-/// CLASSNAME.
-void appendClassName(std::string& xml, const CIMName& className);
-
 /// INSTANCENAME with class name and key bindings; host and namespace of the path are not written.
 void appendInstanceName(std::string& xml, const CIMObjectPath& path);
+
+/// VALUE.REFERENCE holding the shortest element that carries the path: with host, with namespace
+/// only, or with neither; of a class when the path has no keys.
+void appendReference(std::string& xml, const CIMObjectPath& path);
 
 /// VALUE.NAMEDINSTANCE: the instance under its path, which must be set.
 void appendNamedInstance(std::string& xml, const CIMConstInstance& instance,
@@ -80,8 +87,5 @@ void appendNamedInstance(std::string& xml, const CIMConstInstance& instance,
 /// The value element of a property or qualifier: VALUE, VALUE.ARRAY, VALUE.REFERENCE or
 /// VALUE.REFARRAY; nothing at all for a null value.
 void appendValue(std::string& xml, const CIMValue& value);
-
-/// `text` escaped as character data or attribute value, without white space trimmed.
-void appendEscaped(std::string& xml, const String& text);
 
 }  // namespace Pegasus

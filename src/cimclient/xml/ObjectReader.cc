@@ -52,64 +52,70 @@ CIMClass ObjectReader::readClass() {
 template <typename Owner>
 bool ObjectReader::readMember(Owner& owner) {
     if (reader.is("PROPERTY")) {
-        add(owner, readProperty(), "property");
+        add(owner, readProperty());
     } else if (reader.is("PROPERTY.ARRAY")) {
-        add(owner, readPropertyArray(), "property");
+        add(owner, readPropertyArray());
     } else if (reader.is("PROPERTY.REFERENCE")) {
-        add(owner, readPropertyReference(), "property");
+        add(owner, readPropertyReference());
+    } else if (reader.is("PROPERTY.REFARRAY")) {
+        add(owner, readPropertyReferenceArray());
     } else if (reader.is("QUALIFIER")) {
-        add(owner, readQualifier(), "qualifier");
+        add(owner, readQualifier());
     } else {
         return false;
     }
     return true;
 }
 
-template <typename Owner, typename Member>
-void ObjectReader::add(Owner& owner, Member member, const char* kind) const {
+template <typename Owner>
+void ObjectReader::add(Owner& owner, const CIMProperty& property) const {
     try {
-        if constexpr (std::is_same_v<Member, CIMProperty>) {
-            owner.addProperty(std::move(member));
-        } else {
-            owner.addQualifier(std::move(member));
-        }
+        owner.addProperty(property);
     } catch (const AlreadyExistsException&) {
-        reader.fail(
-            std::string(kind) + " " +
-            quotedForMessage(static_cast<const char*>(member.getName().getString().getCString())) +
-            " is given twice");
+        failTwice("property", property.getName());
     }
+}
+
+template <typename Owner>
+void ObjectReader::add(Owner& owner, const CIMQualifier& qualifier) const {
+    try {
+        owner.addQualifier(qualifier);
+    } catch (const AlreadyExistsException&) {
+        failTwice("qualifier", qualifier.getName());
+    }
+}
+
+void ObjectReader::failTwice(const char* kind, const CIMName& name) const {
+    const CString utf8 = name.getString().getCString();
+    reader.fail(std::string(kind) + " " + quotedForMessage(static_cast<const char*>(utf8)) +
+                " is given twice");
 }
 
 CIMProperty ObjectReader::readProperty() {
     context.propertyName = context.requiredName(reader, "NAME");
-    const CIMType type = values.readType();
-    if (type == CIMTYPE_REFERENCE) {
-        reader.fail("a PROPERTY is of type reference; expected PROPERTY.REFERENCE");
-    }
-    return readPropertyBody(CIMValue(type, false), "VALUE");
+    return readPropertyBody(CIMValue(values.readType(), false), "VALUE");
 }
 
 CIMProperty ObjectReader::readPropertyArray() {
     context.propertyName = context.requiredName(reader, "NAME");
-    const CIMType type = values.readType();
-    const Uint32 arraySize = readArraySize();
-    return readPropertyBody(CIMValue(type, true, arraySize),
-                            type == CIMTYPE_REFERENCE ? "VALUE.REFARRAY" : "VALUE.ARRAY",
-                            arraySize);
+    return readPropertyBody(CIMValue(values.readType(), true, readArraySize()), "VALUE.ARRAY");
 }
 
 CIMProperty ObjectReader::readPropertyReference() {
     context.propertyName = context.requiredName(reader, "NAME");
-    const CIMName referenceClass = context.optionalName(reader, "REFERENCECLASS");
-    return readPropertyBody(CIMValue(CIMTYPE_REFERENCE, false), "VALUE.REFERENCE", 0,
-                            referenceClass);
+    return readPropertyBody(CIMValue(CIMTYPE_REFERENCE, false), "VALUE.REFERENCE");
+}
+
+CIMProperty ObjectReader::readPropertyReferenceArray() {
+    context.propertyName = context.requiredName(reader, "NAME");
+    return readPropertyBody(CIMValue(CIMTYPE_REFERENCE, true, readArraySize()), "VALUE.REFARRAY");
 }
 
 // The rest of any kind of property. `value` is the null of its type, and stays so without an
 // element that gives one.
-CIMProperty ObjectReader::readPropertyBody(CIMValue value, std::string_view valueElement,
-                                           Uint32 arraySize, const CIMName& referenceClass) {
+CIMProperty ObjectReader::readPropertyBody(CIMValue value, std::string_view valueElement) {
+    const Uint32 arraySize = value.isArray() ? readArraySize() : 0;
+    const CIMName referenceClass = context.optionalName(reader, "REFERENCECLASS");
     const CIMName classOrigin = context.optionalName(reader, "CLASSORIGIN");
     const Boolean propagated = reader.booleanAttribute("PROPAGATED", false);
     Array<CIMQualifier> qualifiers;
@@ -126,7 +132,7 @@ CIMProperty ObjectReader::readPropertyBody(CIMValue value, std::string_view valu
     CIMProperty property(context.propertyName, std::move(value), arraySize, referenceClass,
                          classOrigin, propagated);
     for (const CIMQualifier& qualifier : qualifiers) {
-        add(property, qualifier, "qualifier");
+        add(property, qualifier);
     }
     context.propertyName.clear();
     return property;
@@ -146,9 +152,6 @@ Uint32 ObjectReader::readArraySize() const {
 CIMQualifier ObjectReader::readQualifier() {
     const CIMName name = context.requiredName(reader, "NAME");
     const CIMType type = values.readType();
-    if (type == CIMTYPE_REFERENCE) {
-        reader.fail("a qualifier is of type reference; expected another type");
-    }
     CIMFlavor flavor;
     flavor.set(CIMFlavor::OVERRIDABLE, reader.booleanAttribute("OVERRIDABLE", true));
     flavor.set(CIMFlavor::TOSUBCLASS, reader.booleanAttribute("TOSUBCLASS", true));

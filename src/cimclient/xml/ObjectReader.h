@@ -35,14 +35,17 @@ class ObjectReader {
   private:
     template <typename Owner>
     bool readMember(Owner& owner);
-    template <typename Owner, typename Member>
-    void add(Owner& owner, Member member, const char* kind) const;
+    template <typename Owner>
+    void add(Owner& owner, const CIMProperty& property) const;
+    template <typename Owner>
+    void add(Owner& owner, const CIMQualifier& qualifier) const;
+    [[noreturn]] void failTwice(const char* kind, const CIMName& name) const;
 
     CIMProperty readProperty();
     CIMProperty readPropertyArray();
     CIMProperty readPropertyReference();
-    CIMProperty readPropertyBody(CIMValue value, std::string_view valueElement,
-                                 Uint32 arraySize = 0, const CIMName& referenceClass = CIMName());
+    CIMProperty readPropertyReferenceArray();
+    CIMProperty readPropertyBody(CIMValue value, std::string_view valueElement);
     Uint32 readArraySize() const;
     CIMQualifier readQualifier();
     void skipMethod();

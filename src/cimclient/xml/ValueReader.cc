@@ -73,7 +73,7 @@ auto dispatch(CIMType type, Action action) {
 std::optional<CIMType> parseTypeName(std::string_view name) {
     using Entry = std::pair<std::string_view, CIMType>;
     // The most frequent ones first.
-    constexpr std::array<Entry, 15> kTypes{{{"string", CIMTYPE_STRING},
+    constexpr std::array<Entry, 14> kTypes{{{"string", CIMTYPE_STRING},
                                             {"uint16", CIMTYPE_UINT16},
                                             {"uint32", CIMTYPE_UINT32},
                                             {"boolean", CIMTYPE_BOOLEAN},
@@ -86,8 +86,7 @@ std::optional<CIMType> parseTypeName(std::string_view name) {
                                             {"sint64", CIMTYPE_SINT64},
                                             {"real32", CIMTYPE_REAL32},
                                             {"real64", CIMTYPE_REAL64},
-                                            {"char16", CIMTYPE_CHAR16},
-                                            {"reference", CIMTYPE_REFERENCE}}};
+                                            {"char16", CIMTYPE_CHAR16}}};
     for (const Entry& entry : kTypes) {
         if (entry.first == name) {
             return entry.second;

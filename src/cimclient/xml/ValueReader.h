@@ -43,7 +43,8 @@ class ValueReader {
     DecodeContext& context;
 };
 
-/// The type of a name like "uint16"; nothing for any other text. Case matters.
+/// The type of a name like "uint16"; nothing for any other text, "reference" included, for elements
+/// with a TYPE hold none. Case matters.
 std::optional<CIMType> parseTypeName(std::string_view name);
 
 }  // namespace Pegasus

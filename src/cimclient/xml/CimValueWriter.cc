@@ -1,0 +1,99 @@
+// The value elements of DSP0201.
+
+#include <Pegasus/Common/Array.h>
+#include <Pegasus/Common/CIMDateTime.h>
+#include <Pegasus/Common/CIMInstance.h>
+#include <Pegasus/Common/CIMObject.h>
+
+#include <array>
+#include <charconv>
+#include <cmath>
+#include <limits>
+#include <type_traits>
+#include <variant>
+
+#include "xml/CimXmlWriter.h"
+#include "xml/XmlText.h"
+
+namespace Pegasus {
+
+namespace {
+
+void appendText(std::string& xml, Boolean value) {
+    xml += value ? "TRUE" : "FALSE";
+}
+
+void appendText(std::string& xml, const String& value) {
+    appendEscaped(xml, value);
+}
+
+void appendText(std::string& xml, Char16 value) {
+    appendEscaped(xml, String(&value, 1));
+}
+
+void appendText(std::string& xml, const CIMDateTime& value) {
+    appendEscaped(xml, value.toString());
+}
+
+// An embedded object is its own element, escaped once more; the model writes that element.
+void appendText(std::string& xml, const CIMObject& value) {
+    appendEscaped(xml, CIMValue(value).toString());
+}
+
+void appendText(std::string& xml, const CIMInstance& value) {
+    appendEscaped(xml, CIMValue(value).toString());
+}
+
+template <typename T>
+std::enable_if_t<std::is_integral_v<T>> appendText(std::string& xml, T value) {
+    xml += std::to_string(value);
+}
+
+// One digit before the point and so many behind it that the reader gets every bit back.
+template <typename T>
+std::enable_if_t<std::is_floating_point_v<T>> appendText(std::string& xml, T value) {
+    if (std::isnan(value)) {
+        xml += "NaN";
+    } else if (std::isinf(value)) {
+        xml += value < 0 ? "-INF" : "INF";
+    } else {
+        std::array<char, 32> text{};
+        const std::to_chars_result result =
+            std::to_chars(text.data(), text.data() + text.size(), value,
+                          std::chars_format::scientific, std::numeric_limits<T>::max_digits10 - 1);
+        xml.append(text.data(), result.ptr);
+    }
+}
+
+struct ValueElement {
+    std::string& xml;
+
+    void operator()(std::monostate) const {}
+
+    template <typename T>
+    void operator()(const T& value) const {
+        xml += "<VALUE>";
+        appendText(xml, value);
+        xml += "</VALUE>";
+    }
+
+    void operator()(const CIMObjectPath& value) const { appendReference(xml, value); }
+
+    template <typename T>
+    void operator()(const Array<T>& values) const {
+        const bool isReference = std::is_same_v<T, CIMObjectPath>;
+        xml += isReference ? "<VALUE.REFARRAY>" : "<VALUE.ARRAY>";
+        for (const T& value : values) {
+            (*this)(value);
+        }
+        xml += isReference ? "</VALUE.REFARRAY>" : "</VALUE.ARRAY>";
+    }
+};
+
+}  // namespace
+
+void appendValue(std::string& xml, const CIMValue& value) {
+    value.visit(ValueElement{xml});
+}
+
+}  // namespace Pegasus
