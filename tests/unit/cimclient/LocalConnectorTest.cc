@@ -1,0 +1,260 @@
+#include "client/LocalConnector.h"
+
+#include <Pegasus/Common/Exception.h>
+#include <gtest/gtest.h>
+#include <sys/socket.h>
+#include <sys/un.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <array>
+#include <csignal>
+#include <cstring>
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include "TestConnections.h"
+#include "client/UnixSocket.h"
+#include "support/FakeCimServer.h"
+#include "support/Files.h"
+#include "support/ScopedEnvironment.h"
+#include "support/TempDirectory.h"
+
+namespace Pegasus {
+namespace {
+
+using support::FakeCimServer;
+using support::ScopedEnvironment;
+using testing_client::messageOf;
+using testing_client::Stopwatch;
+
+constexpr uid_t kStranger = 12345;
+
+FileDescriptor listenAt(const std::string& path, int backlog) {
+    sockaddr_un address{};
+    address.sun_family = AF_UNIX;
+    std::strncpy(address.sun_path, path.c_str(), sizeof(address.sun_path) - 1);
+    FileDescriptor listener(socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0));
+    EXPECT_EQ(bind(listener.get(), reinterpret_cast<sockaddr*>(&address), sizeof(address)), 0);
+    EXPECT_EQ(listen(listener.get(), backlog), 0);
+    return listener;
+}
+
+// A socket file that nobody listens at.
+void leaveStaleSocket(const std::string& path) {
+    listenAt(path, 1);
+}
+
+// A process of another user that listens at a path, as long as the object lives.
+class StrangersServer {
+  public:
+    explicit StrangersServer(const std::string& path) {
+        std::array<int, 2> ready{};
+        EXPECT_EQ(pipe(ready.data()), 0);
+        child = fork();
+        if (child == 0) {
+            if (setuid(kStranger) != 0) {
+                _exit(1);
+            }
+            const FileDescriptor listener = listenAt(path, 1);
+            const bool told = write(ready[1], "r", 1) == 1;
+            while (told) {
+                pause();
+            }
+            _exit(1);
+        }
+        close(ready[1]);
+        char octet = 0;
+        EXPECT_EQ(read(ready[0], &octet, 1), 1);
+        close(ready[0]);
+    }
+    ~StrangersServer() {
+        kill(child, SIGKILL);
+        waitpid(child, nullptr, 0);
+    }
+    StrangersServer(const StrangersServer&) = delete;
+    StrangersServer& operator=(const StrangersServer&) = delete;
+
+  private:
+    pid_t child = -1;
+};
+
+class LocalConnectorTest : public testing::Test {
+  protected:
+    ServerConnection connect(Uint32 milliseconds = 5000) const {
+        return connectToLocalServer(places, Deadline(milliseconds));
+    }
+
+    ScopedEnvironment noSocket{"CIM_LOCAL_SOCKET"};
+    ScopedEnvironment noCommand{"CIM_COMMAND"};
+    ScopedEnvironment noChild{"CIM_EMBEDDED", "never"};
+    support::TempDirectory directory;
+    ServerPlaces places;
+};
+
+TEST_F(LocalConnectorTest, TakesTheSocketThatTheEnvironmentNames) {
+    FakeCimServer known;
+    FakeCimServer named;
+    places.sockets = {known.socketPath()};
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", named.socketPath());
+    const ServerConnection connection = connect();
+    EXPECT_TRUE(connection.socket.isOpen());
+    EXPECT_EQ(connection.child, nullptr);
+    EXPECT_EQ(connection.serverUser, geteuid());
+    EXPECT_EQ(known.connectionCount(), 0U);
+}
+
+TEST_F(LocalConnectorTest, TheNamedSocketIsTheOnlyOne) {
+    FakeCimServer known;
+    places.sockets = {known.socketPath()};
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.file("none"));
+    const ScopedEnvironment childAllowed("CIM_EMBEDDED");
+    const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
+    const std::string message = messageOf<CannotConnectException>([&] { connect(); });
+    EXPECT_EQ(message, "Cannot connect to CIM server: " + directory.file("none") +
+                           ": No such file or directory");
+    EXPECT_EQ(known.connectionCount(), 0U);
+}
+
+TEST_F(LocalConnectorTest, AnEmptyNameIsNoName) {
+    FakeCimServer known;
+    places.sockets = {known.socketPath()};
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", "");
+    EXPECT_TRUE(connect().socket.isOpen());
+}
+
+TEST_F(LocalConnectorTest, TheNamedSocketMayBeALinkOrHaveALongPath) {
+    FakeCimServer server;
+    const std::string deep = directory.file(std::string(200, 'd'));
+    std::filesystem::create_directory(deep);
+    std::filesystem::create_symlink(server.socketPath(), deep + "/link");
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", deep + "/link");
+    EXPECT_TRUE(connect().socket.isOpen());
+}
+
+TEST_F(LocalConnectorTest, ANamedFileThatIsNoSocketIsRefused) {
+    support::writeFile(directory.file("f"), "");
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.file("f"));
+    EXPECT_THROW(connect(), CannotConnectException);
+}
+
+TEST_F(LocalConnectorTest, TakesTheFirstKnownSocketThatAnswers) {
+    FakeCimServer first;
+    FakeCimServer second;
+    leaveStaleSocket(directory.file("stale"));
+    places.sockets = {directory.file("missing"), directory.file("stale"), first.socketPath(),
+                      second.socketPath()};
+    EXPECT_TRUE(connect().socket.isOpen());
+    EXPECT_EQ(second.connectionCount(), 0U);
+}
+
+TEST_F(LocalConnectorTest, AKnownSocketThatIsALinkDoesNotCount) {
+    FakeCimServer server;
+    std::filesystem::create_symlink(server.socketPath(), directory.file("link"));
+    places.sockets = {directory.file("link")};
+    EXPECT_THROW(connect(), CannotConnectException);
+    EXPECT_EQ(server.connectionCount(), 0U);
+}
+
+TEST_F(LocalConnectorTest, AStaleSocketMeansThatAServerIsInstalled) {
+    leaveStaleSocket(directory.file("stale"));
+    places.sockets = {directory.file("stale")};
+    const ScopedEnvironment childAllowed("CIM_EMBEDDED");
+    const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
+    EXPECT_EQ(messageOf<CannotConnectException>([&] { connect(); }),
+              "Cannot connect to CIM server: " + directory.file("stale") + ": Connection refused");
+}
+
+TEST_F(LocalConnectorTest, AnInstalledProgramForbidsTheChild) {
+    places.programs = {directory.file("missing"), "/bin/sh"};
+    const ScopedEnvironment childAllowed("CIM_EMBEDDED");
+    const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
+    EXPECT_EQ(messageOf<CannotConnectException>([&] { connect(); }),
+              "Cannot connect to CIM server: /bin/sh is installed but listens nowhere");
+}
+
+TEST_F(LocalConnectorTest, StartsAChildWhenNothingIsInstalled) {
+    places.sockets = {directory.file("missing")};
+    places.programs = {directory.file("missing")};
+    places.embeddedPrograms = {directory.file("missing"), FAKE_CIMOMD};
+    const ScopedEnvironment childAllowed("CIM_EMBEDDED");
+    const ServerConnection connection = connect();
+    EXPECT_TRUE(connection.socket.isOpen());
+    EXPECT_NE(connection.child, nullptr);
+    EXPECT_EQ(connection.serverUser, geteuid());
+}
+
+TEST_F(LocalConnectorTest, TheEnvironmentNamesTheProgramToStart) {
+    places.embeddedPrograms = {directory.file("missing")};
+    const ScopedEnvironment childAllowed("CIM_EMBEDDED");
+    const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
+    EXPECT_NE(connect().child, nullptr);
+}
+
+TEST_F(LocalConnectorTest, TheChildCanBeForbidden) {
+    const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
+    EXPECT_EQ(messageOf<CannotConnectException>([&] { connect(); }),
+              "No CIM server on this machine, and CIM_EMBEDDED is never");
+}
+
+TEST_F(LocalConnectorTest, SaysWhenThereIsNoProgramToStart) {
+    places.embeddedPrograms = {directory.file("missing")};
+    const ScopedEnvironment childAllowed("CIM_EMBEDDED");
+    EXPECT_EQ(messageOf<CannotConnectException>([&] { connect(); }),
+              "No CIM server on this machine, and no cimomd to start");
+}
+
+TEST_F(LocalConnectorTest, AServerOfAnotherUserIsNotTrusted) {
+    if (geteuid() != 0) {
+        GTEST_SKIP() << "only root can be another user";
+    }
+    std::filesystem::permissions(directory.path(), std::filesystem::perms::all);
+    const StrangersServer stranger(directory.file("s"));
+    {
+        const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.file("s"));
+        EXPECT_EQ(messageOf<CannotConnectException>([&] { connect(); }),
+                  "Cannot connect to CIM server: " + directory.file("s") +
+                      ": its server runs neither as root nor as this user");
+    }
+    // Even a socket file that was given to root does not make its listener root.
+    ASSERT_EQ(chown(directory.file("s").c_str(), 0, 0), 0);
+    FakeCimServer server;
+    places.sockets = {directory.file("s"), server.socketPath()};
+    EXPECT_TRUE(connect().socket.isOpen());
+}
+
+TEST_F(LocalConnectorTest, AStrangersSocketKeepsNobodyFromTheChild) {
+    if (geteuid() != 0) {
+        GTEST_SKIP() << "only root can be another user";
+    }
+    leaveStaleSocket(directory.file("s"));
+    ASSERT_EQ(chown(directory.file("s").c_str(), kStranger, kStranger), 0);
+    places.sockets = {directory.file("s")};
+    const ScopedEnvironment childAllowed("CIM_EMBEDDED");
+    const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
+    EXPECT_NE(connect().child, nullptr);
+}
+
+TEST_F(LocalConnectorTest, AServerThatTakesNoConnectionIsGivenUpAtTheDeadline) {
+    const FileDescriptor listener = listenAt(directory.file("busy"), 0);
+    std::vector<FileDescriptor> waiting;
+    for (;;) {
+        ConnectResult result =
+            connectUnixSocket(directory.file("busy"), FinalLink::Refuse, Deadline(0));
+        if (result.error != 0) {
+            EXPECT_EQ(result.error, ETIMEDOUT);
+            break;
+        }
+        waiting.push_back(std::move(result.socket));
+        ASSERT_LT(waiting.size(), 100U);
+    }
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.file("busy"));
+    const Stopwatch watch;
+    EXPECT_THROW(connect(150), ConnectionTimeoutException);
+    EXPECT_GE(watch.milliseconds(), 150);
+    EXPECT_LT(watch.milliseconds(), 2000);
+}
+
+}  // namespace
+}  // namespace Pegasus
