@@ -33,15 +33,6 @@ std::size_t skipTo(const OctetTable& stops, const char* data, std::size_t from) 
     return from;
 }
 
-// A value of 16 or more for what is no digit.
-std::uint32_t digitValue(char c) {
-    if (c >= '0' && c <= '9') {
-        return static_cast<std::uint32_t>(c - '0');
-    }
-    const char lower = static_cast<char>(c | 0x20);
-    return lower >= 'a' && lower <= 'f' ? static_cast<std::uint32_t>(lower - 'a') + 10 : 16;
-}
-
 char* skipSpace(char* p, const char* end) {
     while (p != end && isXmlSpace(*p)) {
         ++p;
@@ -166,7 +157,7 @@ XmlTokenizer::Token XmlTokenizer::readText() {
         fail(XmlError::Kind::Limit, offset(), "a text is too long");
     }
     if (!isPlain) {
-        const char* decodedEnd = decode(at(textBegin), at(textEnd), false);
+        const char* decodedEnd = decode(at(textBegin), at(textEnd), XmlTextKind::Content);
         textEnd = static_cast<std::size_t>(decodedEnd - window.data());
     }
     return Token::Text;
@@ -229,16 +220,8 @@ XmlTokenizer::Token XmlTokenizer::readCData() {
     textEnd = pos - kClosing.size();
     char* const begin = at(textBegin);
     if (std::memchr(begin, '\r', textEnd - textBegin) != nullptr) {
-        char* out = begin;
-        for (const char* p = begin; p != at(textEnd); ++p) {
-            if (*p == '\r') {
-                *out++ = '\n';
-                p += p[1] == '\n' ? 1 : 0;
-            } else {
-                *out++ = *p;
-            }
-        }
-        textEnd = static_cast<std::size_t>(out - window.data());
+        const char* decodedEnd = decode(begin, at(textEnd), XmlTextKind::CData);
+        textEnd = static_cast<std::size_t>(decodedEnd - window.data());
     }
     return Token::CData;
 }
@@ -402,7 +385,7 @@ char* XmlTokenizer::parseAttribute(char* p, const char* end) {
     if (p == end) {
         failAt(p, "attribute " + quotedForMessage(attribute.name) + " does not end");
     }
-    const char* valueEnd = isPlain ? p : decode(valueBegin, p, true);
+    const char* valueEnd = isPlain ? p : decode(valueBegin, p, XmlTextKind::Attribute);
     attribute.value = {valueBegin, static_cast<std::size_t>(valueEnd - valueBegin)};
     currentAttributes.push_back(attribute);
     return p + 1;
@@ -421,69 +404,12 @@ void XmlTokenizer::checkNewAttribute(std::string_view name) const {
     }
 }
 
-// Replaces references and normalises line ends in place; in attribute values line ends and tabs
-// become blanks (XML 1.0, 2.11 and 3.3.3). Returns the new end.
-char* XmlTokenizer::decode(char* begin, const char* end, bool isAttribute) {
-    char* out = begin;
-    const char* p = begin;
-    while (p != end) {
-        if (*p == '&') {
-            p = decodeReference(p, end, out);
-            continue;
-        }
-        char c = *p++;
-        if (c == '\r') {
-            c = '\n';
-            p += p != end && *p == '\n' ? 1 : 0;
-        }
-        *out++ = isAttribute && isXmlSpace(c) ? ' ' : c;
+char* XmlTokenizer::decode(char* begin, const char* end, XmlTextKind kind) const {
+    try {
+        return decodeXmlText(begin, end, kind);
+    } catch (const XmlTextFault& fault) {
+        failAt(fault.place, fault.message);
     }
-    return out;
-}
-
-// Takes the reference at `p`, writes what it stands for and returns where it ends.
-const char* XmlTokenizer::decodeReference(const char* p, const char* end, char*& out) {
-    const char* const begin = p + 1;
-    const char* const semicolon =
-        static_cast<const char*>(std::memchr(begin, ';', static_cast<std::size_t>(end - begin)));
-    if (semicolon == nullptr) {
-        failAt(p, "\"&\" begins no reference; expected \"&amp;\"");
-    }
-    const std::string_view name(begin, static_cast<std::size_t>(semicolon - begin));
-    if (name.starts_with('#')) {
-        out = putUtf8(out, parseCharacterNumber(begin, semicolon));
-        return semicolon + 1;
-    }
-    using Entity = std::pair<std::string_view, char>;
-    constexpr std::array<Entity, 5> kEntities{
-        {{"lt", '<'}, {"gt", '>'}, {"amp", '&'}, {"quot", '"'}, {"apos", '\''}}};
-    for (const Entity& entity : kEntities) {
-        if (entity.first == name) {
-            *out++ = entity.second;
-            return semicolon + 1;
-        }
-    }
-    failAt(p, "entity " + quotedForMessage(name) + " is not defined");
-}
-
-// `begin` is at the "#", `end` at the semicolon.
-std::uint32_t XmlTokenizer::parseCharacterNumber(const char* begin, const char* end) const {
-    const bool isHex = begin[1] == 'x';
-    const char* p = begin + (isHex ? 2 : 1);
-    const std::uint32_t radix = isHex ? 16 : 10;
-    bool isValid = p != end;
-    std::uint32_t code = 0;
-    for (; isValid && p != end; ++p) {
-        const std::uint32_t digit = digitValue(*p);
-        isValid = digit < radix && code <= 0x10FFFF;
-        code = code * radix + digit;
-    }
-    if (!isValid || !isReferable(code)) {
-        failAt(begin, "character reference " +
-                          quotedForMessage({begin, static_cast<std::size_t>(end - begin)}) +
-                          " names no character");
-    }
-    return code;
 }
 
 bool XmlTokenizer::more() {

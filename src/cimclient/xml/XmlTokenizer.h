@@ -13,6 +13,7 @@
 
 #include "xml/ByteSource.h"
 #include "xml/XmlError.h"
+#include "xml/XmlTextDecoder.h"
 #include "xml/XmlWindow.h"
 
 namespace Pegasus {
@@ -88,9 +89,7 @@ class XmlTokenizer {
     char* parseAttribute(char* p, const char* end);
     void checkNewAttribute(std::string_view name) const;
 
-    char* decode(char* begin, const char* end, bool isAttribute);
-    const char* decodeReference(const char* p, const char* end, char*& out);
-    std::uint32_t parseCharacterNumber(const char* begin, const char* end) const;
+    char* decode(char* begin, const char* end, XmlTextKind kind) const;
 
     bool more();
     bool available(std::size_t count);
