@@ -101,6 +101,11 @@ TEST(TextFileRead, ALineOfManyMegabytesIsCut) {
     EXPECT_THAT(linesOf(line + "\nb\n", 3), ElementsAre("xxx", "b"));
 }
 
+TEST(TextFileRead, ALimitLargerThanTheInnerBufferIsKept) {
+    const std::string line(200000, 'x');
+    EXPECT_THAT(linesOf(line + "\nb\n", 70000), ElementsAre(line.substr(0, 70000), "b"));
+}
+
 TEST(TextFileRead, BadArgumentsGiveAnErrorAndTakeNoLine) {
     const TempDirectory directory;
     TextFile file(directory.write("x", "abc\n").c_str());

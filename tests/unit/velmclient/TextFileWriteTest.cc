@@ -39,6 +39,7 @@ std::vector<std::string> visibleNames(const TempDirectory& directory) {
 
 TEST(TextFileWrite, BytesAreWrittenAsGiven) {
     const TempDirectory directory;
+    takeSyslog();
     TextFile file(directory.path("a.mif").c_str());
     ASSERT_EQ(file.open(1), 0);
     EXPECT_EQ(writeText(file, "Start Component\r\n"), 17);
@@ -47,6 +48,7 @@ TEST(TextFileWrite, BytesAreWrittenAsGiven) {
     EXPECT_EQ(writeText(file, "\n"), 1);
     EXPECT_EQ(file.close(), 0);
     EXPECT_EQ(directory.read("a.mif"), std::string("Start Component\r\na\0b\n", 21));
+    EXPECT_THAT(takeSyslog(), IsEmpty());
     EXPECT_THAT(directory.names(), ElementsAre("a.mif"));
 }
 
@@ -123,6 +125,20 @@ TEST(TextFileWrite, OpeningAgainDropsWhatWasWritten) {
     EXPECT_EQ(file.close(), 0);
     EXPECT_EQ(directory.read("a"), "second");
     EXPECT_THAT(directory.names(), ElementsAre("a"));
+}
+
+TEST(TextFileWrite, OpeningOtherwiseDropsWhatWasWritten) {
+    const TempDirectory directory;
+    directory.write("a", "old\n");
+    TextFile file(directory.path("a").c_str());
+    for (const int mode : {0, 2}) {
+        ASSERT_EQ(file.open(1), 0);
+        writeText(file, "new");
+        file.open(mode);
+        EXPECT_EQ(writeText(file, "more"), -1);
+        EXPECT_EQ(file.close(), 0);
+        EXPECT_EQ(directory.read("a"), "old\n");
+    }
 }
 
 TEST(TextFileWrite, AnOpenFileKeepsItsPath) {
@@ -204,6 +220,21 @@ TEST(TextFileWrite, ALinkIsReplacedAndItsTargetUntouched) {
     struct stat status {};
     ASSERT_EQ(::lstat(directory.path("link").c_str(), &status), 0);
     EXPECT_TRUE(S_ISREG(status.st_mode));
+}
+
+TEST(TextFileWrite, ALinkIsReplacedWhateverItPointsAt) {
+    const TempDirectory directory;
+    for (const char* target : {"/dev/null", "/", "missing", "link"}) {
+        SCOPED_TRACE(target);
+        ::unlink(directory.path("link").c_str());
+        ASSERT_EQ(::symlink(target, directory.path("link").c_str()), 0);
+        TextFile file(directory.path("link").c_str());
+        ASSERT_EQ(file.open(1), 0);
+        writeText(file, "new");
+        EXPECT_EQ(file.close(), 0);
+        EXPECT_EQ(directory.read("link"), "new");
+        EXPECT_THAT(directory.names(), ElementsAre("link"));
+    }
 }
 
 TEST(TextFileWrite, OnlyFilesAreReplaced) {
