@@ -1,0 +1,1 @@
+sennet_add_fuzz_target(inventory-script SOURCES inventory-script.cc LIBS CimScriptParser)
