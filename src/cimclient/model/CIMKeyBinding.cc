@@ -5,8 +5,11 @@
 
 #include <charconv>
 #include <optional>
+#include <string>
 #include <string_view>
 #include <utility>
+
+#include "Utf8.h"
 
 namespace Pegasus {
 
@@ -37,7 +40,7 @@ struct Integer {
 
 /// Decimal or 0x hexadecimal with an optional sign.
 std::optional<Integer> parseInteger(const String& text) {
-    const CString utf8 = text.getCString();
+    const std::string utf8 = encodeUtf8(text.getChar16Data(), text.size());
     std::string_view digits(utf8);
     const Boolean negative = digits.starts_with('-');
     if (negative || digits.starts_with('+'))

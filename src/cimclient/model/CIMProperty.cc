@@ -81,10 +81,7 @@ Uint32 CIMConstProperty::getQualifierCount() const {
 }
 
 CIMProperty CIMConstProperty::clone() const {
-    auto copy = std::make_unique<PropertyBody>(access());
-    copy->value = copy->value.clone();
-    copy->qualifiers = copy->qualifiers.clone();
-    return CIMProperty(copy.release());
+    return CIMProperty(new PropertyBody(access()));
 }
 
 void CIMProperty::setValue(CIMValue value) {

@@ -6,32 +6,48 @@
 #include <charconv>
 #include <string>
 #include <string_view>
+#include <utility>
+#include <vector>
+
+#include "Utf8.h"
 
 namespace Pegasus {
 
 namespace {
 
+Boolean isHexadecimal(std::string_view digits) {
+    return !digits.empty() &&
+           digits.find_first_not_of("0123456789abcdefABCDEF") == std::string_view::npos;
+}
+
+Boolean isDecimal(std::string_view text) {
+    constexpr std::string_view kDigits = "0123456789";
+    // Keeps out the second sign and the "inf" and "nan" that from_chars takes.
+    if (text.empty() || (text[0] != '.' && kDigits.find(text[0]) == std::string_view::npos))
+        return false;
+    const char* const end = text.data() + text.size();
+    double number = 0;
+    return std::from_chars(text.data(), end, number).ptr == end;
+}
+
 /// Decimal, 0x hexadecimal or real, with an optional sign.
 Boolean isNumber(const String& text) {
-    const CString utf8 = text.getCString();
+    const std::string utf8 = encodeUtf8(text.getChar16Data(), text.size());
     std::string_view digits(utf8);
     if (digits.starts_with('-') || digits.starts_with('+'))
         digits.remove_prefix(1);
-    const char* const end = digits.data() + digits.size();
-    if (digits.starts_with("0x") || digits.starts_with("0X")) {
-        const std::string_view hexadecimal = digits.substr(2);
-        return !hexadecimal.empty() &&
-               hexadecimal.find_first_not_of("0123456789abcdefABCDEF") == std::string_view::npos;
-    }
-    if (digits.empty() || digits.find_first_not_of("0123456789.eE+-") != std::string_view::npos)
-        return false;
-    double number = 0;
-    return std::from_chars(digits.data(), end, number).ptr == end;
+    if (digits.starts_with("0x") || digits.starts_with("0X"))
+        return isHexadecimal(digits.substr(2));
+    return isDecimal(digits);
 }
 
-Boolean hasKey(const Array<CIMKeyBinding>& keys, const CIMName& name) {
-    return std::any_of(keys.begin(), keys.end(),
-                       [&](const CIMKeyBinding& key) { return key.getName().equal(name); });
+Boolean hasDuplicates(const Array<CIMKeyBinding>& keys) {
+    std::vector<String> names;
+    for (const CIMKeyBinding& key : keys)
+        names.push_back(key.getName().getString());
+    std::sort(names.begin(), names.end(),
+              [](const String& a, const String& b) { return String::compareNoCase(a, b) < 0; });
+    return std::adjacent_find(names.begin(), names.end(), String::equalNoCase) != names.end();
 }
 
 }  // namespace
@@ -82,13 +98,12 @@ void ObjectPathParser::parseNamespace(ObjectPathBody& path) {
 void ObjectPathParser::parseKeys(ObjectPathBody& path) {
     do {
         ++at;
-        CIMKeyBinding key = parseKey();
-        if (hasKey(path.keyBindings, key.getName()))
-            fail("each key once");
-        path.keyBindings.append(std::move(key));
+        path.keyBindings.append(parseKey());
     } while (at < text.size() && text[at] == ',');
     if (at < text.size())
         fail("\",\" or the end");
+    if (hasDuplicates(path.keyBindings))
+        fail("each key once");
 }
 
 CIMKeyBinding ObjectPathParser::parseKey() {

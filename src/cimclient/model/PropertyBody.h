@@ -15,6 +15,16 @@ namespace Pegasus {
 class PropertyBody : public SharedBody {
   public:
     PropertyBody(CIMName name, CIMValue value) : name(std::move(name)), value(std::move(value)) {}
+    /// Copies deeply, unlike the handles' own copies.
+    PropertyBody(const PropertyBody& other)
+        : SharedBody(other),
+          name(other.name),
+          value(other.value.clone()),
+          arraySize(other.arraySize),
+          propagated(other.propagated),
+          referenceClass(other.referenceClass),
+          classOrigin(other.classOrigin),
+          qualifiers(other.qualifiers.clone()) {}
 
     CIMName name;
     CIMValue value;

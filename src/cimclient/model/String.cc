@@ -278,7 +278,7 @@ String operator+(const String& a, const String& b) {
 }
 
 std::ostream& operator<<(std::ostream& out, const String& text) {
-    return out << static_cast<const char*>(text.getCString());
+    return out << encodeUtf8(text.getChar16Data(), text.size());
 }
 
 }  // namespace Pegasus
