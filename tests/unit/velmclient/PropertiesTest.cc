@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <utility>
+
 namespace Velm {
 namespace {
 
@@ -48,6 +50,28 @@ TEST(Properties, ACopyStandsAlone) {
     original.set("other", "x");
     EXPECT_STREQ(copy.getPropertyValue("key"), "old");
     EXPECT_EQ(copy.getPropertyValue("other"), nullptr);
+}
+
+TEST(Properties, ATextOutlivesTheCopyItWasAskedOf) {
+    Properties original;
+    original.set("key", "value");
+    const char* text = nullptr;
+    {
+        const Properties copy(original);
+        text = copy.getPropertyValue("key");
+    }
+    EXPECT_STREQ(text, "value");
+}
+
+TEST(Properties, AMovedFromSetIsEmptyAndCanBeFilled) {
+    Properties source;
+    source.set("key", "value");
+    const Properties target(std::move(source));
+    source = Properties();
+    EXPECT_EQ(source.getPropertyValue("key"), nullptr);
+    source.set("key", "again");
+    EXPECT_STREQ(source.getPropertyValue("key"), "again");
+    EXPECT_STREQ(target.getPropertyValue("key"), "value");
 }
 
 }  // namespace
