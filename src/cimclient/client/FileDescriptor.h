@@ -21,6 +21,8 @@ class FileDescriptor {
     int get() const { return number; }
     bool isOpen() const { return number >= 0; }
     void reset();
+    /// Gives the descriptor up without closing it.
+    int release() { return std::exchange(number, -1); }
 
   private:
     int number = -1;

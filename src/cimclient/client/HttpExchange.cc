@@ -2,10 +2,15 @@
 
 #include <Pegasus/Client/ClientExceptions.h>
 #include <Pegasus/Common/Exception.h>
+#include <fcntl.h>
+#include <sys/socket.h>
+#include <sys/un.h>
+#include <unistd.h>
 
 #include <algorithm>
 #include <cstring>
 
+#include "client/FileDescriptor.h"
 #include "client/WireText.h"
 
 namespace Pegasus {
@@ -31,6 +36,26 @@ void require(bool success) {
 template <typename Value>
 void setOption(CURL* easy, CURLoption option, Value value) {
     require(curl_easy_setopt(easy, option, value) == CURLE_OK);
+}
+
+// A datagram socket that can be connected to its own name, which replaces `address`. -1 on failure.
+int openPlaceholder(curl_sockaddr& address) {
+    FileDescriptor socket(::socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0));
+    sockaddr_un name{};
+    name.sun_family = AF_UNIX;
+    auto* generic = reinterpret_cast<sockaddr*>(&name);
+    // A name of the family alone lets the kernel choose one: a NUL and five digits.
+    socklen_t length = sizeof(name.sun_family);
+    if (::bind(socket.get(), generic, length) != 0) {
+        return -1;
+    }
+    length = sizeof(name);
+    if (::getsockname(socket.get(), generic, &length) != 0 || length > sizeof(address.addr)) {
+        return -1;
+    }
+    std::memcpy(&address.addr, generic, length);
+    address.addrlen = length;
+    return socket.release();
 }
 
 void append(curl_slist*& lines, const char* line) {
@@ -95,7 +120,8 @@ void HttpExchange::setOptions(const HttpRequest& request) {
     setOption(easy, CURLOPT_WRITEDATA, static_cast<void*>(this));
     setOption(easy, CURLOPT_OPENSOCKETFUNCTION, &HttpExchange::onOpen);
     setOption(easy, CURLOPT_OPENSOCKETDATA, static_cast<void*>(this));
-    setOption(easy, CURLOPT_SOCKOPTFUNCTION, &HttpExchange::onOpened);
+    setOption(easy, CURLOPT_PREREQFUNCTION, &HttpExchange::onConnected);
+    setOption(easy, CURLOPT_PREREQDATA, static_cast<void*>(this));
     setOption(easy, CURLOPT_CLOSESOCKETFUNCTION, &HttpExchange::onClose);
     setOption(easy, CURLOPT_CLOSESOCKETDATA, static_cast<void*>(this));
 }
@@ -123,24 +149,29 @@ std::size_t HttpExchange::onBody(char* data, std::size_t size, std::size_t count
     }
 }
 
-// There is one connection: libcurl gets no second one to send a request again on.
-curl_socket_t HttpExchange::onOpen(void* self, curlsocktype /*purpose*/,
-                                   curl_sockaddr* /*address*/) {
+// libcurl connects what it opens itself, and versions 7.88.0 and 7.88.1 do so even when they are
+// told that it is connected. So it gets a placeholder whose connecting succeeds at once, and the
+// connection takes the placeholder's number just before the request is sent.
+// There is no second placeholder: libcurl cannot send a request again.
+curl_socket_t HttpExchange::onOpen(void* self, curlsocktype /*purpose*/, curl_sockaddr* address) {
     auto* exchange = static_cast<HttpExchange*>(self);
-    if (exchange->connectionTaken) {
+    if (exchange->placeholder >= 0) {
         return CURL_SOCKET_BAD;
     }
-    exchange->connectionTaken = true;
-    return exchange->connection;
+    exchange->placeholder = openPlaceholder(*address);
+    return exchange->placeholder < 0 ? CURL_SOCKET_BAD : exchange->placeholder;
 }
 
-int HttpExchange::onOpened(void* /*self*/, curl_socket_t /*socket*/, curlsocktype /*purpose*/) {
-    return CURL_SOCKOPT_ALREADY_CONNECTED;
+int HttpExchange::onConnected(void* self, char* /*peer*/, char* /*local*/, int /*peerPort*/,
+                              int /*localPort*/) {
+    const auto* exchange = static_cast<HttpExchange*>(self);
+    const int moved = ::dup3(exchange->connection, exchange->placeholder, O_CLOEXEC);
+    return moved < 0 ? CURL_PREREQFUNC_ABORT : CURL_PREREQFUNC_OK;
 }
 
-int HttpExchange::onClose(void* self, curl_socket_t /*socket*/) {
+int HttpExchange::onClose(void* self, curl_socket_t socket) {
     static_cast<HttpExchange*>(self)->closedByCurl = true;
-    return 0;
+    return ::close(socket);
 }
 
 void HttpExchange::takeBody(const char* data, std::size_t count) {

@@ -66,7 +66,7 @@ class HttpExchange : public ByteSource {
     static std::size_t onHeaderLine(char* data, std::size_t size, std::size_t count, void* self);
     static std::size_t onBody(char* data, std::size_t size, std::size_t count, void* self);
     static curl_socket_t onOpen(void* self, curlsocktype purpose, curl_sockaddr* address);
-    static int onOpened(void* self, curl_socket_t socket, curlsocktype purpose);
+    static int onConnected(void* self, char* peer, char* local, int peerPort, int localPort);
     static int onClose(void* self, curl_socket_t socket);
 
     void setOptions(const HttpRequest& request);
@@ -77,7 +77,7 @@ class HttpExchange : public ByteSource {
     void throwIfFailed() const;
 
     int connection;
-    bool connectionTaken = false;
+    int placeholder = -1;  // what libcurl takes for its socket; it closes that itself
     bool closedByCurl = false;
     Deadline deadline;
     HttpLimits limits;
