@@ -76,7 +76,9 @@ CIMKeyBinding::CIMKeyBinding(CIMName name, String value, Type type)
     : name(std::move(name)), value(std::move(value)), type(type) {}
 
 CIMKeyBinding::CIMKeyBinding(CIMName name, const CIMValue& value)
-    : name(std::move(name)), value(value.toString()), type(keyTypeOf(this->name, value)) {}
+    : name(std::move(name)), type(keyTypeOf(this->name, value)) {
+    this->value = value.toString();
+}
 
 void CIMKeyBinding::setName(CIMName newName) {
     name = std::move(newName);
