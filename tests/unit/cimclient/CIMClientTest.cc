@@ -227,6 +227,7 @@ TEST_F(CIMClientTest, ErrorElementWithAnyCodeAboveZero) {
         EXPECT_EQ(codeOf([&] { nameOfClass("CIM_Fan"); }), code);
     }
     expectNextRequestWorks();
+    EXPECT_EQ(server.connectionCount(), 1U);
 }
 
 TEST_F(CIMClientTest, ErrorInTheTrailerAfterInstances) {
