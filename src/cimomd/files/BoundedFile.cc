@@ -1,0 +1,82 @@
+#include "files/BoundedFile.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <cerrno>
+
+namespace cimomd {
+namespace {
+
+constexpr std::size_t kFirstPiece = 4096;
+constexpr std::size_t kLargestPiece = std::size_t{1} << 20;
+
+class Descriptor {
+  public:
+    // Not blocking, so that a named pipe in place of a file does not hold the reader up.
+    explicit Descriptor(const std::filesystem::path& path)
+        : number(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY)) {}
+    ~Descriptor() {
+        if (number >= 0)
+            ::close(number);
+    }
+    Descriptor(const Descriptor&) = delete;
+    Descriptor& operator=(const Descriptor&) = delete;
+
+    int get() const { return number; }
+    bool isRegularFile() const {
+        struct stat status {};
+        return ::fstat(number, &status) == 0 && S_ISREG(status.st_mode);
+    }
+
+  private:
+    int number;
+};
+
+bool meansAbsent(int error) {
+    return error == ENOENT || error == ENOTDIR || error == ENODEV || error == ESRCH;
+}
+
+FileStatus readAll(int descriptor, std::size_t maxBytes, std::string& bytes) {
+    std::size_t length = 0;
+    while (true) {
+        // One byte more than allowed tells a file that is too long from one that just fits.
+        const std::size_t piece =
+            std::min({std::max(length, kFirstPiece), kLargestPiece, maxBytes + 1 - length});
+        bytes.resize(length + piece);
+        const ssize_t count = ::read(descriptor, bytes.data() + length, piece);
+        if (count < 0 && errno == EINTR)
+            continue;
+        if (count < 0)
+            return meansAbsent(errno) ? FileStatus::Absent : FileStatus::Unreadable;
+        length += static_cast<std::size_t>(count);
+        bytes.resize(length);
+        if (length > maxBytes)
+            return FileStatus::TooLong;
+        if (count == 0)
+            return FileStatus::Read;
+    }
+}
+
+}  // namespace
+
+FileContent readBoundedFile(const std::filesystem::path& path, std::size_t maxBytes) {
+    FileContent content;
+    const Descriptor descriptor(path);
+    if (descriptor.get() < 0) {
+        content.status = meansAbsent(errno) ? FileStatus::Absent : FileStatus::Unreadable;
+        return content;
+    }
+    if (!descriptor.isRegularFile()) {
+        content.status = FileStatus::Unreadable;
+        return content;
+    }
+    content.status = readAll(descriptor.get(), maxBytes, content.bytes);
+    if (content.status != FileStatus::Read)
+        content.bytes.clear();
+    return content;
+}
+
+}  // namespace cimomd

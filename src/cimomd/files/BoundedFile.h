@@ -1,0 +1,24 @@
+#pragma once
+
+// Reading files whole, never more than a bound: kernel files report no size, and a link in a
+// directory that others may write could lead anywhere.
+
+#include <cstddef>
+#include <filesystem>
+#include <string>
+
+namespace cimomd {
+
+enum class FileStatus { Read, Absent, Unreadable, TooLong };
+
+struct FileContent {
+    FileStatus status = FileStatus::Absent;
+    /// Empty unless `status` is Read.
+    std::string bytes;
+};
+
+/// The bytes of a regular file of at most `maxBytes`. Unreadable: no permission, no regular file,
+/// or an error while reading. Absent: nothing has this name, also when it vanished meanwhile.
+FileContent readBoundedFile(const std::filesystem::path& path, std::size_t maxBytes);
+
+}  // namespace cimomd

@@ -1,0 +1,242 @@
+#include "mof/MofLexer.h"
+
+#include <fmt/format.h>
+
+#include "mof/MofNumber.h"
+#include "text/Utf8.h"
+
+namespace cimomd {
+namespace {
+
+constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+constexpr std::size_t kMaxHexDigits = 4;
+
+bool isDigit(char c) {
+    return c >= '0' && c <= '9';
+}
+
+bool isNameStart(char c) {
+    return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || c == '_' ||
+           static_cast<unsigned char>(c) >= 0x80;
+}
+
+bool isBlank(char c) {
+    return c == ' ' || c == '\t' || c == '\r' || c == '\n' || c == '\f';
+}
+
+bool isContinuationByte(char c) {
+    return (static_cast<unsigned char>(c) & 0xC0) == 0x80;
+}
+
+int hexDigit(char c) {
+    if (isDigit(c))
+        return c - '0';
+    if (c >= 'a' && c <= 'f')
+        return c - 'a' + 10;
+    if (c >= 'A' && c <= 'F')
+        return c - 'A' + 10;
+    return -1;
+}
+
+std::string describe(char c) {
+    const auto byte = static_cast<unsigned char>(c);
+    if (byte < 0x20 || byte >= 0x7F)
+        return fmt::format("the byte 0x{:02X}", byte);
+    return fmt::format("'{}'", c);
+}
+
+}  // namespace
+
+MofLexer::MofLexer(std::string_view mofText, std::string_view fileName)
+    : text(mofText), file(fileName) {
+    if (text.substr(0, kByteOrderMark.size()) == kByteOrderMark)
+        offset = kByteOrderMark.size();
+}
+
+MofToken MofLexer::next() {
+    skipBlanksAndComments();
+    if (atEnd())
+        return tokenFrom(MofTokenKind::End, offset, position);
+    const char c = current();
+    if (startsNumber())
+        return number();
+    if (isNameStart(c))
+        return identifier();
+    if (c == '"')
+        return quoted('"', MofTokenKind::String);
+    if (c == '\'')
+        return quoted('\'', MofTokenKind::Char);
+    if (c == '#')
+        return pragma();
+    if (std::string_view("[]{}(),;:=").find(c) == std::string_view::npos)
+        fail(position, describe(c), "a declaration");
+    const MofPosition start = position;
+    const std::size_t startOffset = offset;
+    advance();
+    return tokenFrom(MofTokenKind::Punctuation, startOffset, start);
+}
+
+char MofLexer::peek(std::size_t distance) const {
+    return offset + distance < text.size() ? text[offset + distance] : '\0';
+}
+
+void MofLexer::advance() {
+    const char passed = text[offset++];
+    if (passed == '\n') {
+        ++position.line;
+        position.column = 1;
+    } else if (atEnd() || !isContinuationByte(text[offset])) {
+        ++position.column;
+    }
+}
+
+void MofLexer::skipBlanksAndComments() {
+    while (!atEnd()) {
+        if (isBlank(current())) {
+            advance();
+        } else if (current() == '/' && peek(1) == '/') {
+            while (!atEnd() && current() != '\n')
+                advance();
+        } else if (current() == '/' && peek(1) == '*') {
+            skipBlockComment();
+        } else {
+            return;
+        }
+    }
+}
+
+void MofLexer::skipBlockComment() {
+    const MofPosition start = position;
+    advance();
+    advance();
+    while (!atEnd()) {
+        if (current() == '*' && peek(1) == '/') {
+            advance();
+            advance();
+            return;
+        }
+        advance();
+    }
+    fail(start, "a comment without an end", "*/");
+}
+
+MofToken MofLexer::identifier() {
+    const MofPosition start = position;
+    const std::size_t startOffset = offset;
+    while (!atEnd() && (isNameStart(current()) || isDigit(current())))
+        advance();
+    return tokenFrom(MofTokenKind::Identifier, startOffset, start);
+}
+
+bool MofLexer::startsNumber() const {
+    const char c = current();
+    const bool isSigned = c == '+' || c == '-';
+    const char first = isSigned ? peek(1) : c;
+    const char second = isSigned ? peek(2) : peek(1);
+    return isDigit(first) || (first == '.' && isDigit(second));
+}
+
+MofToken MofLexer::number() {
+    const MofPosition start = position;
+    const std::size_t startOffset = offset;
+    if (current() == '+' || current() == '-')
+        advance();
+    const bool isHex = current() == '0' && (peek(1) == 'x' || peek(1) == 'X');
+    advance();
+    while (!atEnd()) {
+        const char c = current();
+        const char before = text[offset - 1];
+        const bool exponentSign =
+            (c == '+' || c == '-') && !isHex && (before == 'e' || before == 'E');
+        if (!isNameStart(c) && !isDigit(c) && c != '.' && !exponentSign)
+            break;
+        advance();
+    }
+    MofToken token = tokenFrom(MofTokenKind::Integer, startOffset, start);
+    if (!parseMofNumber(token))
+        fail(start, token.text, "a number within 64 bits");
+    return token;
+}
+
+MofToken MofLexer::pragma() {
+    const MofPosition start = position;
+    const std::size_t startOffset = offset;
+    advance();
+    while (!atEnd() && isNameStart(current()))
+        advance();
+    MofToken token = tokenFrom(MofTokenKind::Pragma, startOffset, start);
+    if (!equalsIgnoringCase(token.text, "#pragma"))
+        fail(start, token.text, "#pragma");
+    return token;
+}
+
+MofToken MofLexer::quoted(char quote, MofTokenKind kind) {
+    const MofPosition start = position;
+    const std::size_t startOffset = offset;
+    std::string characters;
+    advance();
+    while (current() != quote || atEnd()) {
+        if (atEnd())
+            fail(start, "a text without an end", fmt::format("a closing {}", quote));
+        if (current() == '\n' || current() == '\r')
+            fail(position, "the end of the line", fmt::format("a closing {}", quote));
+        if (current() == '\\') {
+            readEscape(characters);
+        } else {
+            characters += current();
+            advance();
+        }
+    }
+    advance();
+    MofToken token = tokenFrom(kind, startOffset, start);
+    // Published schemas carry single bytes of other encodings in descriptions; they are no reason
+    // to refuse a class.
+    token.characters = cleanUtf8(characters);
+    return token;
+}
+
+void MofLexer::readEscape(std::string& out) {
+    static constexpr std::string_view kLetters = "btnfr\"'\\";
+    static constexpr std::string_view kMeanings = "\b\t\n\f\r\"'\\";
+    const MofPosition start = position;
+    advance();
+    if (current() == 'x' || current() == 'X') {
+        readHexEscape(out, start);
+        return;
+    }
+    const std::size_t index = atEnd() ? std::string_view::npos : kLetters.find(current());
+    if (index == std::string_view::npos)
+        fail(start, "a backslash", "one of \\b \\t \\n \\f \\r \\\" \\' \\\\ \\x");
+    out += kMeanings[index];
+    advance();
+}
+
+void MofLexer::readHexEscape(std::string& out, MofPosition start) {
+    advance();
+    char32_t code = 0;
+    std::size_t digits = 0;
+    for (int digit = hexDigit(current()); digit >= 0 && digits < kMaxHexDigits;
+         digit = hexDigit(current())) {
+        code = code * 16 + static_cast<char32_t>(digit);
+        ++digits;
+        advance();
+    }
+    if (digits == 0 || code == 0)
+        fail(start, "\\x", "\\x with one to four hexadecimal digits, not 0");
+    appendUtf8(out, code);
+}
+
+MofToken MofLexer::tokenFrom(MofTokenKind kind, std::size_t start,
+                             MofPosition startPosition) const {
+    MofToken token;
+    token.kind = kind;
+    token.text = text.substr(start, offset - start);
+    token.position = startPosition;
+    return token;
+}
+
+void MofLexer::fail(MofPosition where, std::string_view found, std::string_view expected) const {
+    throw MofError(file, where, found, expected);
+}
+
+}  // namespace cimomd

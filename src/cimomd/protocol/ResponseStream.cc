@@ -1,0 +1,98 @@
+#include "protocol/ResponseStream.h"
+
+#include <Pegasus/Common/CIMStatusCode.h>
+
+#include <algorithm>
+#include <cstring>
+#include <utility>
+
+#include "text/CimText.h"
+#include "text/Utf8.h"
+#include "xml/CimXmlWriter.h"
+
+namespace cimomd {
+namespace {
+
+constexpr std::size_t kEnoughPending = std::size_t{32} << 10;
+
+}  // namespace
+
+CimStatus CimStatus::of(const Pegasus::CIMException& error) {
+    return {static_cast<unsigned>(error.getCode()), utf8Of(error.getMessage())};
+}
+
+ResponseStream::ResponseStream(std::string requestId, std::string methodName, bool trailers)
+    : messageId(std::move(requestId)), method(std::move(methodName)), withTrailers(trailers) {}
+
+void ResponseStream::fail(const CimStatus& status) {
+    if (handedOver && !withTrailers) {
+        broken = true;
+        return;
+    }
+    if (!handedOver) {
+        pending.clear();
+        offset = 0;
+        Pegasus::beginResponse(pending, messageId, method);
+        if (!withTrailers)
+            Pegasus::appendError(pending, status.code, cimString(status.description));
+    } else if (begun) {
+        Pegasus::endReturnValue(pending);
+    }
+    if (withTrailers)
+        trailer = status;
+    Pegasus::endResponse(pending);
+    finished = true;
+}
+
+ResponseStream::Outcome ResponseStream::read(char* buffer, std::size_t capacity,
+                                             std::size_t& count) {
+    fill();
+    if (broken)
+        return Outcome::Broken;
+    count = std::min(capacity, pending.size() - offset);
+    if (count == 0)
+        return Outcome::End;
+    std::memcpy(buffer, pending.data() + offset, count);
+    offset += count;
+    handedOver = true;
+    return Outcome::Data;
+}
+
+void ResponseStream::fill() {
+    if (offset == pending.size()) {
+        pending.clear();
+        offset = 0;
+    }
+    while (pending.size() < kEnoughPending && !finished && !broken)
+        step();
+}
+
+void ResponseStream::step() {
+    if (!begun) {
+        Pegasus::beginResponse(pending, messageId, method);
+        Pegasus::beginReturnValue(pending);
+        begun = true;
+    }
+    const std::size_t before = pending.size();
+    try {
+        if (!answer->next(pending))
+            finish();
+    } catch (const Pegasus::CIMException& error) {
+        pending.resize(before);
+        fail(CimStatus::of(error));
+    } catch (const Pegasus::Exception& error) {
+        pending.resize(before);
+        fail({Pegasus::CIM_ERR_FAILED, utf8Of(error.getMessage())});
+    } catch (const std::exception& error) {
+        pending.resize(before);
+        fail({Pegasus::CIM_ERR_FAILED, cleanUtf8(error.what())});
+    }
+}
+
+void ResponseStream::finish() {
+    Pegasus::endReturnValue(pending);
+    Pegasus::endResponse(pending);
+    finished = true;
+}
+
+}  // namespace cimomd

@@ -1,0 +1,30 @@
+#pragma once
+
+// Numbers and bounds that the CIM schema gives a meaning, as far as several providers need them.
+
+#include <cstddef>
+#include <cstdint>
+
+namespace cimomd {
+
+// CIM_ManagedSystemElement.OperationalStatus
+inline constexpr std::uint16_t kOperationalUnknown = 0;
+inline constexpr std::uint16_t kOperationalOk = 2;
+inline constexpr std::uint16_t kOperationalStopped = 10;
+inline constexpr std::uint16_t kOperationalInService = 11;
+inline constexpr std::uint16_t kOperationalDormant = 15;
+
+// CIM_EnabledLogicalElement.EnabledState
+inline constexpr std::uint16_t kEnabled = 2;
+inline constexpr std::uint16_t kDisabled = 3;
+inline constexpr std::uint16_t kEnabledButOffline = 6;
+
+// CIM_ComputerSystem.Dedicated
+inline constexpr std::uint16_t kNotDedicated = 0;
+
+// MaxLen of CIM_ManagedElement.Caption and of names that are keys.
+inline constexpr std::size_t kCaptionLength = 64;
+inline constexpr std::size_t kSystemNameLength = 256;
+inline constexpr std::size_t kDeviceIdLength = 64;
+
+}  // namespace cimomd

@@ -1,0 +1,153 @@
+#include "repository/Inheritance.h"
+
+#include <fmt/format.h>
+
+#include "repository/RepositoryError.h"
+#include "text/CimText.h"
+
+namespace cimomd {
+namespace {
+
+using Pegasus::CIMClass;
+using Pegasus::CIMConstClass;
+using Pegasus::CIMConstProperty;
+using Pegasus::CIMConstQualifier;
+using Pegasus::CIMFlavor;
+using Pegasus::CIMName;
+using Pegasus::CIMProperty;
+using Pegasus::CIMQualifier;
+using Pegasus::Uint32;
+
+/// The form of a superclass's qualifier in the subclass. Sharing what is propagated already keeps a
+/// schema of thousands of classes small.
+CIMQualifier propagated(CIMQualifier qualifier) {
+    if (qualifier.getPropagated())
+        return qualifier;
+    CIMQualifier copy = qualifier.clone();
+    copy.setPropagated(true);
+    return copy;
+}
+
+/// Gives `target` the qualifiers of `super` that go to subclasses and that `declared` does not
+/// repeat. Element is a class or a property.
+template <typename Element, typename ConstElement>
+void inheritQualifiers(Element& super, const ConstElement* declared, Element& target) {
+    for (Uint32 i = 0; i < super.getQualifierCount(); ++i) {
+        const CIMQualifier qualifier = super.getQualifier(i);
+        const bool repeated = declared != nullptr && declared->findQualifier(qualifier.getName()) !=
+                                                         Pegasus::PEG_NOT_FOUND;
+        if (!repeated && qualifier.getFlavor().has(CIMFlavor::TOSUBCLASS))
+            target.addQualifier(propagated(qualifier));
+    }
+}
+
+template <typename Element>
+void takeQualifiers(Element& declared, Element& target) {
+    for (Uint32 i = 0; i < declared.getQualifierCount(); ++i)
+        target.addQualifier(declared.getQualifier(i));
+}
+
+CIMProperty bareProperty(const CIMConstProperty& property, const CIMName& origin,
+                         bool isPropagated) {
+    return CIMProperty(property.getName(), property.getValue(), property.getArraySize(),
+                       property.getReferenceClassName(), origin, isPropagated);
+}
+
+CIMProperty inheritedProperty(CIMProperty super) {
+    if (super.getPropagated())
+        return super;
+    CIMProperty out = bareProperty(super, super.getClassOrigin(), true);
+    inheritQualifiers<CIMProperty, CIMConstProperty>(super, nullptr, out);
+    return out;
+}
+
+CIMProperty overridingProperty(CIMProperty super, CIMProperty declared) {
+    CIMProperty out = bareProperty(declared, super.getClassOrigin(), false);
+    if (declared.getValue().isNull())
+        out.setValue(super.getValue());
+    inheritQualifiers<CIMProperty, CIMConstProperty>(super, &declared, out);
+    takeQualifiers(declared, out);
+    return out;
+}
+
+bool sameType(const CIMConstProperty& a, const CIMConstProperty& b) {
+    return a.getType() == b.getType() && a.isArray() == b.isArray();
+}
+
+std::string typeText(const CIMConstProperty& property) {
+    return fmt::format("{}{}", Pegasus::cimTypeToString(property.getType()),
+                       property.isArray() ? "[]" : "");
+}
+
+bool sameValue(const CIMConstQualifier& a, const CIMConstQualifier& b) {
+    return a.getValue().isNull() == b.getValue().isNull() &&
+           a.getValue().toString() == b.getValue().toString();
+}
+
+template <typename Element>
+void checkQualifiers(const Element& super, const Element& declared, const CIMName& property) {
+    for (Uint32 i = 0; i < declared.getQualifierCount(); ++i) {
+        const CIMConstQualifier qualifier = declared.getQualifier(i);
+        const Uint32 index = super.findQualifier(qualifier.getName());
+        if (index == Pegasus::PEG_NOT_FOUND)
+            continue;
+        const CIMConstQualifier inherited = super.getQualifier(index);
+        const CIMFlavor& flavor = inherited.getFlavor();
+        const bool bound = flavor.has(CIMFlavor::TOSUBCLASS) && !flavor.has(CIMFlavor::OVERRIDABLE);
+        if (bound && !sameValue(inherited, qualifier))
+            throw RepositoryError{
+                property, qualifier.getName(),
+                fmt::format("qualifier {} with another value than the superclass gives it",
+                            utf8Of(qualifier.getName().getString())),
+                fmt::format("its value to stay {}", utf8Of(inherited.getValue().toString()))};
+    }
+}
+
+}  // namespace
+
+CIMClass asTopClass(CIMClass declared) {
+    for (Uint32 i = 0; i < declared.getPropertyCount(); ++i)
+        declared.getProperty(i).setClassOrigin(declared.getClassName());
+    return declared;
+}
+
+CIMClass inherit(CIMClass super, CIMClass declared) {
+    CIMClass out(declared.getClassName(), super.getClassName());
+    inheritQualifiers<CIMClass, CIMConstClass>(super, &declared, out);
+    takeQualifiers(declared, out);
+    for (Uint32 i = 0; i < super.getPropertyCount(); ++i) {
+        const CIMProperty property = super.getProperty(i);
+        const Uint32 index = declared.findProperty(property.getName());
+        if (index == Pegasus::PEG_NOT_FOUND)
+            out.addProperty(inheritedProperty(property));
+        else
+            out.addProperty(overridingProperty(property, declared.getProperty(index)));
+    }
+    for (Uint32 i = 0; i < declared.getPropertyCount(); ++i) {
+        CIMProperty property = declared.getProperty(i);
+        if (super.findProperty(property.getName()) != Pegasus::PEG_NOT_FOUND)
+            continue;
+        property.setClassOrigin(declared.getClassName());
+        out.addProperty(property);
+    }
+    return out;
+}
+
+void checkOverrides(const CIMConstClass& super, const CIMConstClass& declared) {
+    checkQualifiers(super, declared, CIMName());
+    for (Uint32 i = 0; i < declared.getPropertyCount(); ++i) {
+        const CIMConstProperty property = declared.getProperty(i);
+        const Uint32 index = super.findProperty(property.getName());
+        if (index == Pegasus::PEG_NOT_FOUND)
+            continue;
+        const CIMConstProperty inherited = super.getProperty(index);
+        if (!sameType(inherited, property))
+            throw RepositoryError{
+                property.getName(), CIMName(),
+                fmt::format("{} {}", typeText(property), utf8Of(property.getName().getString())),
+                fmt::format("the inherited type {}", typeText(inherited))};
+        checkQualifiers(inherited, property, property.getName());
+    }
+}
+
+}  // namespace cimomd

@@ -1,0 +1,22 @@
+#pragma once
+
+// os-release(5): which distribution this is.
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace cimomd {
+
+/// Values without their shell quoting; absent and empty ones are nothing.
+struct OsRelease {
+    std::optional<std::string> id;
+    std::optional<std::string> name;
+    std::optional<std::string> prettyName;
+    std::optional<std::string> versionId;
+};
+
+/// Of equal keys the last counts. Lines that are no assignment are dropped.
+OsRelease parseOsRelease(std::string_view text);
+
+}  // namespace cimomd

@@ -1,0 +1,30 @@
+#pragma once
+
+// Stands in for the system calls when a recorded tree is read: the sizes of its file systems come
+// from a file of the tree, never from the machine this runs on.
+
+#include <map>
+#include <string_view>
+
+#include "system/LiveSystemCalls.h"
+#include "system/SystemPaths.h"
+
+namespace cimomd {
+
+/// Reads lines `mount-point fragment-bytes blocks available-blocks inodes free-inodes`; blanks in
+/// the mount point are written as \040. Other lines are dropped.
+std::map<std::string, FileSystemSize> parseRecordedSizes(std::string_view text);
+
+class RecordedSystemCalls : public LiveSystemCalls {
+  public:
+    explicit RecordedSystemCalls(const SystemPaths& paths);
+
+    std::optional<FileSystemSize> fileSystemSize(const std::string& mountPoint) const override;
+    /// Always nothing: a tree says it in proc/sys/kernel/arch or not at all.
+    std::optional<std::string> machine() const override;
+
+  private:
+    std::map<std::string, FileSystemSize> sizes;
+};
+
+}  // namespace cimomd

@@ -1,0 +1,43 @@
+#pragma once
+
+// What only a system call tells, behind an interface, so that tests need no live machine.
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+namespace cimomd {
+
+/// As statvfs reports it; counts of blocks are in units of `fragmentBytes`.
+struct FileSystemSize {
+    std::uint64_t fragmentBytes = 0;
+    std::uint64_t blocks = 0;
+    std::uint64_t availableBlocks = 0;
+    std::uint64_t inodes = 0;
+    std::uint64_t freeInodes = 0;
+
+    bool operator==(const FileSystemSize&) const = default;
+};
+
+class SystemCalls {
+  public:
+    virtual ~SystemCalls() = default;
+
+    /// Seconds since 1970-01-01 UTC.
+    virtual std::int64_t now() const = 0;
+    /// Minutes that local time is ahead of UTC at `time`.
+    virtual int utcOffsetMinutes(std::int64_t time) const = 0;
+    /// The size of the file system mounted at `mountPoint`, a path without the injected root;
+    /// nothing when it cannot be told. Call it for local file systems only: on a dead server the
+    /// system call never returns.
+    virtual std::optional<FileSystemSize> fileSystemSize(const std::string& mountPoint) const = 0;
+    /// The machine's name as uname has it, for example "x86_64".
+    virtual std::optional<std::string> machine() const = 0;
+
+  protected:
+    SystemCalls() = default;
+    SystemCalls(const SystemCalls&) = default;
+    SystemCalls& operator=(const SystemCalls&) = default;
+};
+
+}  // namespace cimomd

@@ -1,0 +1,42 @@
+#pragma once
+
+// Where the machine's facts are read. Every path lies below one root, so that tests read a recorded
+// tree; an object whose root nobody set refuses to name any path.
+
+#include <filesystem>
+#include <string_view>
+
+namespace cimomd {
+
+class SystemPaths {
+  public:
+    SystemPaths() = default;
+    explicit SystemPaths(std::filesystem::path rootDirectory) : root(std::move(rootDirectory)) {}
+
+    // Each raises std::logic_error when no root was set.
+    std::filesystem::path hostName() const { return below("proc/sys/kernel/hostname"); }
+    std::filesystem::path kernelRelease() const { return below("proc/sys/kernel/osrelease"); }
+    std::filesystem::path architecture() const { return below("proc/sys/kernel/arch"); }
+    std::filesystem::path processes() const { return below("proc"); }
+    std::filesystem::path kernelStatistics() const { return below("proc/stat"); }
+    std::filesystem::path memory() const { return below("proc/meminfo"); }
+    std::filesystem::path processors() const { return below("proc/cpuinfo"); }
+    std::filesystem::path mounts() const { return below("proc/self/mountinfo"); }
+    std::filesystem::path deviceTree() const { return below("proc/device-tree"); }
+    std::filesystem::path logicalProcessors() const { return below("sys/devices/system/cpu"); }
+    std::filesystem::path networkInterfaces() const { return below("sys/class/net"); }
+    std::filesystem::path firmwareIdentity() const { return below("sys/class/dmi/id"); }
+    std::filesystem::path osRelease() const { return below("etc/os-release"); }
+    std::filesystem::path vendorOsRelease() const { return below("usr/lib/os-release"); }
+    std::filesystem::path machineId() const { return below("etc/machine-id"); }
+    std::filesystem::path sessions() const { return below("run/utmp"); }
+    /// Only in recorded trees: what statvfs said when the tree was recorded.
+    std::filesystem::path recordedFileSystemSizes() const { return below("statvfs"); }
+
+  private:
+    std::filesystem::path below(std::string_view path) const;
+
+    std::filesystem::path root;
+};
+
+}  // namespace cimomd
