@@ -35,11 +35,15 @@ bool ElementReader::nextChild() {
                 return false;
             case Token::Text:
             case Token::CData:
-                if (!isBlank(tokenizer.text())) {
-                    failAt(tokenizer.offset(), "text " + quotedForMessage(tokenizer.text()) +
-                                                   " stands between elements; expected a tag");
-                }
+                requireBlank(tokenizer.text());
         }
+    }
+}
+
+void ElementReader::requireBlank(std::string_view text) const {
+    if (!isBlank(text)) {
+        failAt(tokenizer.offset(), "text " + quotedForMessage(trimXmlSpace(text)) +
+                                       " stands between elements; expected a tag");
     }
 }
 

@@ -72,6 +72,7 @@ class ElementReader {
 
   private:
     void entered() { elementOffset = tokenizer.offset(); }
+    void requireBlank(std::string_view text) const;
     [[noreturn]] void failTooLong() const;
     ElementText collectText(XmlTokenizer::Token token);
 

@@ -178,7 +178,13 @@ bool parseScalar(const ElementText& text, CIMDateTime& value) {
         return true;
     }
     try {
-        value = CIMDateTime(makeString(form));
+        const CIMDateTime parsed(makeString(form));
+        // Servers exist that write a time stamp with ":" for the sign of its offset. The asterisks,
+        // for which an interval has no use, tell some of these from intervals.
+        if (parsed.isInterval() && form.find('*') != std::string_view::npos) {
+            return false;
+        }
+        value = parsed;
         return true;
     } catch (const InvalidDateTimeFormatException&) {
         return false;

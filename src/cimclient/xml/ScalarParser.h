@@ -41,7 +41,8 @@ bool parseScalar(const ElementText& text, Char16& value);
 /// Any text: it is taken without the white space at its ends.
 bool parseScalar(const ElementText& text, String& value);
 
-/// The 25 characters of a datetime, or nothing for the interval of zero length.
+/// The 25 characters of a datetime, or nothing for the interval of zero length. Asterisks may stand
+/// in time stamps only.
 bool parseScalar(const ElementText& text, CIMDateTime& value);
 
 /// The text as a String; `utf8` must be UTF-8.

@@ -153,9 +153,7 @@ XmlTokenizer::Token XmlTokenizer::readText() {
     }
     textBegin = tokenStart;
     textEnd = pos;
-    if (textEnd - textBegin > limits.tokenSize) {
-        fail(XmlError::Kind::Limit, offset(), "a text is too long");
-    }
+    checkSize();
     if (!isPlain) {
         const char* decodedEnd = decode(at(textBegin), at(textEnd), XmlTextKind::Content);
         textEnd = static_cast<std::size_t>(decodedEnd - window.data());
@@ -192,7 +190,7 @@ XmlTokenizer::Token XmlTokenizer::readStartTag() {
 
 XmlTokenizer::Token XmlTokenizer::readEndTag() {
     pos += 2;
-    scanTo(">", "end tag");
+    scanTo(">");
     char* const begin = at(tokenStart + 2);
     char* const nameEnd = parseName(begin, "an element's name");
     currentName = {begin, static_cast<std::size_t>(nameEnd - begin)};
@@ -215,7 +213,7 @@ XmlTokenizer::Token XmlTokenizer::readCData() {
     constexpr std::string_view kOpening = "<![CDATA[";
     constexpr std::string_view kClosing = "]]>";
     pos += kOpening.size();
-    scanTo(kClosing, "CDATA section");
+    scanTo(kClosing);
     textBegin = tokenStart + kOpening.size();
     textEnd = pos - kClosing.size();
     char* const begin = at(textBegin);
@@ -235,7 +233,7 @@ XmlTokenizer::Token XmlTokenizer::closeElement() {
 void XmlTokenizer::skipInstruction() {
     const bool mayDeclare = offset() == declarationOffset;
     pos += 2;
-    scanTo("?>", "processing instruction");
+    scanTo("?>");
     char* const target = at(tokenStart + 2);
     char* const targetEnd = parseName(target, "a processing instruction's name");
     const char* const end = at(pos - 2);
@@ -252,7 +250,7 @@ void XmlTokenizer::skipInstruction() {
 
 void XmlTokenizer::skipComment() {
     pos += 4;
-    scanTo("--", "comment");
+    scanTo("--");
     if (!available(1)) {
         failTruncated();
     }
@@ -311,6 +309,7 @@ void XmlTokenizer::scanTag() {
         if (quote != '\0') {
             quote = '\0';
         } else if (stop == '>') {
+            checkSize();
             return;
         } else {
             quote = stop;
@@ -319,7 +318,7 @@ void XmlTokenizer::scanTag() {
 }
 
 // Leaves the position behind the terminator.
-void XmlTokenizer::scanTo(std::string_view terminator, const char* where) {
+void XmlTokenizer::scanTo(std::string_view terminator) {
     for (;;) {
         const std::string_view rest = view(pos, window.size());
         const std::size_t found = rest.find(terminator);
@@ -332,8 +331,14 @@ void XmlTokenizer::scanTo(std::string_view terminator, const char* where) {
             failTruncated();
         }
     }
+    checkSize();
+}
+
+// The window may hold more than the limit, so a token that is there as a whole is checked too.
+void XmlTokenizer::checkSize() const {
     if (pos - tokenStart > limits.tokenSize) {
-        fail(XmlError::Kind::Limit, offset(), std::string(where) + " is too long");
+        fail(XmlError::Kind::Limit, offset(),
+             "a tag or text is longer than " + std::to_string(limits.tokenSize) + " octets");
     }
 }
 

@@ -83,7 +83,8 @@ class XmlTokenizer {
     void checkDeclaration(char* begin, const char* end);
 
     void scanTag();
-    void scanTo(std::string_view terminator, const char* where);
+    void scanTo(std::string_view terminator);
+    void checkSize() const;
     char* parseName(char* p, const char* expected);
     void parseAttributes(char* p, const char* end);
     char* parseAttribute(char* p, const char* end);
