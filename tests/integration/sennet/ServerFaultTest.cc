@@ -29,7 +29,6 @@ std::vector<Fault> brokenAnswers() {
         {"HTTP 400 with CIMError", Reply::http(400, {{"CIMError", "request-not-valid"}})},
         {"HTTP 404 with a page", Reply::http(404, {{"Content-Type", "text/html"}}, "<html/>")},
         {"connection closed", Reply::closeAtOnce()},
-        {"connection reset", Reply::reset()},
         {"garbage", Reply::raw("\x01\x02garbage\r\n\r\n\xFF")},
         {"cut in the header", Reply::ok("").cutAfter(30)},
         {"cut in the body", Reply::ok(namedClass("CIM_Faulty")).cutAfter(400)},
@@ -120,6 +119,19 @@ TEST_F(ServerFaultTest, AbandonsOnlyTheScriptAtABrokenAnswerForTheClass) {
         expectRun("Processing b...\n");
         EXPECT_EQ(firstFile(), "earlier");
     }
+}
+
+TEST_F(ServerFaultTest, AbandonsTheScriptAtAResetConnection) {
+    server.onNext(Reply::reset());
+    expectRun("Processing b...\n");
+    EXPECT_EQ(firstFile(), "earlier");
+}
+
+TEST_F(ServerFaultTest, TakesAResetConnectionForTheInstancesAsNone) {
+    server.onNext(Reply::ok(namedClass("CIM_Faulty")));
+    server.onNext(Reply::reset());
+    expectRun("Processing a...\nProcessing b...\n");
+    EXPECT_EQ(firstFile(), withoutFaultyInstances());
 }
 
 TEST_F(ServerFaultTest, AbandonsTheScriptWhenTheAnswerHoldsNoClass) {
