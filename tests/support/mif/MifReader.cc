@@ -1,0 +1,11 @@
+#include "support/mif/MifReader.h"
+
+#include "support/mif/Parser.h"
+
+namespace Mif {
+
+Component MifReader::read(std::string_view text) const {
+    return Parser(text, tolerances).file();
+}
+
+}  // namespace Mif

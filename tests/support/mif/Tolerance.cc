@@ -1,0 +1,26 @@
+#include "support/mif/Tolerance.h"
+
+#include <utility>
+
+namespace Mif {
+
+std::optional<Tolerance> parseTolerance(std::string_view name) {
+    static constexpr std::pair<std::string_view, Tolerance> kNames[] = {
+        {"raw-line-ends", Tolerance::RawLineEnds},
+        {"plain-backslashes", Tolerance::PlainBackslashes},
+        {"integers-as-text", Tolerance::IntegersAsText},
+        {"text-as-integers", Tolerance::TextAsIntegers},
+        {"unsigned-integers", Tolerance::UnsignedIntegers},
+        {"empty-dates", Tolerance::EmptyDates},
+        {"long-literals", Tolerance::LongLiterals},
+        {"repeated-names", Tolerance::RepeatedNames},
+    };
+    for (const auto& [known, tolerance] : kNames) {
+        if (known == name) {
+            return tolerance;
+        }
+    }
+    return std::nullopt;
+}
+
+}  // namespace Mif
