@@ -39,6 +39,10 @@ void StopSignal::wait() {
     std::array<pollfd, 2> descriptors{{{signals, POLLIN, 0}, {requests, POLLIN, 0}}};
     while (::poll(descriptors.data(), descriptors.size(), -1) < 0 && errno == EINTR) {
     }
+    // A signal left pending would strike when the mask is put back.
+    signalfd_siginfo info{};
+    if ((descriptors[0].revents & POLLIN) != 0)
+        static_cast<void>(::read(signals, &info, sizeof info) == sizeof info);
 }
 
 }  // namespace cimomd
