@@ -150,7 +150,7 @@ CIMName ObjectPathParser::readName(Uint32 end) {
 }
 
 String ObjectPathParser::readUpTo(Uint32 end) {
-    const String part = text.subString(at, end - at);
+    String part = text.subString(at, end - at);
     at = end;
     return part;
 }

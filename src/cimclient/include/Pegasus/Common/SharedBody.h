@@ -20,10 +20,12 @@ class SharedBody {
     /// Deletes this body when the last handle lets go of it.
     void release() const noexcept {
         if (handles.fetch_sub(1, std::memory_order_acq_rel) == 1)
-            delete this;
+            destroy();
     }
 
   private:
+    void destroy() const noexcept;
+
     mutable std::atomic<Uint32> handles{0};
 };
 

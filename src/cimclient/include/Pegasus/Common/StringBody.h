@@ -23,7 +23,7 @@ class StringBody {
     void retain() noexcept { handles.fetch_add(1, std::memory_order_relaxed); }
     void release() noexcept {
         if (handles.fetch_sub(1, std::memory_order_acq_rel) == 1)
-            ::operator delete(this);
+            destroy();
     }
     Boolean isShared() const noexcept { return handles.load(std::memory_order_acquire) != 1; }
 
@@ -37,6 +37,7 @@ class StringBody {
     }
 
   private:
+    void destroy() noexcept;
     explicit StringBody(Uint32 capacity) noexcept : room(capacity) { setSize(0); }
 
     std::atomic<Uint32> handles{1};
