@@ -207,4 +207,9 @@ std::size_t FakeCimServer::connectionCount() const {
     return state->connectionCount;
 }
 
+std::size_t FakeCimServer::openConnectionCount() const {
+    const std::lock_guard lock(state->mutex);
+    return state->connections.size();
+}
+
 }  // namespace support

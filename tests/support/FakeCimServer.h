@@ -40,6 +40,8 @@ class FakeCimServer {
     std::vector<RecordedRequest> requests() const;
     // How many connections were accepted so far.
     std::size_t connectionCount() const;
+    // How many of them neither side has closed.
+    std::size_t openConnectionCount() const;
 
     // Stops listening and removes the socket, as a server that ends; and starts anew at the same
     // path. Open connections are closed by stop().

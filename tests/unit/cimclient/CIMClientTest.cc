@@ -190,7 +190,9 @@ TEST_F(CIMClientTest, ConnectsAnewWhenAnIdleConnectionWasClosed) {
     server.onGetClass("CIM_Fan", Reply::ok(classXml("CIM_Fan")).thenClose());
     EXPECT_EQ(nameOfClass("CIM_Fan"), "CIM_Fan");
     // The server closes without having said so; the client may only learn it from the socket.
-    std::this_thread::sleep_for(std::chrono::milliseconds(50));
+    while (server.openConnectionCount() > 0) {
+        std::this_thread::yield();
+    }
     EXPECT_EQ(nameOfClass("CIM_Fan"), "CIM_Fan");
     EXPECT_EQ(server.connectionCount(), 2U);
     EXPECT_EQ(server.requests().size(), 2U);
