@@ -1,0 +1,313 @@
+// Every provider on recorded machines: an ordinary one, an odd one, and one that gives nothing.
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <set>
+
+#include "InstanceText.h"
+#include "RecordedTree.h"
+#include "mof/MofCompiler.h"
+#include "providers/CimTime.h"
+#include "providers/ComputerSystemProvider.h"
+#include "providers/EthernetPortProvider.h"
+#include "providers/LocalFileSystemProvider.h"
+#include "providers/OperatingSystemProvider.h"
+#include "providers/ProcessorProvider.h"
+#include "providers/ProviderList.h"
+
+namespace cimomd {
+namespace {
+
+using Pegasus::CIMInstance;
+
+class FixedSystemCalls : public SystemCalls {
+  public:
+    std::int64_t now() const override { return 1700000000; }
+    int utcOffsetMinutes(std::int64_t time) const override { return time < 1690000000 ? 120 : 60; }
+    std::optional<FileSystemSize> fileSystemSize(const std::string& mountPoint) const override {
+        if (mountPoint == "/")
+            return FileSystemSize{4096, 2621440, 1310720, 655360, 600000};
+        if (mountPoint == "/huge")
+            return FileSystemSize{std::uint64_t{1} << 32, std::uint64_t{1} << 40, 1, 0, 0};
+        return std::nullopt;
+    }
+    std::optional<std::string> machine() const override { return "aarch64"; }
+};
+
+class ProvidersTest : public testing::Test {
+  protected:
+    ProvidersTest() { tree.file("proc/sys/kernel/hostname", "node7\n"); }
+
+    RecordedTree tree;
+    FixedSystemCalls calls;
+};
+
+TEST_F(ProvidersTest, computerSystem) {
+    tree.file("sys/class/dmi/id/sys_vendor", "QEMU\n")
+        .file("sys/class/dmi/id/product_name", "Standard PC \xFF\x01\n")
+        .file("sys/class/dmi/id/product_uuid", "11111111-1111-1111-1111-111111111111\n")
+        .file("etc/machine-id", "3d1219c7c4c5404aaa1f6d2a48adfda4\n");
+    const auto instances = all(ComputerSystemProvider(tree.paths()).enumerate());
+    ASSERT_EQ(instances.size(), 1U);
+    const CIMInstance& system = instances[0];
+    EXPECT_EQ(textOf(system, "Name"), "node7");
+    EXPECT_EQ(textOf(system, "CreationClassName"), "Velmira_ComputerSystem");
+    EXPECT_EQ(textOf(system, "NameFormat"), "Other");
+    EXPECT_EQ(textOf(system, "Dedicated"), "0 ");
+    EXPECT_EQ(textOf(system, "Manufacturer"), "QEMU");
+    EXPECT_EQ(textOf(system, "Model"), "Standard PC \xEF\xBF\xBD\xEF\xBF\xBD");
+    EXPECT_EQ(textOf(system, "UUID"), "null");
+    EXPECT_EQ(textOf(system, "SerialNumber"), "null");
+    EXPECT_EQ(textOf(system, "OtherIdentifyingInfo"), "3d1219c7c4c5404aaa1f6d2a48adfda4 ");
+    EXPECT_EQ(textOf(system, "IdentifyingDescriptions"), "Machine id ");
+}
+
+TEST_F(ProvidersTest, operatingSystem) {
+    tree.file("etc/os-release",
+              "ID=debian\nNAME=\"Debian GNU/Linux\"\nVERSION_ID=\"12\"\n"
+              "PRETTY_NAME=\"Debian GNU/Linux 12 (bookworm)\"\n")
+        .file("proc/sys/kernel/osrelease", "6.1.0-18-arm64\n")
+        .file("proc/meminfo", "MemTotal: 8388608 kB\nMemFree: 100 kB\nSwapTotal: 0 kB\n")
+        .file("proc/stat", "btime 1689999999\n")
+        .directory("proc/1")
+        .directory("proc/4711")
+        .directory("proc/self")
+        .file("run/utmp", "");
+    const auto instances = all(OperatingSystemProvider(tree.paths(), calls).enumerate());
+    ASSERT_EQ(instances.size(), 1U);
+    const CIMInstance& system = instances[0];
+    EXPECT_EQ(textOf(system, "Name"), "Debian GNU/Linux");
+    EXPECT_EQ(textOf(system, "Caption"), "Debian GNU/Linux 12 (bookworm)");
+    EXPECT_EQ(textOf(system, "CSName"), "node7");
+    EXPECT_EQ(textOf(system, "CSCreationClassName"), "Velmira_ComputerSystem");
+    EXPECT_EQ(textOf(system, "OSType"), "96");
+    EXPECT_EQ(textOf(system, "Version"), "12");
+    EXPECT_EQ(textOf(system, "KernelRelease"), "6.1.0-18-arm64");
+    EXPECT_EQ(textOf(system, "Architecture"), "aarch64");
+    // 1689999999 is 22 July 2023, 04:26:39 UTC; 1700000000 is 14 November 2023, 22:13:20 UTC.
+    EXPECT_EQ(textOf(system, "LastBootUpTime"), "20230722062639.000000+120");
+    EXPECT_EQ(textOf(system, "LocalDateTime"), "20231114231320.000000+060");
+    EXPECT_EQ(textOf(system, "CurrentTimeZone"), "60");
+    EXPECT_EQ(textOf(system, "NumberOfProcesses"), "2");
+    EXPECT_EQ(textOf(system, "NumberOfUsers"), "0");
+    EXPECT_EQ(textOf(system, "TotalVisibleMemorySize"), "8388608");
+    EXPECT_EQ(textOf(system, "FreePhysicalMemory"), "100");
+    EXPECT_EQ(textOf(system, "TotalSwapSpaceSize"), "0");
+}
+
+TEST_F(ProvidersTest, operatingSystemOfAMachineThatTellsNothing) {
+    const auto instances = all(OperatingSystemProvider(tree.paths(), calls).enumerate());
+    ASSERT_EQ(instances.size(), 1U);
+    EXPECT_EQ(textOf(instances[0], "Name"), "Linux");
+    EXPECT_EQ(textOf(instances[0], "OSType"), "101");
+    for (const char* property : {"Version", "LastBootUpTime", "NumberOfUsers", "KernelRelease",
+                                 "TotalVisibleMemorySize", "DistributionId"})
+        EXPECT_EQ(textOf(instances[0], property), "null") << property;
+}
+
+TEST_F(ProvidersTest, operatingSystemFromTheVendorsFile) {
+    tree.file("usr/lib/os-release", "ID=ubuntu\nNAME=Ubuntu\n")
+        .file("proc/sys/kernel/arch", "i686\n");
+    const auto instances = all(OperatingSystemProvider(tree.paths(), calls).enumerate());
+    EXPECT_EQ(textOf(instances[0], "Name"), "Ubuntu");
+    EXPECT_EQ(textOf(instances[0], "OSType"), "93");
+}
+
+TEST(OperatingSystemProvider, knowsTheTypesOfDistributions) {
+    struct Case {
+        const char* id;
+        std::uint16_t type64;
+        std::uint16_t type32;
+    };
+    for (const Case& expected : std::vector<Case>{{"debian", 96, 95},
+                                                  {"ubuntu", 94, 93},
+                                                  {"rhel", 80, 79},
+                                                  {"centos", 107, 106},
+                                                  {"ol", 109, 108},
+                                                  {"sles", 85, 84},
+                                                  {"opensuse-leap", 83, 82},
+                                                  {"arch", 101, 36}}) {
+        EXPECT_EQ(OperatingSystemProvider::osTypeOf(expected.id, "x86_64"), expected.type64);
+        EXPECT_EQ(OperatingSystemProvider::osTypeOf(expected.id, "armv7l"), expected.type32);
+    }
+    EXPECT_EQ(OperatingSystemProvider::osTypeOf(std::nullopt, "x86_64"), 101);
+    EXPECT_EQ(OperatingSystemProvider::osTypeOf("debian", std::nullopt), std::nullopt);
+}
+
+TEST_F(ProvidersTest, processors) {
+    for (const char* cpu : {"cpu0", "cpu1"}) {
+        const std::string base = std::string("sys/devices/system/cpu/") + cpu;
+        tree.file(base + "/topology/physical_package_id", cpu[3] == '0' ? "0\n" : "3\n")
+            .file(base + "/topology/core_id", "0\n")
+            .file(base + "/cpufreq/cpuinfo_max_freq", "3600000\n");
+    }
+    const std::string longName(80, 'x');
+    tree.file("proc/cpuinfo",
+              "processor: 0\nvendor_id: AuthenticAMD\nmodel name: AMD EPYC\n"
+              "stepping: 1\ncpu MHz: 2596.142\nflags: lm\n\nprocessor: 1\n"
+              "model name: " +
+                  longName + "\n");
+    const auto instances = all(ProcessorProvider(tree.paths()).enumerate());
+    ASSERT_EQ(instances.size(), 2U);
+    EXPECT_EQ(textOf(instances[0], "DeviceID"), "CPU0");
+    EXPECT_EQ(textOf(instances[0], "SystemName"), "node7");
+    EXPECT_EQ(textOf(instances[0], "Family"), "1");
+    EXPECT_EQ(textOf(instances[0], "OtherFamilyDescription"), "AMD EPYC");
+    EXPECT_EQ(textOf(instances[0], "MaxClockSpeed"), "3600");
+    EXPECT_EQ(textOf(instances[0], "CurrentClockSpeed"), "2596");
+    EXPECT_EQ(textOf(instances[0], "DataWidth"), "64");
+    EXPECT_EQ(textOf(instances[0], "Stepping"), "1");
+    EXPECT_EQ(textOf(instances[0], "CPUStatus"), "1");
+    EXPECT_EQ(textOf(instances[0], "NumberOfEnabledCores"), "1");
+    EXPECT_EQ(textOf(instances[0], "NumberOfEnabledThreads"), "1");
+    EXPECT_EQ(textOf(instances[0], "Manufacturer"), "AuthenticAMD");
+    EXPECT_EQ(textOf(instances[1], "DeviceID"), "CPU3");
+    EXPECT_EQ(textOf(instances[1], "Model"), longName);
+    EXPECT_EQ(textOf(instances[1], "OtherFamilyDescription"), longName.substr(0, 64));
+    EXPECT_EQ(textOf(instances[1], "CurrentClockSpeed"), "null");
+    EXPECT_EQ(textOf(instances[1], "Manufacturer"), "null");
+}
+
+TEST_F(ProvidersTest, processorsOfAMachineThatTellsNothing) {
+    EXPECT_THROW(ProcessorProvider(tree.paths()).enumerate(), ProviderError);
+}
+
+TEST_F(ProvidersTest, localFileSystems) {
+    tree.file("proc/self/mountinfo",
+              "1 0 8:1 / / rw - ext4 /dev/sda1 rw\n"
+              "2 1 8:2 / /huge rw - btrfs /dev/sdb rw\n"
+              "3 1 11:0 / /media/my\\040cd ro - iso9660 /dev/sr0 ro\n"
+              "4 1 0:40 / /tmp rw - tmpfs tmpfs rw\n"
+              "5 1 0:41 / /home rw - nfs4 server:/home rw\n");
+    const auto instances = all(LocalFileSystemProvider(tree.paths(), calls).enumerate());
+    ASSERT_EQ(instances.size(), 4U);
+    EXPECT_EQ(textOf(instances[0], "Name"), "/");
+    EXPECT_EQ(textOf(instances[0], "Device"), "/dev/sda1");
+    EXPECT_EQ(textOf(instances[0], "BlockSize"), "4096");
+    EXPECT_EQ(textOf(instances[0], "FileSystemSize"), "10737418240");
+    EXPECT_EQ(textOf(instances[0], "FileSystemSizeMB"), "10240");
+    EXPECT_EQ(textOf(instances[0], "AvailableSpaceMB"), "5120");
+    EXPECT_EQ(textOf(instances[0], "TotalInodes"), "655360");
+    EXPECT_EQ(textOf(instances[0], "FreeInodes"), "600000");
+    EXPECT_EQ(textOf(instances[0], "ReadOnly"), "FALSE");
+    EXPECT_EQ(textOf(instances[0], "PersistenceType"), "2");
+    // 2^72 bytes do not fit 64 bits, 4 GiB do.
+    EXPECT_EQ(textOf(instances[1], "FileSystemSize"), "null");
+    EXPECT_EQ(textOf(instances[1], "FileSystemSizeMB"), "null");
+    EXPECT_EQ(textOf(instances[1], "AvailableSpaceMB"), "4096");
+    EXPECT_EQ(textOf(instances[1], "TotalInodes"), "null");
+    EXPECT_EQ(textOf(instances[2], "Name"), "/media/my cd");
+    EXPECT_EQ(textOf(instances[2], "ReadOnly"), "TRUE");
+    EXPECT_EQ(textOf(instances[2], "PersistenceType"), "4");
+    EXPECT_EQ(textOf(instances[2], "FileSystemSize"), "null");
+    EXPECT_EQ(textOf(instances[3], "PersistenceType"), "3");
+}
+
+TEST_F(ProvidersTest, fileSystemsOfAMachineWithoutAMountTable) {
+    EXPECT_THROW(LocalFileSystemProvider(tree.paths(), calls).enumerate(), ProviderError);
+}
+
+TEST_F(ProvidersTest, ethernetPorts) {
+    const auto port = [this](const std::string& name, const char* state, const char* flags) {
+        const std::string base = "sys/class/net/" + name;
+        tree.file(base + "/type", "1\n")
+            .file(base + "/operstate", state)
+            .file(base + "/flags", flags)
+            .directory(base + "/device");
+    };
+    port("enp1s0", "up\n", "0x1003\n");
+    tree.file("sys/class/net/enp1s0/address", "52:54:00:ab:cd:ef\n")
+        .file("sys/class/net/enp1s0/addr_assign_type", "0\n")
+        .file("sys/class/net/enp1s0/mtu", "1500\n")
+        .file("sys/class/net/enp1s0/speed", "10000\n")
+        .file("sys/class/net/enp1s0/duplex", "full\n");
+    port("enp2s0", "down\n", "0x1003\n");
+    tree.file("sys/class/net/enp2s0/address", "52:54:00:ab:cd:f0\n")
+        .file("sys/class/net/enp2s0/addr_assign_type", "3\n")
+        .file("sys/class/net/enp2s0/speed", "-1\n");
+    port("enp3s0", "down\n", "0x1002\n");
+    tree.file("sys/class/net/lo/type", "772\n");
+    const auto instances = all(EthernetPortProvider(tree.paths()).enumerate());
+    ASSERT_EQ(instances.size(), 3U);
+    EXPECT_EQ(textOf(instances[0], "DeviceID"), "enp1s0");
+    EXPECT_EQ(textOf(instances[0], "PermanentAddress"), "525400ABCDEF");
+    EXPECT_EQ(textOf(instances[0], "NetworkAddresses"), "525400ABCDEF ");
+    EXPECT_EQ(textOf(instances[0], "Speed"), "10000000000");
+    EXPECT_EQ(textOf(instances[0], "SpeedMbps"), "10000");
+    EXPECT_EQ(textOf(instances[0], "FullDuplex"), "TRUE");
+    EXPECT_EQ(textOf(instances[0], "LinkTechnology"), "2");
+    EXPECT_EQ(textOf(instances[0], "ActiveMaximumTransmissionUnit"), "1500");
+    EXPECT_EQ(textOf(instances[0], "OperationalStatus"), "2 ");
+    EXPECT_EQ(textOf(instances[0], "EnabledState"), "2");
+    EXPECT_EQ(textOf(instances[1], "PermanentAddress"), "null");
+    EXPECT_EQ(textOf(instances[1], "NetworkAddresses"), "525400ABCDF0 ");
+    EXPECT_EQ(textOf(instances[1], "Speed"), "null");
+    EXPECT_EQ(textOf(instances[1], "SpeedMbps"), "null");
+    EXPECT_EQ(textOf(instances[1], "FullDuplex"), "null");
+    EXPECT_EQ(textOf(instances[1], "OperationalStatus"), "10 ");
+    EXPECT_EQ(textOf(instances[1], "EnabledState"), "6");
+    EXPECT_EQ(textOf(instances[2], "EnabledState"), "3");
+}
+
+TEST_F(ProvidersTest, portsOfAMachineWithoutNetwork) {
+    EXPECT_THROW(EthernetPortProvider(tree.paths()).enumerate(), ProviderError);
+    tree.directory("sys/class/net");
+    EXPECT_TRUE(all(EthernetPortProvider(tree.paths()).enumerate()).empty());
+}
+
+TEST(CimTime, writesLocalTimeWithItsOffset) {
+    EXPECT_EQ(utf8Of(cimTimeOf(0, 0)->toString()), "19700101000000.000000+000");
+    EXPECT_EQ(utf8Of(cimTimeOf(0, -90)->toString()), "19691231223000.000000-090");
+    EXPECT_EQ(utf8Of(cimTimeOf(253402300799, 0)->toString()), "99991231235959.000000+000");
+    EXPECT_FALSE(cimTimeOf(253402300800, 0));
+    EXPECT_FALSE(cimTimeOf(253402300799, 1));
+    EXPECT_FALSE(cimTimeOf(INT64_MAX, 60));
+    EXPECT_FALSE(cimTimeOf(0, 1000));
+}
+
+std::set<std::string> propertyNames(const Pegasus::CIMConstInstance& instance) {
+    std::set<std::string> names;
+    for (Pegasus::Uint32 i = 0; i < instance.getPropertyCount(); ++i)
+        names.insert(utf8Of(instance.getProperty(i).getName().getString()));
+    return names;
+}
+
+/// What is served is declared with the same type, and what is declared is served.
+TEST_F(ProvidersTest, serveWhatTheSchemaDeclares) {
+    tree.file("proc/cpuinfo", "processor: 0\n")
+        .file("proc/self/mountinfo", "1 0 8:1 / / rw - ext4 /dev/sda1 rw\n")
+        .file("sys/class/net/eth0/type", "1\n")
+        .directory("sys/class/net/eth0/device");
+    ClassRepository repository;
+    const Pegasus::CIMNamespaceName nameSpace("root/cimv2");
+    MofCompiler(repository, nameSpace)
+        .compileFile(std::filesystem::path(SCHEMA_DIR) / "cimomd.mof");
+    const ProviderList providers = makeProviders(tree.paths(), calls);
+    ASSERT_EQ(providers.size(), 5U);
+    for (const auto& provider : providers) {
+        const auto* declared = repository.findClass(nameSpace, provider->className());
+        ASSERT_NE(declared, nullptr) << provider->className();
+        const auto instances = all(provider->enumerate());
+        ASSERT_FALSE(instances.empty()) << provider->className();
+        const CIMInstance& instance = instances[0];
+        EXPECT_EQ(utf8Of(instance.getClassName().getString()), provider->className());
+        std::set<std::string> declaredNames;
+        for (Pegasus::Uint32 i = 0; i < declared->getPropertyCount(); ++i) {
+            const Pegasus::CIMConstProperty property = declared->getProperty(i);
+            const std::string name = utf8Of(property.getName().getString());
+            declaredNames.insert(name);
+            const Pegasus::Uint32 index = instance.findProperty(property.getName());
+            if (index == Pegasus::PEG_NOT_FOUND)
+                continue;
+            const Pegasus::CIMConstProperty served =
+                Pegasus::CIMConstInstance(instance).getProperty(index);
+            EXPECT_EQ(served.getType(), property.getType()) << name;
+            EXPECT_EQ(served.isArray(), property.isArray()) << name;
+        }
+        EXPECT_EQ(propertyNames(instance), declaredNames) << provider->className();
+    }
+}
+
+}  // namespace
+}  // namespace cimomd

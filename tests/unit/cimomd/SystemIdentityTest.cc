@@ -1,0 +1,78 @@
+#include "system/SystemIdentity.h"
+
+#include <gtest/gtest.h>
+
+#include <stdexcept>
+
+#include "RecordedTree.h"
+#include "system/FirmwareText.h"
+#include "system/RecordedSystemCalls.h"
+
+namespace cimomd {
+namespace {
+
+TEST(FirmwareText, knowsPlaceholders) {
+    for (const char* text :
+         {"To be filled by O.E.M.", " default STRING ", "0000", "XXXXXX", "........", "", "  ",
+          "00000000-0000-0000-0000-000000000000", "FFFFFFFF-FFFF-FFFF-ffff-ffffffffffff", "N/A",
+          "None", "0123456789", "INVALID"})
+        EXPECT_TRUE(isPlaceholder(text)) << text;
+    for (const char* text : {"Dell Inc.", "5", "00001", "None of these", "4C4C4544-0042"})
+        EXPECT_FALSE(isPlaceholder(text)) << text;
+}
+
+TEST(SystemIdentity, readsTheFirmwaresTexts) {
+    RecordedTree tree;
+    tree.file("sys/class/dmi/id/sys_vendor", "Dell Inc.\n")
+        .file("sys/class/dmi/id/product_name", "OptiPlex 7010 \n")
+        .file("sys/class/dmi/id/product_version", "Not Specified\n")
+        .file("sys/class/dmi/id/product_serial", "ABC1234\n")
+        .file("sys/class/dmi/id/product_uuid", "4c4c4544-0042-3510-8052-b4c04f4e3432\n")
+        .file("etc/machine-id", "3d1219c7c4c5404aaa1f6d2a48adfda4\n");
+    const SystemIdentity identity = readSystemIdentity(tree.paths());
+    EXPECT_EQ(identity.manufacturer, "Dell Inc.");
+    EXPECT_EQ(identity.model, "OptiPlex 7010");
+    EXPECT_EQ(identity.version, std::nullopt);
+    EXPECT_EQ(identity.serialNumber, "ABC1234");
+    EXPECT_EQ(identity.uuid, "4c4c4544-0042-3510-8052-b4c04f4e3432");
+    EXPECT_EQ(identity.machineId, "3d1219c7c4c5404aaa1f6d2a48adfda4");
+}
+
+TEST(SystemIdentity, fallsBackOnTheDeviceTree) {
+    RecordedTree tree;
+    tree.file("proc/device-tree/model", std::string_view("Raspberry Pi 4 Model B\0", 23))
+        .file("proc/device-tree/serial-number", std::string_view("10000000abcdef01\0", 17));
+    const SystemIdentity identity = readSystemIdentity(tree.paths());
+    EXPECT_EQ(identity.manufacturer, std::nullopt);
+    EXPECT_EQ(identity.model, "Raspberry Pi 4 Model B");
+    EXPECT_EQ(identity.serialNumber, "10000000abcdef01");
+}
+
+TEST(SystemIdentity, alwaysHasAHostName) {
+    RecordedTree tree;
+    EXPECT_EQ(readHostName(tree.paths()), "localhost");
+    tree.file("proc/sys/kernel/hostname", "(none)\n");
+    EXPECT_EQ(readHostName(tree.paths()), "localhost");
+    tree.file("proc/sys/kernel/hostname", "node7.example.org\n");
+    EXPECT_EQ(readHostName(tree.paths()), "node7.example.org");
+}
+
+TEST(SystemPaths, refusesToNameAPathWithoutARoot) {
+    EXPECT_THROW(SystemPaths().memory(), std::logic_error);
+    EXPECT_EQ(SystemPaths("/tree").memory(), "/tree/proc/meminfo");
+}
+
+TEST(RecordedSystemCalls, takesSizesFromTheTreeOnly) {
+    RecordedTree tree;
+    tree.file("statvfs",
+              "/ 4096 1000 400 50 20\n/my\\040disk 512 8 4 0 0\nnonsense\n/x a b c d e\n");
+    const RecordedSystemCalls calls(tree.paths());
+    EXPECT_EQ(calls.fileSystemSize("/"), (FileSystemSize{4096, 1000, 400, 50, 20}));
+    EXPECT_EQ(calls.fileSystemSize("/my disk"), (FileSystemSize{512, 8, 4, 0, 0}));
+    EXPECT_EQ(calls.fileSystemSize("/x"), std::nullopt);
+    EXPECT_EQ(calls.fileSystemSize("/proc"), std::nullopt);
+    EXPECT_EQ(calls.machine(), std::nullopt);
+}
+
+}  // namespace
+}  // namespace cimomd
