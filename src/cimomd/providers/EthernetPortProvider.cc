@@ -87,7 +87,6 @@ std::unique_ptr<InstanceStream> EthernetPortProvider::enumerate() const {
 Pegasus::CIMInstance EthernetPortProvider::publish(const std::string& hostName,
                                                    const NetworkInterface& interface) {
     const std::optional<std::string> address = digitsOf(interface.address);
-    const auto mtu = interface.mtuBytes ? std::optional<Uint64>(*interface.mtuBytes) : std::nullopt;
     InstanceBuilder builder(kClassName);
     builder.text("Caption", interface.name, kCaptionLength)
         .text("ElementName", interface.name)
@@ -103,7 +102,7 @@ Pegasus::CIMInstance EthernetPortProvider::publish(const std::string& hostName,
         .texts("NetworkAddresses", address ? std::vector{*address} : std::vector<std::string>())
         .value<Uint16>("LinkTechnology", kLinkTechnologyEthernet)
         .value<Pegasus::Boolean>("FullDuplex", interface.fullDuplex)
-        .value<Uint64>("ActiveMaximumTransmissionUnit", mtu)
+        .value<Uint64>("ActiveMaximumTransmissionUnit", interface.mtuBytes)
         .value<Uint32>("SpeedMbps", narrowed(interface.speedMbps));
     return builder.take();
 }
