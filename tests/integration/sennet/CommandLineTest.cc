@@ -51,6 +51,7 @@ TEST_F(CommandLineTest, RefusesOtherTypes) {
 TEST_F(CommandLineTest, ShowsAWrongTypeLiterally) {
     expectInvalid("%s%n%d%%", "%s%n%d%%");
     expectInvalid("a b\tc\\", "a b\tc\\");
+    expectInvalid("/SMS\xFF\xC3", "/SMS\xFF\xC3");
 }
 
 TEST_F(CommandLineTest, CutsALongWrongTypeToTheMessageBuffer) {

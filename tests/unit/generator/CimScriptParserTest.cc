@@ -317,6 +317,11 @@ TEST_F(CimScriptParserTest, SplitsPropertyListsAtCommasAndSpaces) {
     EXPECT_EQ(properties("Name, "), Texts{"Name"});
     EXPECT_EQ(properties(","), Texts{});
     EXPECT_EQ(properties("Name[1]"), Texts{"Name"});
+    // U+012C and U+0120 end in the bytes of the comma and the blank.
+    EXPECT_EQ(properties("a\xC4\xAC"
+                         "b\xC4\xA0"
+                         "c"),
+              (Texts{"a", "b", "c"}));
 }
 
 TEST_F(CimScriptParserTest, GivesAnEmptyListToAClassWithoutOne) {

@@ -280,6 +280,16 @@ TEST_F(QveSennetConverterTest, WritesTheValueLine) {
     EXPECT_EQ(line(property("P", text("x")), 1), head + "\"\"");
 }
 
+TEST_F(QveSennetConverterTest, ReplacesHalfACharacterLeftByACut) {
+    // U+1F600 takes two units, and the second is beyond the thirtieth.
+    const std::string kept(29, 'x');
+    properties.set("CIM_X.P", kept + "\xF0\x9F\x98\x80");
+    const std::string mif = convert<QveSennetConverter>(
+        "[CIM]\nG[0]=CIM_X\nA[0]=P\n",
+        {{cimClass("CIM_X", {}), {cimInstance("CIM_X", {property("P", text("v"))})}}});
+    EXPECT_NE(mif.find("         Name = \"" + kept + "\xEF\xBF\xBD\"\r\n"), std::string::npos);
+}
+
 class QveLumoSennetConverterTest : public ConverterFixture {
   protected:
     QveLumoSennetConverter converter{outputName(), properties, 18};

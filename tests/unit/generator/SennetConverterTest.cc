@@ -238,6 +238,20 @@ TEST_F(SennetConverterTest, LooksPropertyNamesUpByTheClassNameOfTheServer) {
               document(attribute("Name", 2, "String(64)", "\"a\""), {"{ 1, \"a\"}"}));
 }
 
+TEST_F(SennetConverterTest, GivesAClassNamedTwiceThePropertiesOfItsFirstSlot) {
+    EXPECT_EQ(mif("[DEFAULT]\ntitle=T\n[CIM]\nG[0]=CIM_Fan\nA[0]=Name\nG[1]=CIM_Fan\nA[1]=Lost\n",
+                  {{fanClass, {fan("a")}}, {fanClass, {fan("b")}}}),
+              document(attribute("Name", 2, "String(64)", "\"a\"") +
+                           attribute("Name3", 3, "String(64)", "\"b\""),
+                       {"{ 1, \"a\",\"b\"}"}));
+}
+
+TEST_F(SennetConverterTest, WritesNoPropertiesOfAClassThatTheScriptDoesNotName) {
+    EXPECT_EQ(
+        mif("[DEFAULT]\ntitle=T\n[CIM]\nG[0]=CIM_Other\nA[0]=Name\n", {{fanClass, {fan("a")}}}),
+        document("", {"{ 1, }"}));
+}
+
 TEST_F(SennetConverterTest, SkipsAClassWithoutPropertyNames) {
     const CIMClass bare = cimClass("CIM_Y", {property("P", null(CIMTYPE_UINT8))});
     const CIMInstance y = cimInstance("CIM_Y", {property("P", CIMValue(Uint8(1)))});
