@@ -42,8 +42,7 @@ char* skipSpace(char* p, const char* end) {
 
 }  // namespace
 
-XmlTokenizer::XmlTokenizer(ByteSource& source, Limits limits)
-    : window(source, limits.tokenSize), limits(limits) {}
+XmlTokenizer::XmlTokenizer(ByteSource& source, Limits limits) : window(source), limits(limits) {}
 
 XmlTokenizer::Token XmlTokenizer::next() {
     holding = false;
@@ -133,14 +132,15 @@ XmlTokenizer::Token XmlTokenizer::readText() {
     for (;;) {
         pos = skipTo(kTextStops, window.data(), pos);
         const char stop = *at(pos);
-        if (stop == '<') {
-            break;
-        }
         if (stop == '\0') {
             if (!more()) {
                 failTruncated();
             }
             continue;
+        }
+        checkSize();
+        if (stop == '<') {
+            break;
         }
         if (stop == '>') {
             if (view(tokenStart, pos).ends_with("]]")) {
@@ -153,7 +153,6 @@ XmlTokenizer::Token XmlTokenizer::readText() {
     }
     textBegin = tokenStart;
     textEnd = pos;
-    checkSize();
     if (!isPlain) {
         const char* decodedEnd = decode(at(textBegin), at(textEnd), XmlTextKind::Content);
         textEnd = static_cast<std::size_t>(decodedEnd - window.data());
@@ -302,6 +301,7 @@ void XmlTokenizer::scanTag() {
             }
             continue;
         }
+        checkSize();
         if (stop == '<') {
             failAt(at(pos), "\"<\" stands inside a tag; expected \">\" or \"&lt;\"");
         }
@@ -334,7 +334,8 @@ void XmlTokenizer::scanTo(std::string_view terminator) {
     checkSize();
 }
 
-// The window may hold more than the limit, so a token that is there as a whole is checked too.
+// Called before anything else is found wrong, so that the outcome does not depend on how much of a
+// token that is too long arrives at once.
 void XmlTokenizer::checkSize() const {
     if (pos - tokenStart > limits.tokenSize) {
         fail(XmlError::Kind::Limit, offset(),
@@ -418,6 +419,7 @@ char* XmlTokenizer::decode(char* begin, const char* end, XmlTextKind kind) const
 }
 
 bool XmlTokenizer::more() {
+    checkSize();
     std::size_t removed = 0;
     const bool extended = window.extend(holding ? heldBegin : tokenStart, removed);
     pos -= removed;

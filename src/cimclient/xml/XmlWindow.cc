@@ -16,18 +16,12 @@ std::string hexadecimal(std::uint8_t octet) {
 
 }  // namespace
 
-XmlWindow::XmlWindow(ByteSource& source, std::size_t maxToken)
-    : source(source),
-      maxToken(maxToken),
-      capacity(kInitialCapacity),
-      buffer(new char[capacity + 1]) {
+XmlWindow::XmlWindow(ByteSource& source)
+    : source(source), capacity(kInitialCapacity), buffer(new char[capacity + 1]) {
     buffer[0] = '\0';
 }
 
 bool XmlWindow::extend(std::size_t keepFrom, std::size_t& removed) {
-    if (filled - keepFrom > maxToken) {
-        throwTooLong(keepFrom);
-    }
     removed = makeRoom(keepFrom);
     const std::size_t before = filled;
     while (filled == before) {
@@ -91,12 +85,6 @@ void XmlWindow::accept(std::size_t received) {
         filled += check.goodSize;
     }
     buffer[filled] = '\0';
-}
-
-void XmlWindow::throwTooLong(std::size_t from) const {
-    throw XmlError{XmlError::Kind::Limit, offsetOf(from),
-                   "a tag or text is longer than " + std::to_string(maxToken) +
-                       " octets; at byte " + std::to_string(offsetOf(from))};
 }
 
 void XmlWindow::throwFault() const {

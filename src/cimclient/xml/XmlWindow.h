@@ -19,8 +19,8 @@ namespace Pegasus {
 /// does not depend on the pieces in which the octets arrive.
 class XmlWindow {
   public:
-    /// At most `maxToken` octets are kept at once, beside what one read brings.
-    XmlWindow(ByteSource& source, std::size_t maxToken);
+    /// The source must outlive the window.
+    explicit XmlWindow(ByteSource& source);
 
     /// The octets; data()[size()] is NUL, and no other is. Valid until extend().
     char* data() { return buffer.get(); }
@@ -30,20 +30,18 @@ class XmlWindow {
     /// Octets of the document before data()[index].
     std::uint64_t offsetOf(std::size_t index) const { return base + index; }
 
-    /// Reads at least one octet more; false when the document has ended. Either way octets before
-    /// data()[keepFrom] may have gone: `removed` says by how many the others moved forward.
-    /// Throws XmlError.
+    /// Reads at least one octet more, making the window larger when need be; false when the
+    /// document has ended. Either way octets before data()[keepFrom] may have gone: `removed` says
+    /// by how many the others moved forward. Throws XmlError.
     bool extend(std::size_t keepFrom, std::size_t& removed);
 
   private:
     std::size_t makeRoom(std::size_t keepFrom);
     void grow();
     void accept(std::size_t received);
-    [[noreturn]] void throwTooLong(std::size_t from) const;
     [[noreturn]] void throwFault() const;
 
     ByteSource& source;
-    std::size_t maxToken;
     std::size_t capacity;
     std::unique_ptr<char[]> buffer;
     std::size_t filled = 0;

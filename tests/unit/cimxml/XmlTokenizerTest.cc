@@ -301,6 +301,28 @@ TEST(XmlTokenizerLimits, TokensAreBounded) {
     }
 }
 
+// A fuzzer found a tag that was refused for its length when it arrived octet by octet, and for a
+// "<" behind the limit when it arrived at once.
+TEST(XmlTokenizerLimits, AFaultBehindTheLimitDoesNotCount) {
+    XmlTokenizer::Limits limits;
+    limits.tokenSize = 20;
+    const std::string filler(30, 'x');
+    for (const std::string& document :
+         {"<a " + filler + "<", "<a b='" + filler + "<", "<a>" + filler + "]]>", "<a " + filler,
+          "<!--" + filler + "-- -->", "<a>" + filler + "\xFF"}) {
+        for (const std::size_t pieceSize : {std::size_t{1}, std::size_t{7}, document.size()}) {
+            MemorySource source(document, pieceSize);
+            XmlTokenizer tokenizer(source, limits);
+            try {
+                describe(tokenizer);
+                ADD_FAILURE() << document;
+            } catch (const XmlError& error) {
+                EXPECT_EQ(error.kind, Kind::Limit) << document << ": " << error.message;
+            }
+        }
+    }
+}
+
 TEST(XmlTokenizerLimits, ShortTokensPassWhateverTheirSum) {
     XmlTokenizer::Limits limits;
     limits.tokenSize = 1000;
