@@ -52,8 +52,9 @@ class MariaDb:
     def __enter__(self):
         data = self.directory / "data"
         user = pwd.getpwuid(os.getuid()).pw_name
-        installed = run(["mariadb-install-db", "--no-defaults", "--auth-root-authentication-method=normal",
-                         "--skip-test-db", "--user=" + user, "--datadir=%s" % data])
+        installed = run(["mariadb-install-db", "--no-defaults", "--skip-test-db",
+                         "--auth-root-authentication-method=normal", "--user=" + user,
+                         "--datadir=%s" % data])
         if installed.returncode != 0:
             raise EngineError(installed.stdout + installed.stderr)
         log = self.directory / "log"
@@ -79,13 +80,13 @@ class MariaDb:
         self.must("", "create database %s character set latin1" % database)
 
     def client(self, database):
-        """The command that runs the statements on its standard input, past those that fail."""
-        return ["mariadb", "--no-defaults", "--socket=%s" % self.socket, "--user=root", "--force",
-                "--batch", "--skip-column-names", "--default-character-set=latin1"
+        """The command that runs the statements it is given."""
+        return ["mariadb", "--no-defaults", "--socket=%s" % self.socket, "--user=root", "--batch",
+                "--skip-column-names", "--default-character-set=latin1"
                 ] + ([database] if database else [])
 
     def execute(self, database, sql):
-        return run(self.client(database), input=sql)
+        return run(self.client(database) + ["--force"], input=sql)
 
     def must(self, database, sql):
         result = self.execute(database, sql)
@@ -96,11 +97,15 @@ class MariaDb:
     def errors(self, database, sql):
         """The errors of a script's statements, in order, each without its place."""
         lines = self.execute(database, sql).stderr.splitlines()
-        return [line.split(": ", 1)[1].replace("'%s." % database, "'") for line in lines if line]
+        return [line.split(": ", 1)[1].replace("'%s." % database, "'")
+                for line in lines if line.startswith("ERROR ")]
 
     def missing(self, table, view):
         """What the drops of a script meet in a schema that has neither."""
         return ["Unknown table '%s'" % table, "Unknown VIEW: '%s'" % view]
+
+    def repeats(self, column):
+        return "Duplicate column name '%s'" % column
 
     def columns(self, database, table):
         sql = ("select column_name, character_maximum_length from information_schema.columns"
@@ -129,7 +134,9 @@ class PostgreSql:
     def __init__(self, directory):
         self.directory = pathlib.Path(directory)
         self.server = None
-        self.account = ["runuser", "-u", "postgres", "--"] if os.getuid() == 0 else []
+        # setpriv, unlike su and runuser, becomes the program: signals reach the engine itself.
+        self.account = ["setpriv", "--reuid=postgres", "--regid=postgres", "--init-groups"
+                        ] if os.getuid() == 0 else []
         programs = sorted(pathlib.Path("/usr/lib/postgresql").glob("*/bin"))
         self.programs = programs[-1] if programs else pathlib.Path("/usr/bin")
 
@@ -168,7 +175,8 @@ class PostgreSql:
                 "-h", str(self.directory), "-d", database]
 
     def execute(self, database, sql):
-        environment = dict(os.environ, PGCLIENTENCODING="LATIN1", PGOPTIONS="-c client_min_messages=error")
+        environment = dict(os.environ, PGCLIENTENCODING="LATIN1",
+                           PGOPTIONS="-c client_min_messages=error")
         return run(self.client(database), input=sql, env=environment)
 
     def must(self, database, sql):
@@ -184,6 +192,9 @@ class PostgreSql:
     def missing(self, table, view):
         return ['table "%s" does not exist' % table.lower(),
                 'view "%s" does not exist' % view.lower()]
+
+    def repeats(self, column):
+        return 'column "%s" specified more than once' % column.lower()
 
     def columns(self, database, table):
         sql = ("select column_name, character_maximum_length from information_schema.columns"
