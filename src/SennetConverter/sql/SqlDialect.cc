@@ -2,6 +2,18 @@
 
 namespace Pegasus {
 
+namespace {
+
+// The computer table and its key have short names in Lumo databases only.
+constexpr char kViewColumns[] =
+    "   COMPUTER_SYSTEM.QVE_OBJECT_ID,\r\n"
+    "   COMPUTER_SYSTEM.QVE_OBJECT_LABEL,\r\n";
+constexpr char kFromClause[] = ".*\r\nfrom\r\n   COMPUTER_SYSTEM, KWX_";
+constexpr char kWhereClause[] = "where\r\n   COMPUTER_SYSTEM.HARDWARE_SYSTEM_ID =\r\n   KWX_";
+constexpr char kJoinColumn[] = ".HARDWARE_SYSTEM_ID";
+
+}  // namespace
+
 const SqlDialect kLumoDialect = {
     .dropTableEnd = ";\r\n\r\n",
     .fixedColumns =
@@ -40,12 +52,10 @@ const SqlDialect kTransactSqlDialect = {
         "primary key ( HARDWARE_SYSTEM_ID, CONFIG_CHANGE_TYPE, Row_Index )\r\n"
         "go\r\n\r\n",
     .dropViewEnd = "\r\ngo\r\n\r\n",
-    .viewColumns =
-        "   COMPUTER_SYSTEM.QVE_OBJECT_ID,\r\n"
-        "   COMPUTER_SYSTEM.QVE_OBJECT_LABEL,\r\n",
-    .fromClause = ".*\r\nfrom\r\n   COMPUTER_SYSTEM, KWX_",
-    .whereClause = "where\r\n   COMPUTER_SYSTEM.HARDWARE_SYSTEM_ID =\r\n   KWX_",
-    .joinColumn = ".HARDWARE_SYSTEM_ID",
+    .viewColumns = kViewColumns,
+    .fromClause = kFromClause,
+    .whereClause = kWhereClause,
+    .joinColumn = kJoinColumn,
     .insertOpener = "\r\ngo\r\n\r\ninsert into QUERY_VIEWS (VIEW_NAME) values ('KWX_V",
     .insertEnd = "')\r\ngo\r\n",
 };
@@ -67,12 +77,10 @@ const SqlDialect kOracleDialect = {
         "   Row_Index\r\n",
     .primaryKey = "( primary key ( HARDWARE_SYSTEM_ID, CONFIG_CHANGE_TYPE, Row_Index ));\r\n\r\n",
     .dropViewEnd = ";\r\n\r\n",
-    .viewColumns =
-        "   COMPUTER_SYSTEM.QVE_OBJECT_ID,\r\n"
-        "   COMPUTER_SYSTEM.QVE_OBJECT_LABEL,\r\n",
-    .fromClause = ".*\r\nfrom\r\n   COMPUTER_SYSTEM, KWX_",
-    .whereClause = "where\r\n   COMPUTER_SYSTEM.HARDWARE_SYSTEM_ID =\r\n   KWX_",
-    .joinColumn = ".HARDWARE_SYSTEM_ID",
+    .viewColumns = kViewColumns,
+    .fromClause = kFromClause,
+    .whereClause = kWhereClause,
+    .joinColumn = kJoinColumn,
     .insertOpener = ";\r\n\r\ninsert into QUERY_VIEWS (VIEW_NAME) values ('KWX_V",
     .insertEnd = "');\r\n",
 };
