@@ -1,0 +1,96 @@
+// The expected outputs of the generator, read strictly: each product's files leave the grammar in
+// the places named here and nowhere else.
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include "support/Files.h"
+#include "support/mif/MifReader.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+using namespace Mif;
+using ::testing::HasSubstr;
+using ::testing::IsEmpty;
+using ::testing::Not;
+
+std::vector<fs::path> expectedFiles(const std::string& product) {
+    std::vector<fs::path> files;
+    for (const auto& folder : fs::directory_iterator(fs::path(TEST_SOURCE_DIR) / "golden")) {
+        const fs::path expected = folder.path() / "expected" / product;
+        if (!fs::is_directory(expected)) {
+            continue;
+        }
+        for (const auto& file : fs::directory_iterator(expected)) {
+            if (file.path().extension() == ".mif") {
+                files.push_back(file.path());
+            }
+        }
+    }
+    return files;
+}
+
+std::string refusal(const std::string& text, Tolerances tolerances) {
+    try {
+        MifReader(tolerances).read(text);
+    } catch (const Error& error) {
+        return error.what();
+    }
+    return "accepted";
+}
+
+/// A reference is cut to 32 characters once escaped. The one of the workstation loses its closing
+/// quote by that, and the quote that ends the literal counts as escaped in its place.
+std::string withWholeReferences(std::string text) {
+    const std::string cut = "CIM_ComputerSystem.Name=\\\"pc123\\\"";
+    for (std::size_t at = text.find(cut); at != std::string::npos; at = text.find(cut, at + 1)) {
+        text.insert(at + cut.size(), "\"");
+    }
+    return text;
+}
+
+void expectReadable(const std::string& product, Tolerances tolerances) {
+    const std::vector<fs::path> files = expectedFiles(product);
+    EXPECT_THAT(files, Not(IsEmpty()));
+    for (const fs::path& file : files) {
+        EXPECT_EQ(refusal(withWholeReferences(support::readFile(file)), tolerances), "accepted")
+            << file;
+    }
+}
+
+TEST(GoldenFilesTest, SmsKeepsToTheGrammar) {
+    expectReadable("SMS", {Tolerance::RawLineEnds});
+}
+
+TEST(GoldenFilesTest, LanDeskWritesIntegersWhereItDeclaresText) {
+    expectReadable("LD", {Tolerance::RawLineEnds, Tolerance::IntegersAsText});
+}
+
+TEST(GoldenFilesTest, CaKeepsBackslashesPlain) {
+    expectReadable("CA", {Tolerance::RawLineEnds, Tolerance::PlainBackslashes});
+}
+
+TEST(GoldenFilesTest, QveDeclaresAndWritesTextOnly) {
+    for (const fs::path& file : expectedFiles("QVE")) {
+        const Tolerances tolerances =
+            file.filename() == "kwinvlumo.mif"
+                ? Tolerances{Tolerance::RawLineEnds, Tolerance::RepeatedNames}
+                : Tolerances{Tolerance::RawLineEnds};
+        EXPECT_EQ(refusal(support::readFile(file), tolerances), "accepted") << file;
+    }
+    EXPECT_THAT(expectedFiles("QVE"), Not(IsEmpty()));
+}
+
+TEST(GoldenFilesTest, ACutReferenceMakesAFileUnreadable) {
+    const fs::path cpu =
+        fs::path(TEST_SOURCE_DIR) / "golden" / "workstation" / "expected" / "SMS" / "cpu.mif";
+    EXPECT_THAT(refusal(support::readFile(cpu), {Tolerance::RawLineEnds}),
+                HasSubstr("line end in a literal"));
+}
+
+}  // namespace
