@@ -67,7 +67,7 @@ CIMNamespaceName PathReader::readLocalNamespacePath() {
 }
 
 CIMName PathReader::readClassName() {
-    const CIMName name = context.requiredName(reader, "NAME");
+    CIMName name = context.requiredName(reader, "NAME");
     reader.readEnd();
     return name;
 }
@@ -124,7 +124,7 @@ CIMKeyBinding PathReader::readKeyValue(const CIMName& name) {
 
 CIMObjectPath PathReader::readReference() {
     reader.requireChild("a path");
-    const CIMObjectPath path = readAnyPath();
+    CIMObjectPath path = readAnyPath();
     reader.readEnd();
     return path;
 }
