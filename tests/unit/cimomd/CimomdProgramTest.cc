@@ -1,7 +1,9 @@
 // The whole program, over its sockets.
 
+#include <fcntl.h>
 #include <gtest/gtest.h>
 #include <sys/socket.h>
+#include <sys/wait.h>
 #include <unistd.h>
 
 #include <array>
@@ -198,6 +200,31 @@ TEST_F(CimomdProgramTest, servesOneDescriptorAndEndsWithIt) {
     }
     connection.close();
     EXPECT_EQ(server.wait(), 0);
+}
+
+TEST_F(CimomdProgramTest, endsWithTheParentThatStartedIt) {
+    std::array<int, 2> ends{};
+    std::array<int, 2> parentsLife{};
+    ASSERT_EQ(::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends.data()), 0);
+    ASSERT_EQ(::pipe2(parentsLife.data(), O_CLOEXEC), 0);
+    const pid_t parent = ::fork();
+    if (parent == 0) {
+        ::close(parentsLife[1]);
+        auto* server =
+            new RunningCimomd({"--fd", std::to_string(ends[1]), "--root", machine()}, ends[1]);
+        char byte = 0;
+        ::_exit(::read(parentsLife[0], &byte, 1) == 0 && server != nullptr ? 0 : 1);
+    }
+    ::close(ends[1]);
+    ::close(parentsLife[0]);
+    const Connection connection(ends[0]);
+    connection.send(postOf(systemRequest()));
+    EXPECT_TRUE(has(connection.readAnswer(), "</CIM>"));
+    ::close(parentsLife[1]);
+    int status = 0;
+    EXPECT_EQ(::waitpid(parent, &status, 0), parent);
+    EXPECT_EQ(connection.readToEnd(), "");
+    EXPECT_TRUE(connection.peerHasClosed());
 }
 
 TEST_F(CimomdProgramTest, saysWhatItCannotDo) {

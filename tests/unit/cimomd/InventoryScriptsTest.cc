@@ -30,7 +30,8 @@ std::string textOf(const std::string& name) {
 
 Script scriptOf(const std::string& name) {
     Script script;
-    for (const std::string_view line : linesOf(textOf(name))) {
+    const std::string text = textOf(name);
+    for (const std::string_view line : linesOf(text)) {
         const std::size_t equals = line.find('=');
         const std::string value(equals == std::string_view::npos ? "" : line.substr(equals + 1));
         if (line.substr(0, equals) == "title")
@@ -50,7 +51,8 @@ Script scriptOf(const std::string& name) {
 
 std::map<std::string, std::string> resources() {
     std::map<std::string, std::string> out;
-    for (const std::string_view line : linesOf(textOf("sennet.properties"))) {
+    const std::string text = textOf("sennet.properties");
+    for (const std::string_view line : linesOf(text)) {
         const auto entry = keyValueOf(line, '=');
         if (!entry || line.front() == '#')
             continue;
@@ -61,7 +63,8 @@ std::map<std::string, std::string> resources() {
 
 std::vector<std::string> scriptNames() {
     std::vector<std::string> names;
-    for (const std::string& name : *listDirectory(INVENTORY_DIR)) {
+    const auto listed = listDirectory(INVENTORY_DIR);
+    for (const std::string& name : listed.value()) {
         if (name.size() > 11 && name.substr(name.size() - 11) == ".script.inv")
             names.push_back(name);
     }

@@ -81,6 +81,11 @@ std::string Connection::readAnswer() const {
     return text;
 }
 
+bool Connection::peerHasClosed() const {
+    char byte = 0;
+    return ::recv(descriptor, &byte, 1, MSG_DONTWAIT) == 0;
+}
+
 void Connection::close() {
     if (descriptor >= 0)
         ::close(descriptor);

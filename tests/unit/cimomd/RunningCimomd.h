@@ -24,6 +24,8 @@ class Connection {
     std::string readToEnd() const;
     /// One HTTP answer: up to the end of its chunks, or of its Content-Length.
     std::string readAnswer() const;
+    /// Whether reading finds the end at once: tells a closed connection from a silent one.
+    bool peerHasClosed() const;
     void close();
 
   private:
