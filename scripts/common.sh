@@ -38,7 +38,7 @@ need_packages() {
 
 BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev libcli11-dev
     libfmt-dev)
-TEST_PACKAGES=(libgtest-dev libgmock-dev)
+TEST_PACKAGES=(libgtest-dev libgmock-dev python3 mariadb-server postgresql-15 shellcheck)
 
 # Configures a preset unless that is done, and builds it. What a quiet build prints is shown when
 # it fails.
