@@ -13,7 +13,7 @@ CimConverterList::~CimConverterList() {
 void CimConverterList::addConverter(CimConverter* converter) {
     std::unique_ptr<CimConverter> owned(converter);
     converters.push_back(converter);
-    owned.release();
+    static_cast<void>(owned.release());
 }
 
 int CimConverterList::getNumberOfConverters() const {

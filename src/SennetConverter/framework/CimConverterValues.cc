@@ -59,7 +59,7 @@ Uint64 clampToUnsigned(Integer number) {
 // uint64 shows its low word unsigned; every other type shows its low word signed.
 template <typename Integer>
 Sint64 asPrinted(Integer number) {
-    const auto lowWord = static_cast<Uint32>(number);
+    const auto lowWord = static_cast<Uint32>(static_cast<Uint64>(number));
     if constexpr (std::is_same_v<Integer, Uint64>) {
         return lowWord;
     } else {
