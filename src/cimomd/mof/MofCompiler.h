@@ -21,9 +21,9 @@ class MofCompiler {
     static constexpr std::size_t kMaxIncludeDepth = 16;
     static constexpr std::size_t kMaxFiles = 10000;
 
-    /// `target` must outlive the compiler. Declarations go to `nameSpace` until a pragma names
-    /// another one.
-    MofCompiler(ClassRepository& target, Pegasus::CIMNamespaceName nameSpace);
+    /// `repository` must outlive the compiler. Declarations go to `defaultNamespace` until a pragma
+    /// names another one.
+    MofCompiler(ClassRepository& repository, Pegasus::CIMNamespaceName defaultNamespace);
 
     /// Raises MofError, and leaves the repository as it was, when anything is wrong.
     void compileFile(const std::filesystem::path& path);

@@ -23,7 +23,7 @@ using Pegasus::Uint32;
 }
 
 CIMName requiredClassName(const CimRequest& request) {
-    const CIMName name = request.className("ClassName");
+    CIMName name = request.className("ClassName");
     if (name.isNull())
         fail(Pegasus::CIM_ERR_INVALID_PARAMETER,
              fmt::format("{} needs the parameter ClassName", request.method));

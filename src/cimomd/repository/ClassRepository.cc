@@ -55,8 +55,8 @@ const QualifierDeclaration* ClassRepository::findQualifier(const CIMNamespaceNam
 
 void ClassRepository::addClass(const CIMNamespaceName& nameSpace, CIMClass declared) {
     Namespace& space = namespaces[keyOf(nameSpace)];
-    const CIMName name = declared.getClassName();
-    const CIMName superName = declared.getSuperClassName();
+    const CIMName& name = declared.getClassName();
+    const CIMName& superName = declared.getSuperClassName();
     if (find(space, name) != nullptr)
         throw RepositoryError{CIMName(), CIMName(),
                               fmt::format("class {} again", utf8Of(name.getString())),
