@@ -1,3 +1,4 @@
+# shellcheck shell=bash
 # Functions of ./run, ./test and .ci/run.
 
 step() {
@@ -36,8 +37,10 @@ need_packages() {
     rm -f "$log"
 }
 
+# shellcheck disable=SC2034
 BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev libcli11-dev
     libfmt-dev)
+# shellcheck disable=SC2034
 TEST_PACKAGES=(libgtest-dev libgmock-dev python3 mariadb-server postgresql-15 shellcheck)
 
 # Configures a preset unless that is done, and builds it. What a quiet build prints is shown when
