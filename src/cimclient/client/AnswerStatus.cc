@@ -65,11 +65,10 @@ void checkHead(const HttpAnswer& answer) {
         throw httpError(answer, cimError);
     }
     const std::string* contentType = answer.header().find("Content-Type");
-    if (contentType == nullptr || !isXml(*contentType)) {
+    if (contentType != nullptr && !isXml(*contentType)) {
         throw CIMClientMalformedHTTPException(
-            printableText("The answer's content type is " +
-                          (contentType == nullptr ? "missing" : "\"" + *contentType + "\"") +
-                          "; expected application/xml or text/xml"));
+            printableText("The answer's content type is \"" + *contentType +
+                          "\"; expected application/xml or text/xml"));
     }
 }
 

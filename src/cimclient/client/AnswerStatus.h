@@ -7,8 +7,9 @@
 namespace Pegasus {
 
 /// Throws CIMClientHTTPErrorException unless the status is 200 and there is no CIMError field,
-/// and CIMClientMalformedHTTPException when the body is not said to be XML. The message has the
-/// status line, CIMError and PGErrorDetail.
+/// and CIMClientMalformedHTTPException when the body is said to be something else than XML; an
+/// answer that does not name its content type passes. The message has the status line, CIMError and
+/// PGErrorDetail.
 void checkHead(const HttpAnswer& answer);
 
 /// Throws CIMException when CIMStatusCode stands in the header or in the trailer with a code above

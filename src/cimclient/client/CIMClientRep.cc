@@ -37,6 +37,18 @@ bool saysItHasBody(const HttpAnswer& answer) {
            answer.header().find("Transfer-Encoding") != nullptr;
 }
 
+// The file of the challenge for local authentication, which may stand among others.
+std::optional<std::string> localChallengeFile(const HttpAnswer& answer) {
+    if (answer.status() == kUnauthorized) {
+        for (const std::string* challenge : answer.header().findAll("WWW-Authenticate")) {
+            if (std::optional<std::string> file = challengeFile(*challenge)) {
+                return file;
+            }
+        }
+    }
+    return std::nullopt;
+}
+
 bool wantsToClose(const HttpAnswer& answer) {
     const std::string* option = answer.header().find("Connection");
     return option != nullptr && equalIgnoringCase(*option, "close");
@@ -102,12 +114,7 @@ std::unique_ptr<HttpExchange> CIMClientRep::start(const HttpRequest& request,
 // Changes the request so that it answers the challenge of a refused one. False when the challenge
 // is none that this client may answer.
 bool CIMClientRep::answerChallenge(const HttpExchange& refused, HttpRequest& request) const {
-    const HttpAnswer& answer = refused.answer();
-    const std::string* challenge = answer.header().find("WWW-Authenticate");
-    if (answer.status() != kUnauthorized || challenge == nullptr) {
-        return false;
-    }
-    const std::optional<std::string> file = challengeFile(*challenge);
+    const std::optional<std::string> file = localChallengeFile(refused.answer());
     if (!file.has_value()) {
         return false;
     }
@@ -162,9 +169,12 @@ auto CIMClientRep::perform(const char* method, const CIMNamespaceName& nameSpace
         throw;
     } catch (const CIMClientXmlException&) {
         // A server that fails in the middle of its answer says why after the last chunk.
-        if (current->hasEnded()) {
-            checkReportedStatus(current->answer());
-        }
+        checkReportedStatus(current->answer());
+        throw;
+    } catch (const CIMClientMalformedHTTPException&) {
+        // libcurl gives up at a long line of the trailer, such as a description, which comes after
+        // the code.
+        checkReportedStatus(current->answer());
         throw;
     }
 }

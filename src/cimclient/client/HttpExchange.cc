@@ -105,6 +105,7 @@ void HttpExchange::setOptions(const HttpRequest& request) {
     // A numeric address keeps libcurl from asking a resolver; no connection is made to it.
     setOption(easy, CURLOPT_URL, "http://127.0.0.1/cimom");
     setOption(easy, CURLOPT_HTTP_VERSION, static_cast<long>(CURL_HTTP_VERSION_1_1));
+    setOption(easy, CURLOPT_ERRORBUFFER, details.data());
     setOption(easy, CURLOPT_PROXY, "");
     setOption(easy, CURLOPT_NOSIGNAL, 1L);
     setOption(easy, CURLOPT_TCP_NODELAY, 0L);
@@ -263,7 +264,15 @@ void HttpExchange::throwIfFailed() const {
     const std::string where =
         answer_.isHeadComplete() ? "in the body of its answer" : "before the end of its header";
     throw CIMClientMalformedHTTPException(printableText("The CIM server's HTTP connection failed " +
-                                                        where + ": " + curl_easy_strerror(result)));
+                                                        where + ": " + reasonOfFailure()));
+}
+
+std::string HttpExchange::reasonOfFailure() const {
+    // What libcurl calls lack of memory is, but for that, a line beyond its own limit.
+    if (result == CURLE_OUT_OF_MEMORY) {
+        return "a line is too long, or memory is short";
+    }
+    return details.front() != '\0' ? details.data() : curl_easy_strerror(result);
 }
 
 }  // namespace Pegasus

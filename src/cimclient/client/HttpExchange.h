@@ -6,6 +6,7 @@
 #include <Pegasus/Common/Config.h>
 #include <curl/curl.h>
 
+#include <array>
 #include <cstddef>
 #include <exception>
 #include <string>
@@ -75,6 +76,7 @@ class HttpExchange : public ByteSource {
     void advance();
     void wait() const;
     void throwIfFailed() const;
+    std::string reasonOfFailure() const;
 
     int connection;
     int placeholder = -1;  // what libcurl takes for its socket; it closes that itself
@@ -90,8 +92,9 @@ class HttpExchange : public ByteSource {
     std::size_t pendingStart = 0;
 
     bool ended = false;
-    CURLcode result = CURLE_OK;  // valid when ended
-    std::exception_ptr failure;  // raised in a callback, which must not throw
+    CURLcode result = CURLE_OK;                   // valid when ended
+    std::exception_ptr failure;                   // raised in a callback, which must not throw
+    std::array<char, CURL_ERROR_SIZE> details{};  // what libcurl says beside the result
 
     curl_slist* headerLines = nullptr;
     CURL* easy = nullptr;

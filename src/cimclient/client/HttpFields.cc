@@ -30,4 +30,14 @@ const std::string* HttpFields::find(std::string_view name) const {
     return found == fields.end() ? nullptr : &found->value;
 }
 
+std::vector<const std::string*> HttpFields::findAll(std::string_view name) const {
+    std::vector<const std::string*> values;
+    for (const Field& field : fields) {
+        if (equalIgnoringCase(field.name, name)) {
+            values.push_back(&field.value);
+        }
+    }
+    return values;
+}
+
 }  // namespace Pegasus

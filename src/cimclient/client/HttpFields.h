@@ -18,6 +18,8 @@ class HttpFields {
     /// The value of the first field of that name (in any case) without blanks around it, or
     /// nullptr. Valid until the fields change.
     const std::string* find(std::string_view name) const;
+    /// The values of all fields of that name, in their order; see find().
+    std::vector<const std::string*> findAll(std::string_view name) const;
 
   private:
     struct Field {

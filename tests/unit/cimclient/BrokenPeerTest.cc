@@ -141,6 +141,29 @@ TEST_F(BrokenPeerTest, ReportsAMalformedStatus) {
         Reply::ok(fanXml("a", "1")).trailer("CIMError", "request-not-valid"));
 }
 
+TEST_F(BrokenPeerTest, DescribesAStatusAtLength) {
+    server.onNext(Reply::ok(fanXml("a", "1"))
+                      .trailer("CIMStatusCode", "6")
+                      .trailer("CIMStatusCodeDescription", std::string(5000, 'x')));
+    try {
+        fans();
+        ADD_FAILURE() << "no exception";
+    } catch (const CIMException& error) {
+        EXPECT_EQ(error.getCode(), CIM_ERR_NOT_FOUND);
+    }
+    expectNextRequestWorks();
+}
+
+TEST_F(BrokenPeerTest, TellsWhatIsWrongInTheTransfer) {
+    EXPECT_THAT(messageFor<CIMClientMalformedHTTPException>(
+                    Reply::raw("HTTP/1.1 200 OK\r\nContent-Type: text/xml\r\nTransfer-Encoding: "
+                               "chunked\r\n\r\nzz\r\n")),
+                testing::HasSubstr("chunk"));
+    EXPECT_THAT(messageFor<CIMClientMalformedHTTPException>(
+                    Reply::raw("HTTP/1.1 200 OK\r\nField: " + std::string(200000, 'x'))),
+                testing::HasSubstr("a line is too long"));
+}
+
 TEST_F(BrokenPeerTest, SendsAnEndlessHeader) {
     std::string header = "HTTP/1.1 200 OK\r\n";
     for (int i = 0; i < 20000; ++i) {

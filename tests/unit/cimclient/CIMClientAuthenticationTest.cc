@@ -133,6 +133,12 @@ TEST_F(CIMClientAuthenticationTest, SendsNoFileThatIsNoSecret) {
     }
 }
 
+TEST_F(CIMClientAuthenticationTest, FindsItsChallengeAmongOthers) {
+    server.onNext(Reply::http(401, {{"WWW-Authenticate", "Basic realm=\"x\""},
+                                    {"WWW-Authenticate", "Local \"" + secrets.file("s1") + "\""}}));
+    expectAccepted();
+}
+
 TEST_F(CIMClientAuthenticationTest, AnswersNoOtherScheme) {
     expectRefused(Reply::http(401, {{"WWW-Authenticate", "Basic realm=\"x\""}}));
     expectRefused(Reply::http(401, {}));

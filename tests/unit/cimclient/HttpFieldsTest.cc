@@ -24,6 +24,18 @@ TEST(HttpFieldsTest, TheFirstOfTwoFieldsCounts) {
     EXPECT_EQ(*fields.find("A"), "1");
 }
 
+TEST(HttpFieldsTest, FindsAllFieldsOfAName) {
+    HttpFields fields;
+    fields.addLine("A: 1");
+    fields.addLine("B: 2");
+    fields.addLine("a: 3");
+    const std::vector<const std::string*> values = fields.findAll("A");
+    ASSERT_EQ(values.size(), 2U);
+    EXPECT_EQ(*values[0], "1");
+    EXPECT_EQ(*values[1], "3");
+    EXPECT_TRUE(fields.findAll("C").empty());
+}
+
 TEST(HttpFieldsTest, JoinsContinuationLines) {
     HttpFields fields;
     fields.addLine("A: one");

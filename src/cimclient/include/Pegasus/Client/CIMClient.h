@@ -29,26 +29,23 @@ class CIMClientRep;
 /// are independent of each other.
 ///
 /// What a failed operation raises:
+/// - NotConnectedException: before connectLocal or after disconnect;
+/// - AlreadyConnectedException: connectLocal when connected;
+/// - CannotConnectException: no server to connect to, or none that can be trusted;
+/// - ConnectionTimeoutException: the operation did not end within the time-out;
+/// - CIMException with its code: the server reports a CIM status above 0, in whatever place;
+/// - CIMClientHTTPErrorException: an HTTP status other than 200, or a field CIMError;
+/// - CIMClientMalformedHTTPException: the connection was closed or reset before the answer's end,
+///   broken HTTP or chunks, a content type that is not XML, a malformed CIMStatusCode, a header or
+///   an answer above the size limits;
+/// - CIMClientXmlException: a complete HTTP answer whose XML is malformed, cut short, or not what
+///   the operation returns;
+/// - CIMClientResponseException: an answer to another request, invalid UTF-8, or neither the class
+///   that was asked for nor an error.
 ///
-/// | Failure                                                     | Exception |
-/// |-------------------------------------------------------------|---------------------------------|
-/// | operation before connectLocal or after disconnect           | NotConnectedException | |
-/// connectLocal when connected                                 | AlreadyConnectedException       |
-/// | no server to connect to, or none that can be trusted        | CannotConnectException | | the
-/// operation did not end within the time-out               | ConnectionTimeoutException      | |
-/// the server reports a CIM status above 0, in whatever place  | CIMException with that code     |
-/// | HTTP status other than 200, header CIMError                 | CIMClientHTTPErrorException | |
-/// connection closed or reset before the answer's end, broken  | CIMClientMalformedHTTPException |
-/// | HTTP or chunks, no XML content type, malformed CIMStatusCode, | | | header or answer above the
-/// size limits                      |                                 | | complete HTTP answer
-/// whose XML is malformed, cut short, or  | CIMClientXmlException           | | not what the
-/// operation returns                              |                                 | | answer to
-/// another request, invalid UTF-8, a class asked for | CIMClientResponseException      | | and
-/// neither class nor error given                           |                                 |
-///
-/// After every failure but a CIMException the connection is given up and the next operation
-/// connects again; a request of which any octet was sent is never sent a second time, except as
-/// the answer to an authentication challenge.
+/// After every failure but a CIMException in a whole answer the connection is given up and the next
+/// operation connects again; a request of which any octet was sent is never sent a second time,
+/// except as the answer to an authentication challenge.
 class CIMClient {
   public:
     /// Not connected, with a time-out of 20 seconds.
