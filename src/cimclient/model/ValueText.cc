@@ -68,11 +68,13 @@ void appendValueText(String& out, const CIMObjectPath& value) {
 }
 
 void appendValueText(String& out, const CIMObject& value) {
-    EmbeddedXml(out).append(value);
+    if (!value.isUninitialized())
+        EmbeddedXml(out).append(value);
 }
 
 void appendValueText(String& out, const CIMInstance& value) {
-    EmbeddedXml(out).append(value);
+    if (!value.isUninitialized())
+        EmbeddedXml(out).append(value);
 }
 
 }  // namespace Pegasus

@@ -246,7 +246,14 @@ TEST(CIMValueTest, ClonesHandlesOnNothing) {
     CIMInstance out("C");
     clone.get(out);
     EXPECT_TRUE(out.isUninitialized());
-    EXPECT_THROW(clone.toString(), UninitializedObjectException);
+}
+
+TEST(CIMValueTest, WritesHandlesOnNothingAsNothing) {
+    EXPECT_EQ(CIMValue(CIMInstance()).toString(), "");
+    EXPECT_EQ(CIMValue(CIMObject()).toString(), "");
+    Array<CIMInstance> instances(1, CIMInstance("C"));
+    instances.append(CIMInstance());
+    EXPECT_EQ(CIMValue(instances).toString(), "<INSTANCE CLASSNAME=\"C\"></INSTANCE>  ");
 }
 
 TEST(CIMTypeTest, HasTheNumbersAndNamesOfTheStandard) {
