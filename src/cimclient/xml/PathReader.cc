@@ -3,9 +3,11 @@
 #include <Pegasus/Common/Array.h>
 #include <Pegasus/Common/Exception.h>
 
+#include <algorithm>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "xml/ScalarParser.h"
 #include "xml/XmlCharacters.h"
@@ -36,13 +38,18 @@ bool isNumber(const ElementText& text) {
     return parseScalar(text, positive) || parseScalar(text, negative) || parseScalar(text, real);
 }
 
-bool hasKey(const Array<CIMKeyBinding>& keys, const CIMName& name) {
+// Sorts, so that an absurd number of keys takes no absurd time.
+bool hasDuplicates(const Array<CIMKeyBinding>& keys) {
+    std::vector<const CIMName*> names;
+    names.reserve(keys.size());
     for (const CIMKeyBinding& key : keys) {
-        if (key.getName().equal(name)) {
-            return true;
-        }
+        names.push_back(&key.getName());
     }
-    return false;
+    std::sort(names.begin(), names.end(), [](const CIMName* a, const CIMName* b) {
+        return String::compareNoCase(a->getString(), b->getString()) < 0;
+    });
+    const auto areEqual = [](const CIMName* a, const CIMName* b) { return a->equal(*b); };
+    return std::adjacent_find(names.begin(), names.end(), areEqual) != names.end();
 }
 
 }  // namespace
@@ -76,11 +83,10 @@ CIMObjectPath PathReader::readInstanceName() {
     const CIMName className = context.requiredName(reader, "CLASSNAME");
     Array<CIMKeyBinding> keys;
     while (reader.nextChild()) {
-        CIMKeyBinding key = reader.is("KEYBINDING") ? readKeyBinding() : readKey(CIMName());
-        if (hasKey(keys, key.getName())) {
-            reader.fail("a key of an instance name is given twice");
-        }
-        keys.append(std::move(key));
+        keys.append(reader.is("KEYBINDING") ? readKeyBinding() : readKey(CIMName()));
+    }
+    if (hasDuplicates(keys)) {
+        reader.fail("a key of an instance name is given twice");
     }
     return CIMObjectPath(String(), CIMNamespaceName(), className, std::move(keys));
 }
