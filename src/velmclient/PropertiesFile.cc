@@ -4,6 +4,7 @@
 #include <cstddef>
 #include <optional>
 
+#include "utf8/Utf8.h"
 #include "velmclient/FileDescriptor.h"
 #include "velmclient/PropertiesParser.h"
 #include "velmclient/SystemLog.h"
@@ -54,7 +55,7 @@ bool PropertiesFile::load() {
         }
         return false;
     }
-    properties = PropertiesParser(*bytes).parse();
+    properties = PropertiesParser(utf8::clean(*bytes)).parse();
     return true;
 }
 

@@ -5,12 +5,13 @@
 #include <optional>
 #include <utility>
 
+#include "utf8/Utf8.h"
+
 namespace Velm {
 
 namespace {
 
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
-constexpr char32_t kReplacementCharacter = 0xFFFD;
 constexpr std::size_t kHexDigits = 4;
 
 bool isBlank(char c) {
@@ -71,25 +72,6 @@ std::size_t findSeparator(std::string_view line) {
     return i < line.size() ? i : std::string_view::npos;
 }
 
-void appendUtf8(std::string& out, char32_t c) {
-    const auto continuation = [](char32_t bits) { return static_cast<char>(0x80 | (bits & 0x3F)); };
-    if (c < 0x80) {
-        out += static_cast<char>(c);
-    } else if (c < 0x800) {
-        out += static_cast<char>(0xC0 | (c >> 6));
-        out += continuation(c);
-    } else if (c < 0x10000) {
-        out += static_cast<char>(0xE0 | (c >> 12));
-        out += continuation(c >> 6);
-        out += continuation(c);
-    } else {
-        out += static_cast<char>(0xF0 | (c >> 18));
-        out += continuation(c >> 12);
-        out += continuation(c >> 6);
-        out += continuation(c);
-    }
-}
-
 int hexValue(char c) {
     if (c >= '0' && c <= '9') {
         return c - '0';
@@ -122,12 +104,11 @@ std::size_t appendUnicodeEscape(std::string& out, std::string_view text, char32_
     if (isHighSurrogate(unit)) {
         const std::optional<char32_t> low = codeUnit(text.substr(kLength));
         if (low && isLowSurrogate(*low)) {
-            appendUtf8(out, 0x10000 + ((unit - 0xD800) << 10) + (*low - 0xDC00));
+            utf8::append(out, 0x10000 + ((unit - 0xD800) << 10) + (*low - 0xDC00));
             return 2 * kLength;
         }
     }
-    const bool unpaired = isHighSurrogate(unit) || isLowSurrogate(unit);
-    appendUtf8(out, unpaired ? kReplacementCharacter : unit);
+    utf8::append(out, unit);
     return kLength;
 }
 

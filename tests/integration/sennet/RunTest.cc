@@ -237,6 +237,20 @@ TEST_F(RunTest, TranslatesThroughTheResourceProperties) {
     EXPECT_EQ(support::readFile(setup.mifFile("fan.mif")), expected);
 }
 
+TEST_F(RunTest, WritesAResourceTextThatIsNotUtf8WithAReplacement) {
+    setup.addScript("fan.script.inv", kFanScript);
+    setup.setProperties(
+        "CIM_Fan.Name = L\xFC"
+        "fter\n");
+    expectRun("Processing fan...\n");
+    std::string expected = namedMif("fan", "f1");
+    const std::string attribute = "Name = \"Name\"\r\n         Id = 2";
+    expected.replace(expected.find(attribute), attribute.size(),
+                     "Name = \"L\xEF\xBF\xBD"
+                     "fter\"\r\n         Id = 2");
+    EXPECT_EQ(support::readFile(setup.mifFile("fan.mif")), expected);
+}
+
 TEST_F(RunTest, GivesTheSameFilesAgain) {
     setup.addScript("fan.script.inv", kFanScript);
     expectRun("Processing fan...\n");

@@ -8,6 +8,9 @@
 // dropped. Escapes are \t \n \r \\ \uXXXX (a surrogate pair is one character, an unpaired surrogate
 // becomes U+FFFD) and a backslash before space, tab, `=` or `:`; what looks like any other escape
 // is kept as written. The last of equal keys wins. A byte-order mark at the start is skipped.
+//
+// Keys and values are always well-formed UTF-8: each byte of the file that is not part of such a
+// character reads as U+FFFD.
 #pragma once
 
 #include <string>
