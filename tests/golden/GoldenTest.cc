@@ -3,12 +3,14 @@
 //   sennet.properties       the resource properties
 //   server/CLASS.class.xml, server/CLASS.instances.xml
 //                           what the server returns; a class without files is refused
-//   expected/PRODUCT/*.mif  every file that the product's MIF directory holds after the run
+//   expected/PRODUCT/       every file that is there after the run: *.mif in the MIF directory, all
+//                           others in the SQL directory
 
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <filesystem>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -22,11 +24,16 @@ namespace fs = std::filesystem;
 using support::FakeCimServer;
 using support::readFile;
 using support::Reply;
+using support::writeFile;
 
 const fs::path kCase = fs::path(TEST_SOURCE_DIR) / "golden" / "workstation";
 
+/// In byte order; empty when there is no such directory.
 std::vector<std::string> namesIn(const fs::path& directory) {
     std::vector<std::string> names;
+    if (!fs::exists(directory)) {
+        return names;
+    }
     for (const auto& entry : fs::directory_iterator(directory)) {
         names.push_back(entry.path().filename().string());
     }
@@ -37,6 +44,20 @@ std::vector<std::string> namesIn(const fs::path& directory) {
 bool endsWith(const std::string& text, const std::string& end) {
     return text.size() >= end.size() &&
            text.compare(text.size() - end.size(), end.size(), end) == 0;
+}
+
+bool isMif(const std::string& name) {
+    return endsWith(name, ".mif");
+}
+
+std::vector<std::string> mifNames(std::vector<std::string> names) {
+    names.erase(std::remove_if(names.begin(), names.end(), std::not_fn(isMif)), names.end());
+    return names;
+}
+
+std::vector<std::string> otherNames(std::vector<std::string> names) {
+    names.erase(std::remove_if(names.begin(), names.end(), isMif), names.end());
+    return names;
 }
 
 /// The text's lines with their ends made visible.
@@ -88,8 +109,14 @@ class GoldenTest : public ::testing::TestWithParam<const char*> {
             answer(name);
         }
         for (const std::string& name : staleFiles()) {
-            setup.leaveMifFile(name, "of an earlier run");
+            const fs::path file = writtenFile(name);
+            fs::create_directories(file.parent_path());
+            writeFile(file, "of an earlier run");
         }
+    }
+
+    fs::path writtenFile(const std::string& name) const {
+        return fs::path(isMif(name) ? setup.mifDirectory() : setup.sqlDirectory()) / name;
     }
 
     void answer(const std::string& name) {
@@ -114,7 +141,16 @@ class GoldenTest : public ::testing::TestWithParam<const char*> {
             return {"kwvinv.mif"};
         }
         if (product == "QVE") {
-            return {"kwvinv.mif", "kwinvlumo.mif"};
+            return {"kwvinv.mif",
+                    "kwinvlumo.mif",
+                    "kwv_disk_lumo_schema.sql",
+                    "kwv_disk_queries.sh",
+                    "kwv_idle_lumo_schema.sql",
+                    "kwv_idle_sybase_schema.sql",
+                    "kwv_idle_ms_schema.sql",
+                    "kwv_idle_oracle_schema.sql",
+                    "kwv_idle_queries.sh",
+                    "kwv_idle_queries_lumo.sh"};
         }
         return {"disk.mif", "idle.mif"};
     }
@@ -132,13 +168,18 @@ TEST_P(GoldenTest, WritesTheExpectedFiles) {
                               "Processing Port...\n"
                               "Processing cpu...\n"
                               "Processing disk...\n"
-                              "Deleting idle...\n");
+                              "Deleting idle...\n"
+                              "Processing sensor...\n"
+                              "Processing zone...\n");
     const fs::path expectedFiles = kCase / "expected" / product;
     const std::vector<std::string> names = namesIn(expectedFiles);
-    EXPECT_EQ(setup.mifNames(), names);
+    EXPECT_EQ(namesIn(setup.mifDirectory()), mifNames(names));
+    EXPECT_EQ(namesIn(setup.sqlDirectory()), otherNames(names));
     for (const std::string& name : names) {
-        EXPECT_EQ(difference(readFile(expectedFiles / name), readFile(setup.mifFile(name))), "")
-            << name;
+        if (fs::exists(writtenFile(name))) {
+            EXPECT_EQ(difference(readFile(expectedFiles / name), readFile(writtenFile(name))), "")
+                << name;
+        }
     }
 }
 
