@@ -54,25 +54,37 @@ std::string withWholeReferences(std::string text) {
     return text;
 }
 
-void expectReadable(const std::string& product, Tolerances tolerances) {
+/// One file may leave the grammar in one more place than the others of its product.
+void expectReadable(const std::string& product, Tolerances tolerances,
+                    const std::string& exceptional = "",
+                    Tolerance exception = Tolerance::RawLineEnds) {
     const std::vector<fs::path> files = expectedFiles(product);
     EXPECT_THAT(files, Not(IsEmpty()));
     for (const fs::path& file : files) {
-        EXPECT_EQ(refusal(withWholeReferences(support::readFile(file)), tolerances), "accepted")
+        Tolerances allowed = tolerances;
+        if (file.filename() == exceptional) {
+            const std::string text = withWholeReferences(support::readFile(file));
+            EXPECT_NE(refusal(text, tolerances), "accepted") << file;
+            allowed.add(exception);
+        }
+        EXPECT_EQ(refusal(withWholeReferences(support::readFile(file)), allowed), "accepted")
             << file;
     }
 }
 
-TEST(GoldenFilesTest, SmsKeepsToTheGrammar) {
-    expectReadable("SMS", {Tolerance::RawLineEnds});
+// An enumeration is declared as text, and without a value it is a bare 0 all the same.
+TEST(GoldenFilesTest, SmsKeepsToTheGrammarButForEnumerationsWithoutAValue) {
+    expectReadable("SMS", {Tolerance::RawLineEnds}, "sensor.mif", Tolerance::IntegersAsText);
 }
 
 TEST(GoldenFilesTest, LanDeskWritesIntegersWhereItDeclaresText) {
-    expectReadable("LD", {Tolerance::RawLineEnds, Tolerance::IntegersAsText});
+    expectReadable("LD", {Tolerance::RawLineEnds, Tolerance::IntegersAsText}, "sensor.mif",
+                   Tolerance::EmptyDates);
 }
 
 TEST(GoldenFilesTest, CaKeepsBackslashesPlain) {
-    expectReadable("CA", {Tolerance::RawLineEnds, Tolerance::PlainBackslashes});
+    expectReadable("CA", {Tolerance::RawLineEnds, Tolerance::PlainBackslashes}, "kwvinv.mif",
+                   Tolerance::IntegersAsText);
 }
 
 TEST(GoldenFilesTest, QveDeclaresAndWritesTextOnly) {
