@@ -9,7 +9,7 @@
 #include <string_view>
 #include <utility>
 
-#include "Utf8.h"
+#include "Utf16.h"
 
 namespace Pegasus {
 

@@ -9,7 +9,7 @@
 #include <utility>
 #include <vector>
 
-#include "Utf8.h"
+#include "Utf16.h"
 
 namespace Pegasus {
 

@@ -10,7 +10,7 @@
 #include <string>
 
 #include "AsciiCase.h"
-#include "Utf8.h"
+#include "Utf16.h"
 
 namespace Pegasus {
 

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "utf8/Utf8.h"
+
 namespace Pegasus {
 
 namespace {
@@ -29,59 +31,17 @@ bool isPlainBlock(const char* block) {
     return odd == 0;
 }
 
-constexpr bool isContinuation(std::uint8_t c) {
-    return (c & 0xC0U) == 0x80;
-}
-
 struct Sequence {
     std::size_t size;
     OctetCheck::Verdict verdict;
 };
 
-// The allowed second octets are narrower after E0, ED, F0 and F4: that is what keeps overlong
-// forms, surrogates and codes above U+10FFFF out.
-bool isSecondOctet(std::uint8_t lead, std::uint8_t second) {
-    switch (lead) {
-        case 0xE0:
-            return second >= 0xA0 && second <= 0xBF;
-        case 0xED:
-            return second >= 0x80 && second <= 0x9F;
-        case 0xF0:
-            return second >= 0x90 && second <= 0xBF;
-        case 0xF4:
-            return second >= 0x80 && second <= 0x8F;
-        default:
-            return isContinuation(second);
-    }
-}
-
-std::size_t sequenceSize(std::uint8_t lead) {
-    if (lead >= 0xC2 && lead <= 0xDF) {
-        return 2;
-    }
-    if (lead >= 0xE0 && lead <= 0xEF) {
-        return 3;
-    }
-    return lead >= 0xF0 && lead <= 0xF4 ? 4 : 0;
-}
-
 // The character at the front of `octets`, whose first octet is above 127.
 Sequence checkSequence(std::string_view octets) {
-    const std::uint8_t lead = octet(octets[0]);
-    const std::size_t size = sequenceSize(lead);
+    const std::size_t size = utf8::characterLength(octets);
     if (size == 0) {
-        return {0, OctetCheck::Verdict::InvalidUtf8};
-    }
-    if (octets.size() > 1 && !isSecondOctet(lead, octet(octets[1]))) {
-        return {0, OctetCheck::Verdict::InvalidUtf8};
-    }
-    for (std::size_t i = 2; i < size && i < octets.size(); ++i) {
-        if (!isContinuation(octet(octets[i]))) {
-            return {0, OctetCheck::Verdict::InvalidUtf8};
-        }
-    }
-    if (octets.size() < size) {
-        return {0, OctetCheck::Verdict::Incomplete};
+        return {0, utf8::isCutCharacter(octets) ? OctetCheck::Verdict::Incomplete
+                                                : OctetCheck::Verdict::InvalidUtf8};
     }
     const std::string_view character = octets.substr(0, size);
     if (character == "\xEF\xBF\xBE" || character == "\xEF\xBF\xBF") {
@@ -140,29 +100,9 @@ OctetCheck checkOctets(std::string_view octets) {
     return {i, OctetCheck::Verdict::Good};
 }
 
-char* putUtf8(char* out, std::uint32_t code) {
-    const auto put = [&out](std::uint32_t value) { *out++ = static_cast<char>(value); };
-    if (code < 0x80) {
-        put(code);
-    } else if (code < 0x800) {
-        put(0xC0U | (code >> 6U));
-        put(0x80U | (code & 0x3FU));
-    } else if (code < 0x10000) {
-        put(0xE0U | (code >> 12U));
-        put(0x80U | ((code >> 6U) & 0x3FU));
-        put(0x80U | (code & 0x3FU));
-    } else {
-        put(0xF0U | (code >> 18U));
-        put(0x80U | ((code >> 12U) & 0x3FU));
-        put(0x80U | ((code >> 6U) & 0x3FU));
-        put(0x80U | (code & 0x3FU));
-    }
-    return out;
-}
-
 std::string quotedForMessage(std::string_view text) {
     std::size_t size = std::min(text.size(), kQuotedOctets);
-    while (size > 0 && size < text.size() && isContinuation(octet(text[size]))) {
+    while (size > 0 && size < text.size() && utf8::isContinuation(text[size])) {
         --size;
     }
     std::string quoted = "\"";

@@ -54,9 +54,6 @@ constexpr bool isReferable(std::uint32_t code) {
            code != 0xFFFF;
 }
 
-/// Writes the UTF-8 form of `code` (at most U+10FFFF) to `out`, 1 to 4 octets; returns the end.
-char* putUtf8(char* out, std::uint32_t code);
-
 /// `text` between double quotes for a message: cut after 60 octets at a character's border, control
 /// characters as "?".
 std::string quotedForMessage(std::string_view text);

@@ -1,8 +1,8 @@
 #include "xml/XmlText.h"
 
-#include <array>
 #include <cstdint>
 
+#include "utf8/Utf8.h"
 #include "xml/XmlCharacters.h"
 
 namespace Pegasus {
@@ -52,9 +52,7 @@ void appendAscii(std::string& xml, char c) {
 }
 
 void appendCharacter(std::string& xml, std::uint32_t code) {
-    std::array<char, 4> utf8{};
-    char* const begin = utf8.data();
-    xml.append(begin, putUtf8(begin, isReferable(code) ? code : kReplacement));
+    utf8::append(xml, isReferable(code) ? code : kReplacement);
 }
 
 }  // namespace

@@ -7,6 +7,7 @@
 #include <string_view>
 #include <utility>
 
+#include "utf8/Utf8.h"
 #include "xml/XmlCharacters.h"
 
 namespace Pegasus {
@@ -70,7 +71,7 @@ const char* decodeReference(const char* p, const char* end, char*& out) {
                                              " names no character that XML allows"
                                        : "entity " + quotedForMessage(name) + " is not defined"};
     }
-    out = putUtf8(out, code);
+    out = utf8::put(out, code);
     return semicolon + 1;
 }
 

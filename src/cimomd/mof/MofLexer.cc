@@ -4,6 +4,7 @@
 
 #include "mof/MofNumber.h"
 #include "text/Utf8.h"
+#include "utf8/Utf8.h"
 
 namespace cimomd {
 namespace {
@@ -191,7 +192,7 @@ MofToken MofLexer::quoted(char quote, MofTokenKind kind) {
     MofToken token = tokenFrom(kind, startOffset, start);
     // Published schemas carry single bytes of other encodings in descriptions; they are no reason
     // to refuse a class.
-    token.characters = cleanUtf8(characters);
+    token.characters = utf8::clean(characters);
     return token;
 }
 
@@ -223,7 +224,7 @@ void MofLexer::readHexEscape(std::string& out, MofPosition start) {
     }
     if (digits == 0 || code == 0)
         fail(start, "\\x", "\\x with one to four hexadecimal digits, not 0");
-    appendUtf8(out, code);
+    utf8::append(out, code);
 }
 
 MofToken MofLexer::tokenFrom(MofTokenKind kind, std::size_t start,

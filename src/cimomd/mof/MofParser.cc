@@ -6,6 +6,7 @@
 #include <utility>
 
 #include "text/Utf8.h"
+#include "utf8/Utf8.h"
 
 namespace cimomd {
 namespace {
@@ -317,7 +318,7 @@ MofName MofParser::parseName(std::string_view expected) {
     if (token.kind != MofTokenKind::Identifier)
         fail(expected);
     const MofToken name = take();
-    return {cleanUtf8(name.text), name.position};
+    return {utf8::clean(name.text), name.position};
 }
 
 bool MofParser::atPunctuation(std::string_view mark) const {

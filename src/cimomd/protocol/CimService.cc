@@ -10,6 +10,7 @@
 #include "protocol/PercentCoding.h"
 #include "text/CimText.h"
 #include "text/Utf8.h"
+#include "utf8/Utf8.h"
 #include "xml/MemorySource.h"
 
 namespace cimomd {
@@ -102,7 +103,7 @@ std::unique_ptr<ResponseStream> respond(const Dispatcher& dispatcher,
     } catch (const Pegasus::Exception& error) {
         stream->fail({Pegasus::CIM_ERR_FAILED, utf8Of(error.getMessage())});
     } catch (const std::exception& error) {
-        stream->fail({Pegasus::CIM_ERR_FAILED, cleanUtf8(error.what())});
+        stream->fail({Pegasus::CIM_ERR_FAILED, utf8::clean(error.what())});
     }
     return stream;
 }

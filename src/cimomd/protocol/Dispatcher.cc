@@ -7,6 +7,7 @@
 #include "protocol/ClassAnswer.h"
 #include "text/CimText.h"
 #include "text/Utf8.h"
+#include "utf8/Utf8.h"
 
 namespace cimomd {
 namespace {
@@ -19,7 +20,7 @@ using Pegasus::ObjectXmlOptions;
 using Pegasus::Uint32;
 
 [[noreturn]] void fail(Pegasus::CIMStatusCode code, const std::string& description) {
-    throw Pegasus::CIMException(code, cimString(cleanUtf8(description)));
+    throw Pegasus::CIMException(code, cimString(utf8::clean(description)));
 }
 
 CIMName requiredClassName(const CimRequest& request) {

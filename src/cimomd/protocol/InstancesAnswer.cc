@@ -7,7 +7,7 @@
 #include <utility>
 
 #include "text/CimText.h"
-#include "text/Utf8.h"
+#include "utf8/Utf8.h"
 
 namespace cimomd {
 namespace {
@@ -39,7 +39,7 @@ std::vector<CIMName> keysOf(const CIMConstClass& cimClass) {
 [[noreturn]] void fail(const ProvidedClass& source, const std::string& reason) {
     throw Pegasus::CIMException(
         Pegasus::CIM_ERR_FAILED,
-        cimString(cleanUtf8(fmt::format("{}: {}", source.provider->className(), reason))));
+        cimString(utf8::clean(fmt::format("{}: {}", source.provider->className(), reason))));
 }
 
 }  // namespace

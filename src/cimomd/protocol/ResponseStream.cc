@@ -7,7 +7,7 @@
 #include <utility>
 
 #include "text/CimText.h"
-#include "text/Utf8.h"
+#include "utf8/Utf8.h"
 #include "xml/CimXmlWriter.h"
 
 namespace cimomd {
@@ -85,7 +85,7 @@ void ResponseStream::step() {
         fail({Pegasus::CIM_ERR_FAILED, utf8Of(error.getMessage())});
     } catch (const std::exception& error) {
         pending.resize(before);
-        fail({Pegasus::CIM_ERR_FAILED, cleanUtf8(error.what())});
+        fail({Pegasus::CIM_ERR_FAILED, utf8::clean(error.what())});
     }
 }
 

@@ -1,7 +1,6 @@
 #include "system/OsRelease.h"
 
 #include "files/TextFields.h"
-#include "text/Utf8.h"
 
 namespace cimomd {
 namespace {

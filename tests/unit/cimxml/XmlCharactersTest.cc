@@ -72,21 +72,6 @@ TEST(XmlCharacters, AFaultInTheSecondOctetShowsBeforeTheThird) {
     expectCheck("\xE2\x82", 0, Verdict::Incomplete);
 }
 
-std::string utf8Of(std::uint32_t code) {
-    char octets[4];
-    return {octets, putUtf8(octets, code)};
-}
-
-TEST(XmlCharacters, Utf8OfTheBorders) {
-    EXPECT_EQ(utf8Of(0x7F), "\x7F");
-    EXPECT_EQ(utf8Of(0x80), "\xC2\x80");
-    EXPECT_EQ(utf8Of(0x7FF), "\xDF\xBF");
-    EXPECT_EQ(utf8Of(0x800), "\xE0\xA0\x80");
-    EXPECT_EQ(utf8Of(0xFFFD), "\xEF\xBF\xBD");
-    EXPECT_EQ(utf8Of(0x10000), "\xF0\x90\x80\x80");
-    EXPECT_EQ(utf8Of(0x10FFFF), "\xF4\x8F\xBF\xBF");
-}
-
 TEST(XmlCharacters, TrimAndBlank) {
     EXPECT_EQ(trimXmlSpace(" \t\r\na b\n"), "a b");
     EXPECT_EQ(trimXmlSpace(" \n"), "");

@@ -1,0 +1,80 @@
+#include "Utf16.h"
+
+#include <cstring>
+#include <string_view>
+
+#include "utf8/Utf8.h"
+
+namespace Pegasus {
+
+namespace {
+
+Boolean isHighSurrogate(Uint32 unit) {
+    return unit >= 0xD800 && unit <= 0xDBFF;
+}
+
+Boolean isLowSurrogate(Uint32 unit) {
+    return unit >= 0xDC00 && unit <= 0xDFFF;
+}
+
+}  // namespace
+
+Boolean isAscii(const char* bytes, std::size_t n) {
+    std::size_t i = 0;
+    for (Uint64 word = 0; n - i >= sizeof(word); i += sizeof(word)) {
+        std::memcpy(&word, bytes + i, sizeof(word));
+        if (word & 0x8080808080808080U)
+            return false;
+    }
+    Uint8 seen = 0;
+    for (; i < n; ++i)
+        seen |= static_cast<Uint8>(bytes[i]);
+    return seen < 0x80;
+}
+
+std::size_t utf16Length(const char* bytes, std::size_t n) {
+    std::size_t length = 0;
+    for (std::size_t i = 0; i < n; ++i) {
+        length += !utf8::isContinuation(bytes[i]);
+        length += static_cast<Uint8>(bytes[i]) >= 0xF0;
+    }
+    return length;
+}
+
+std::size_t decodeUtf8(const char* bytes, std::size_t n, Char16* out) {
+    std::size_t length = 0;
+    for (std::size_t at = 0; at < n; at += length) {
+        const std::string_view rest(bytes + at, n - at);
+        length = utf8::characterLength(rest);
+        if (length == 0)
+            return at;
+        const Uint32 code = utf8::decode(rest, length);
+        if (code < 0x10000) {
+            *out++ = static_cast<Uint16>(code);
+        } else {
+            *out++ = static_cast<Uint16>(0xD7C0 + (code >> 10));
+            *out++ = static_cast<Uint16>(0xDC00 | (code & 0x3FF));
+        }
+    }
+    return n;
+}
+
+std::string encodeUtf8(const Char16* text, std::size_t n) {
+    std::string out;
+    out.reserve(n);
+    for (std::size_t i = 0; i < n; ++i) {
+        const Uint32 unit = text[i];
+        const Uint32 next = i + 1 < n ? Uint32{text[i + 1]} : 0;
+        if (isHighSurrogate(unit) && isLowSurrogate(next)) {
+            utf8::append(out, 0x10000 + ((unit - 0xD800) << 10) + (next - 0xDC00));
+            ++i;
+        } else if (unit < 0x80) {
+            out += static_cast<char>(unit);
+        } else {
+            utf8::append(out, unit);
+        }
+    }
+    return out;
+}
+
+}  // namespace Pegasus
