@@ -67,10 +67,14 @@ std::optional<uid_t> peerUserOf(const FileDescriptor& socket) {
     return peer.uid;
 }
 
-bool isIdle(const FileDescriptor& socket) {
-    char octet = 0;
-    const ssize_t count = ::recv(socket.get(), &octet, 1, MSG_PEEK | MSG_DONTWAIT);
-    return count < 0 && (errno == EAGAIN || errno == EWOULDBLOCK);
+bool isIdle(const FileDescriptor& socket, std::chrono::microseconds grace) {
+    pollfd descriptor{socket.get(), POLLIN, 0};
+    const timespec time{0, std::chrono::nanoseconds(grace).count()};
+    int ready = 0;
+    do {
+        ready = ::ppoll(&descriptor, 1, &time, nullptr);
+    } while (ready < 0 && errno == EINTR);
+    return ready == 0;
 }
 
 }  // namespace Pegasus

@@ -4,6 +4,7 @@
 
 #include <sys/types.h>
 
+#include <chrono>
 #include <optional>
 #include <string>
 
@@ -29,7 +30,9 @@ ConnectResult connectUnixSocket(const std::string& path, FinalLink finalLink,
 /// The user that the process at the other end had when it began to listen; none when unknown.
 std::optional<uid_t> peerUserOf(const FileDescriptor& socket);
 
-/// Whether the connection is open with nothing to read: nothing was lost, nothing is left over.
-bool isIdle(const FileDescriptor& socket);
+/// Whether the connection is open with nothing to read, and stays so for the time of grace (below a
+/// second): nothing was lost, nothing is left over.
+bool isIdle(const FileDescriptor& socket,
+            std::chrono::microseconds grace = std::chrono::microseconds::zero());
 
 }  // namespace Pegasus

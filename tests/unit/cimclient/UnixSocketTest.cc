@@ -7,6 +7,8 @@
 
 #include <array>
 #include <cerrno>
+#include <chrono>
+#include <thread>
 
 #include "support/FakeCimServer.h"
 #include "support/Files.h"
@@ -57,6 +59,18 @@ TEST(UnixSocketTest, IdleMeansOpenWithNothingToRead) {
     EXPECT_TRUE(isIdle(own));
     peer.reset();
     EXPECT_FALSE(isIdle(own));
+}
+
+TEST(UnixSocketTest, ACloseWithinTheGraceIsSeen) {
+    std::array<int, 2> ends{};
+    ASSERT_EQ(socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, ends.data()), 0);
+    const FileDescriptor own(ends[0]);
+    FileDescriptor peer(ends[1]);
+    EXPECT_TRUE(isIdle(own, std::chrono::microseconds(100)));
+    // The longest grace there is, so that a slow machine cannot make the close come too late.
+    std::thread closer([&peer] { peer.reset(); });
+    EXPECT_FALSE(isIdle(own, std::chrono::microseconds(999'999)));
+    closer.join();
 }
 
 TEST(UnixSocketTest, NoDescriptorHasNoPeer) {
