@@ -28,7 +28,7 @@ char* put(char* out, char32_t code) {
 }
 
 void append(std::string& out, char32_t code) {
-    if (code > 0x10FFFF || (code >= 0xD800 && code <= 0xDFFF)) {
+    if (code > 0x10FFFF || isHighSurrogate(code) || isLowSurrogate(code)) {
         out += kReplacement;
         return;
     }

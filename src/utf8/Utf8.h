@@ -84,6 +84,19 @@ constexpr char32_t decode(std::string_view bytes, std::size_t length) {
     return code;
 }
 
+/// The halves in which UTF-16 writes the codes above U+FFFF.
+constexpr bool isHighSurrogate(char32_t unit) {
+    return unit >= 0xD800 && unit <= 0xDBFF;
+}
+
+constexpr bool isLowSurrogate(char32_t unit) {
+    return unit >= 0xDC00 && unit <= 0xDFFF;
+}
+
+constexpr char32_t joinSurrogates(char32_t high, char32_t low) {
+    return 0x10000 + ((high - 0xD800) << 10U) + (low - 0xDC00);
+}
+
 /// Writes a code of at most U+10FFFF to `out`, 1 to 4 bytes; returns the end.
 char* put(char* out, char32_t code);
 

@@ -22,14 +22,6 @@ bool isSeparator(char c) {
     return c == '=' || c == ':';
 }
 
-bool isHighSurrogate(char32_t unit) {
-    return unit >= 0xD800 && unit < 0xDC00;
-}
-
-bool isLowSurrogate(char32_t unit) {
-    return unit >= 0xDC00 && unit < 0xE000;
-}
-
 std::string_view withoutLeadingBlanks(std::string_view text) {
     std::size_t count = 0;
     while (count < text.size() && isBlank(text[count])) {
@@ -101,10 +93,10 @@ std::optional<char32_t> codeUnit(std::string_view text) {
 // Both return how many bytes of the text, which starts with a backslash, they have decoded.
 std::size_t appendUnicodeEscape(std::string& out, std::string_view text, char32_t unit) {
     constexpr std::size_t kLength = 2 + kHexDigits;
-    if (isHighSurrogate(unit)) {
+    if (utf8::isHighSurrogate(unit)) {
         const std::optional<char32_t> low = codeUnit(text.substr(kLength));
-        if (low && isLowSurrogate(*low)) {
-            utf8::append(out, 0x10000 + ((unit - 0xD800) << 10) + (*low - 0xDC00));
+        if (low && utf8::isLowSurrogate(*low)) {
+            utf8::append(out, utf8::joinSurrogates(unit, *low));
             return 2 * kLength;
         }
     }

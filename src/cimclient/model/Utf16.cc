@@ -7,18 +7,6 @@
 
 namespace Pegasus {
 
-namespace {
-
-Boolean isHighSurrogate(Uint32 unit) {
-    return unit >= 0xD800 && unit <= 0xDBFF;
-}
-
-Boolean isLowSurrogate(Uint32 unit) {
-    return unit >= 0xDC00 && unit <= 0xDFFF;
-}
-
-}  // namespace
-
 Boolean isAscii(const char* bytes, std::size_t n) {
     std::size_t i = 0;
     for (Uint64 word = 0; n - i >= sizeof(word); i += sizeof(word)) {
@@ -65,8 +53,8 @@ std::string encodeUtf8(const Char16* text, std::size_t n) {
     for (std::size_t i = 0; i < n; ++i) {
         const Uint32 unit = text[i];
         const Uint32 next = i + 1 < n ? Uint32{text[i + 1]} : 0;
-        if (isHighSurrogate(unit) && isLowSurrogate(next)) {
-            utf8::append(out, 0x10000 + ((unit - 0xD800) << 10) + (next - 0xDC00));
+        if (utf8::isHighSurrogate(unit) && utf8::isLowSurrogate(next)) {
+            utf8::append(out, utf8::joinSurrogates(unit, next));
             ++i;
         } else if (unit < 0x80) {
             out += static_cast<char>(unit);

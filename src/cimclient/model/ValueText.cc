@@ -2,8 +2,10 @@
 
 #include <array>
 #include <charconv>
+#include <string>
+#include <string_view>
 
-#include "EmbeddedXml.h"
+#include "ObjectXml.h"
 
 namespace Pegasus {
 
@@ -12,14 +14,15 @@ namespace {
 /// Room for any integer and any real of 17 digits.
 using NumberText = std::array<char, 32>;
 
-void appendAscii(String& out, const char* begin, const char* end) {
-    out.append(String(begin, static_cast<Uint32>(end - begin)));
+void appendUtf8(String& out, std::string_view text) {
+    out.append(String(text.data(), static_cast<Uint32>(text.size())));
 }
 
 template <class Integer>
 void appendInteger(String& out, Integer value) {
     NumberText text;
-    appendAscii(out, text.data(), std::to_chars(text.begin(), text.end(), value).ptr);
+    const char* const end = std::to_chars(text.begin(), text.end(), value).ptr;
+    appendUtf8(out, {text.data(), end});
 }
 
 }  // namespace
@@ -41,7 +44,7 @@ void appendValueText(String& out, Real64 value) {
     const auto [end, error] =
         std::to_chars(text.begin(), text.end(), value, std::chars_format::scientific, 16);
     static_cast<void>(error);
-    appendAscii(out, text.data(), end);
+    appendUtf8(out, {text.data(), end});
 }
 
 void appendValueText(String& out, Char16 value) {
@@ -68,13 +71,14 @@ void appendValueText(String& out, const CIMObjectPath& value) {
 }
 
 void appendValueText(String& out, const CIMObject& value) {
-    if (!value.isUninitialized())
-        EmbeddedXml(out).append(value);
+    std::string xml;
+    appendObject(xml, value);
+    appendUtf8(out, xml);
 }
 
 void appendValueText(String& out, const CIMInstance& value) {
     if (!value.isUninitialized())
-        EmbeddedXml(out).append(value);
+        appendValueText(out, CIMObject(value));
 }
 
 }  // namespace Pegasus

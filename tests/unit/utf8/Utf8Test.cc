@@ -94,6 +94,16 @@ TEST(Utf8, TellsACutCharacterFromAWrongOne) {
     EXPECT_FALSE(utf8::isCutCharacter("a"));
 }
 
+TEST(Utf8, JoinsSurrogates) {
+    EXPECT_EQ(utf8::joinSurrogates(0xD800, 0xDC00), 0x10000U);
+    EXPECT_EQ(utf8::joinSurrogates(0xD83D, 0xDE00), 0x1F600U);
+    EXPECT_EQ(utf8::joinSurrogates(0xDBFF, 0xDFFF), 0x10FFFFU);
+    EXPECT_TRUE(utf8::isHighSurrogate(0xDBFF));
+    EXPECT_FALSE(utf8::isHighSurrogate(0xDC00));
+    EXPECT_TRUE(utf8::isLowSurrogate(0xDFFF));
+    EXPECT_FALSE(utf8::isLowSurrogate(0xE000));
+}
+
 TEST(Utf8, CleanKeepsWellFormedText) {
     const std::string text = "a \xC3\xA9 \xE2\x82\xAC \xF0\x9F\x98\x80 \t\n\r\x01";
     EXPECT_EQ(utf8::clean(text), text);

@@ -4,8 +4,8 @@
 #include <Pegasus/Common/CIMKeyBinding.h>
 #include <Pegasus/Common/Exception.h>
 
-#include "xml/CimXmlWriter.h"
-#include "xml/XmlText.h"
+#include "ObjectXml.h"
+#include "XmlText.h"
 
 namespace Pegasus {
 

@@ -1,25 +1,15 @@
-#include "xml/XmlText.h"
-
-#include <cstdint>
+#include "XmlText.h"
 
 #include "utf8/Utf8.h"
-#include "xml/XmlCharacters.h"
 
 namespace Pegasus {
 
 namespace {
 
-constexpr std::uint32_t kReplacement = 0xFFFD;
-
-constexpr bool isHighSurrogate(Uint16 unit) {
-    return unit >= 0xD800 && unit <= 0xDBFF;
-}
-constexpr bool isLowSurrogate(Uint16 unit) {
-    return unit >= 0xDC00 && unit <= 0xDFFF;
-}
+constexpr char32_t kReplacement = 0xFFFD;
 
 // What stands in XML for an ASCII character; empty when the character stands for itself.
-std::string_view escapeOf(std::uint32_t code) {
+std::string_view escapeOf(char32_t code) {
     switch (code) {
         case '&':
             return "&amp;";
@@ -43,7 +33,7 @@ std::string_view escapeOf(std::uint32_t code) {
 }
 
 void appendAscii(std::string& xml, char c) {
-    const std::string_view escape = escapeOf(static_cast<std::uint32_t>(c));
+    const std::string_view escape = escapeOf(static_cast<char32_t>(c));
     if (escape.empty()) {
         xml += c;
     } else {
@@ -51,8 +41,9 @@ void appendAscii(std::string& xml, char c) {
     }
 }
 
-void appendCharacter(std::string& xml, std::uint32_t code) {
-    utf8::append(xml, isReferable(code) ? code : kReplacement);
+void appendCharacter(std::string& xml, char32_t code) {
+    const bool isNonCharacter = code == 0xFFFE || code == 0xFFFF;
+    utf8::append(xml, isNonCharacter ? kReplacement : code);
 }
 
 }  // namespace
@@ -64,9 +55,10 @@ void appendEscaped(std::string& xml, const String& text) {
         const Uint16 unit = units[i];
         if (unit < 0x80) {
             appendAscii(xml, static_cast<char>(unit));
-        } else if (isHighSurrogate(unit) && i + 1 < size && isLowSurrogate(units[i + 1])) {
+        } else if (utf8::isHighSurrogate(unit) && i + 1 < size &&
+                   utf8::isLowSurrogate(units[i + 1])) {
             ++i;
-            appendCharacter(xml, 0x10000 + ((unit - 0xD800U) << 10U) + (units[i] - 0xDC00U));
+            appendCharacter(xml, utf8::joinSurrogates(unit, units[i]));
         } else {
             appendCharacter(xml, unit);
         }

@@ -12,8 +12,8 @@
 #include <type_traits>
 #include <variant>
 
-#include "xml/CimXmlWriter.h"
-#include "xml/XmlText.h"
+#include "ObjectXml.h"
+#include "XmlText.h"
 
 namespace Pegasus {
 
@@ -35,13 +35,17 @@ void appendText(std::string& xml, const CIMDateTime& value) {
     appendEscaped(xml, value.toString());
 }
 
-// An embedded object is its own element, escaped once more; the model writes that element.
+// An embedded object is its own element, escaped once more.
 void appendText(std::string& xml, const CIMObject& value) {
-    appendEscaped(xml, CIMValue(value).toString());
+    std::string element;
+    appendObject(element, value);
+    appendEscaped(xml, element);
 }
 
 void appendText(std::string& xml, const CIMInstance& value) {
-    appendEscaped(xml, CIMValue(value).toString());
+    if (!value.isUninitialized()) {
+        appendText(xml, CIMObject(value));
+    }
 }
 
 template <typename T>
