@@ -30,11 +30,16 @@ if(OpenPegasus_FOUND AND NOT TARGET OpenPegasus::client)
     add_library(OpenPegasus::common UNKNOWN IMPORTED)
     set_target_properties(OpenPegasus::common PROPERTIES
         IMPORTED_LOCATION "${OpenPegasus_COMMON_LIBRARY}")
+    # The client library needs others of its own, which stand beside it: let the linker look there,
+    # and the loader too (a run path of the old kind serves the libraries' libraries).
+    get_filename_component(OpenPegasus_LIBRARY_DIR "${OpenPegasus_CLIENT_LIBRARY}" DIRECTORY)
     add_library(OpenPegasus::client UNKNOWN IMPORTED)
     set_target_properties(OpenPegasus::client PROPERTIES
         IMPORTED_LOCATION "${OpenPegasus_CLIENT_LIBRARY}"
         INTERFACE_INCLUDE_DIRECTORIES "${OpenPegasus_INCLUDE_DIR}"
         INTERFACE_COMPILE_DEFINITIONS "${OpenPegasus_PLATFORM}"
+        INTERFACE_LINK_OPTIONS
+            "LINKER:-rpath-link,${OpenPegasus_LIBRARY_DIR};LINKER:--disable-new-dtags"
         INTERFACE_LINK_LIBRARIES OpenPegasus::common)
 endif()
 mark_as_advanced(OpenPegasus_INCLUDE_DIR OpenPegasus_CLIENT_LIBRARY OpenPegasus_COMMON_LIBRARY)
