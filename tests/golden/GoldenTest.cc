@@ -22,24 +22,12 @@ namespace {
 
 namespace fs = std::filesystem;
 using support::FakeCimServer;
+using support::namesIn;
 using support::readFile;
 using support::Reply;
 using support::writeFile;
 
 const fs::path kCase = fs::path(TEST_SOURCE_DIR) / "golden" / "workstation";
-
-/// In byte order; empty when there is no such directory.
-std::vector<std::string> namesIn(const fs::path& directory) {
-    std::vector<std::string> names;
-    if (!fs::exists(directory)) {
-        return names;
-    }
-    for (const auto& entry : fs::directory_iterator(directory)) {
-        names.push_back(entry.path().filename().string());
-    }
-    std::sort(names.begin(), names.end());
-    return names;
-}
 
 bool endsWith(const std::string& text, const std::string& end) {
     return text.size() >= end.size() &&

@@ -194,7 +194,7 @@ void FakeCimServer::onNext(Reply reply) {
 }
 
 std::string FakeCimServer::socketPath() const {
-    return state->directory.file("cim.socket");
+    return state->directory.path("cim.socket");
 }
 
 std::vector<RecordedRequest> FakeCimServer::requests() const {

@@ -1,6 +1,5 @@
 #include "integration/sennet/SennetSetup.h"
 
-#include <algorithm>
 #include <filesystem>
 
 #include "support/Files.h"
@@ -60,15 +59,7 @@ void SennetSetup::leaveMifFile(const std::string& name, const std::string& bytes
 }
 
 std::vector<std::string> SennetSetup::mifNames() const {
-    std::vector<std::string> names;
-    if (!std::filesystem::exists(mifDirectory())) {
-        return names;
-    }
-    for (const auto& entry : std::filesystem::directory_iterator(mifDirectory())) {
-        names.push_back(entry.path().filename().string());
-    }
-    std::sort(names.begin(), names.end());
-    return names;
+    return support::namesIn(mifDirectory());
 }
 
 std::string SennetSetup::banner() {
@@ -77,15 +68,4 @@ std::string SennetSetup::banner() {
 
 std::string SennetSetup::start() const {
     return banner() + "Creating MIF files in " + mifDirectory() + "\n";
-}
-
-std::string crlf(const std::string& text) {
-    std::string result;
-    for (char c : text) {
-        if (c == '\n') {
-            result += '\r';
-        }
-        result += c;
-    }
-    return result;
 }

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "support/FakeCimServer.h"
+#include "support/LineEnds.h"
 #include "support/RunProgram.h"
 #include "support/TempDirectory.h"
 
@@ -32,10 +33,10 @@ class SennetSetup {
     static std::string program();
     std::map<std::string, std::string> environment(const std::string& socketPath) const;
 
-    std::string scriptDirectory() const { return directory.file("scripts"); }
-    std::string mifDirectory() const { return directory.file("mif"); }
-    std::string sqlDirectory() const { return directory.file("sql"); }
-    std::string path(const std::string& name) const { return directory.file(name); }
+    std::string scriptDirectory() const { return directory.path("scripts"); }
+    std::string mifDirectory() const { return directory.path("mif"); }
+    std::string sqlDirectory() const { return directory.path("sql"); }
+    std::string path(const std::string& name) const { return directory.path(name); }
     std::string mifFile(const std::string& name) const { return mifDirectory() + "/" + name; }
 
     /// Puts a file of an earlier run into the MIF directory.
@@ -53,5 +54,4 @@ class SennetSetup {
     std::string configuration;
 };
 
-/// The text with CR LF in place of every LF.
-std::string crlf(const std::string& text);
+using support::crlf;

@@ -24,7 +24,7 @@ class CIMClientAuthenticationTest : public testing::Test {
   protected:
     CIMClientAuthenticationTest()
         : socketName("CIM_LOCAL_SOCKET", server.socketPath()), client(settings()) {
-        support::writeFile(secrets.file("s1"), "one\ntwo\n");
+        support::writeFile(secrets.path("s1"), "one\ntwo\n");
         server.onGetClass("CIM_Fan", Reply::ok(classXml("CIM_Fan")));
         client.setTimeout(5000);
         client.connectLocal();
@@ -54,7 +54,7 @@ class CIMClientAuthenticationTest : public testing::Test {
         getFan();
         ASSERT_EQ(server.requests().size(), 2U);
         EXPECT_EQ(authorization(0), "Local \"" + user + "\"");
-        EXPECT_EQ(authorization(1), "Local \"" + user + ":" + secrets.file("s1") + ":onetwo\"");
+        EXPECT_EQ(authorization(1), "Local \"" + user + ":" + secrets.path("s1") + ":onetwo\"");
         EXPECT_EQ(server.requests()[0].body, server.requests()[1].body);
     }
 
@@ -76,13 +76,13 @@ class CIMClientAuthenticationTest : public testing::Test {
 };
 
 TEST_F(CIMClientAuthenticationTest, AnswersAChallengeOnTheSameConnection) {
-    server.onNext(challenge(secrets.file("s1")));
+    server.onNext(challenge(secrets.path("s1")));
     expectAccepted();
     EXPECT_EQ(server.connectionCount(), 1U);
 }
 
 TEST_F(CIMClientAuthenticationTest, AChallengeMayHaveABody) {
-    server.onNext(Reply::http(401, {{"WWW-Authenticate", "Local \"" + secrets.file("s1") + "\""}},
+    server.onNext(Reply::http(401, {{"WWW-Authenticate", "Local \"" + secrets.path("s1") + "\""}},
                               "<html>who are you?</html>"));
     expectAccepted();
     EXPECT_EQ(server.connectionCount(), 1U);
@@ -90,52 +90,52 @@ TEST_F(CIMClientAuthenticationTest, AChallengeMayHaveABody) {
 
 TEST_F(CIMClientAuthenticationTest, AChallengeMayHaveNoLengthAndNoBody) {
     const Stopwatch watch;
-    server.onNext(challenge(secrets.file("s1")).withoutLength());
+    server.onNext(challenge(secrets.path("s1")).withoutLength());
     expectAccepted();
     EXPECT_EQ(server.connectionCount(), 1U);
     EXPECT_LT(watch.milliseconds(), 2000);
 }
 
 TEST_F(CIMClientAuthenticationTest, AChallengeMayCloseTheConnection) {
-    server.onNext(challenge(secrets.file("s1")).header("Connection", "close").thenClose());
+    server.onNext(challenge(secrets.path("s1")).header("Connection", "close").thenClose());
     expectAccepted();
     EXPECT_EQ(server.connectionCount(), 2U);
 }
 
 TEST_F(CIMClientAuthenticationTest, ASecondChallengeIsARefusal) {
-    server.onNext(challenge(secrets.file("s1")));
-    server.onNext(challenge(secrets.file("s1")));
+    server.onNext(challenge(secrets.path("s1")));
+    server.onNext(challenge(secrets.path("s1")));
     EXPECT_EQ(messageOf<CIMClientHTTPErrorException>([&] { getFan(); }),
               "HTTP error: HTTP/1.1 401 Unauthorized");
     EXPECT_EQ(server.requests().size(), 2U);
 }
 
 TEST_F(CIMClientAuthenticationTest, TheNextRequestBeginsAnew) {
-    server.onNext(challenge(secrets.file("s1")));
+    server.onNext(challenge(secrets.path("s1")));
     expectAccepted();
     getFan();
     EXPECT_EQ(authorization(2), "Local \"" + user + "\"");
 }
 
 TEST_F(CIMClientAuthenticationTest, SendsNoFileThatIsNoSecret) {
-    support::writeFile(other.file("private"), "private");
-    ASSERT_EQ(symlink(other.file("private").c_str(), secrets.file("link").c_str()), 0);
+    support::writeFile(other.path("private"), "private");
+    ASSERT_EQ(symlink(other.path("private").c_str(), secrets.path("link").c_str()), 0);
     const std::string last = secrets.path().substr(secrets.path().rfind('/'));
-    expectRefused(challenge(other.file("private")));
-    expectRefused(challenge(secrets.file("link")));
-    expectRefused(challenge(secrets.file("missing")));
-    expectRefused(challenge(secrets.file(".." + last + "/s1")));
+    expectRefused(challenge(other.path("private")));
+    expectRefused(challenge(secrets.path("link")));
+    expectRefused(challenge(secrets.path("missing")));
+    expectRefused(challenge(secrets.path(".." + last + "/s1")));
     expectRefused(challenge("/etc/passwd"));
     if (geteuid() == 0) {
-        support::writeFile(secrets.file("stranger"), "private");
-        ASSERT_EQ(chown(secrets.file("stranger").c_str(), 12345, 12345), 0);
-        expectRefused(challenge(secrets.file("stranger")));
+        support::writeFile(secrets.path("stranger"), "private");
+        ASSERT_EQ(chown(secrets.path("stranger").c_str(), 12345, 12345), 0);
+        expectRefused(challenge(secrets.path("stranger")));
     }
 }
 
 TEST_F(CIMClientAuthenticationTest, FindsItsChallengeAmongOthers) {
     server.onNext(Reply::http(401, {{"WWW-Authenticate", "Basic realm=\"x\""},
-                                    {"WWW-Authenticate", "Local \"" + secrets.file("s1") + "\""}}));
+                                    {"WWW-Authenticate", "Local \"" + secrets.path("s1") + "\""}}));
     expectAccepted();
 }
 
@@ -146,7 +146,7 @@ TEST_F(CIMClientAuthenticationTest, AnswersNoOtherScheme) {
 
 TEST_F(CIMClientAuthenticationTest, BothRequestsShareOneTimeout) {
     client.setTimeout(300);
-    server.onNext(challenge(secrets.file("s1")));
+    server.onNext(challenge(secrets.path("s1")));
     server.onNext(Reply::silence());
     const Stopwatch watch;
     EXPECT_THROW(getFan(), ConnectionTimeoutException);

@@ -46,7 +46,7 @@ bool hasChildren() {
 }
 
 std::string script(const support::TempDirectory& directory, const std::string& commands) {
-    std::string path = directory.file("server");
+    std::string path = directory.path("server");
     support::writeFile(path, "#!/bin/sh\n" + commands);
     chmod(path.c_str(), 0700);
     return path;
@@ -67,20 +67,20 @@ TEST(ChildProcessTest, RunsTheProgramAndReapsIt) {
 TEST(ChildProcessTest, SaysWhyAProgramCannotBeRun) {
     const std::size_t before = openDescriptorCount();
     const support::TempDirectory directory;
-    support::writeFile(directory.file("text"), "text");
+    support::writeFile(directory.path("text"), "text");
     const auto start = [&](const std::string& program) {
         return messageOf<CannotConnectException>([&] {
             Ends ends = makeEnds();
             const ChildProcess child(program, std::move(ends.child), Deadline(5000));
         });
     };
-    EXPECT_EQ(start(directory.file("none")),
-              "Cannot start " + directory.file("none") + ": No such file or directory");
-    EXPECT_EQ(start(directory.file("text")),
-              "Cannot start " + directory.file("text") + ": Permission denied");
-    chmod(directory.file("text").c_str(), 0700);
-    EXPECT_EQ(start(directory.file("text")),
-              "Cannot start " + directory.file("text") + ": Exec format error");
+    EXPECT_EQ(start(directory.path("none")),
+              "Cannot start " + directory.path("none") + ": No such file or directory");
+    EXPECT_EQ(start(directory.path("text")),
+              "Cannot start " + directory.path("text") + ": Permission denied");
+    chmod(directory.path("text").c_str(), 0700);
+    EXPECT_EQ(start(directory.path("text")),
+              "Cannot start " + directory.path("text") + ": Exec format error");
     EXPECT_EQ(openDescriptorCount(), before);
     EXPECT_FALSE(hasChildren());
 }

@@ -54,41 +54,41 @@ class LocalSecretTest : public testing::Test {
 };
 
 TEST_F(LocalSecretTest, JoinsTheLines) {
-    writeFile(known.file("s"), "abc\ndef\r\n123");
-    EXPECT_EQ(secretIn(known.file("s")), "abcdef123");
+    writeFile(known.path("s"), "abc\ndef\r\n123");
+    EXPECT_EQ(secretIn(known.path("s")), "abcdef123");
 }
 
 TEST_F(LocalSecretTest, OnlyAFileDirectlyInAKnownDirectory) {
-    writeFile(other.file("s"), "secret");
-    mkdir(known.file("sub").c_str(), 0700);
-    writeFile(known.file("sub/s"), "secret");
-    writeFile(known.file("s"), "secret");
+    writeFile(other.path("s"), "secret");
+    mkdir(known.path("sub").c_str(), 0700);
+    writeFile(known.path("sub/s"), "secret");
+    writeFile(known.path("s"), "secret");
     const std::string parent = known.path().substr(0, known.path().rfind('/'));
     const std::string last = known.path().substr(known.path().rfind('/') + 1);
     for (const std::string& file :
-         {other.file("s"), known.file("sub/s"), known.file("../" + last + "/s"), known.file("./s"),
-          known.file("/s"), "/" + known.path() + "/s", parent + "/./" + last + "/s",
-          known.file("sub/../s"), known.path(), known.path() + "/", known.file("."),
-          known.file(".."), std::string("s"), std::string(""), std::string("/"),
+         {other.path("s"), known.path("sub/s"), known.path("../" + last + "/s"), known.path("./s"),
+          known.path("/s"), "/" + known.path() + "/s", parent + "/./" + last + "/s",
+          known.path("sub/../s"), known.path(), known.path() + "/", known.path("."),
+          known.path(".."), std::string("s"), std::string(""), std::string("/"),
           std::string("/etc/passwd")}) {
         EXPECT_EQ(secretIn(file), kNone) << file;
     }
 }
 
 TEST_F(LocalSecretTest, NoSymbolicLinkNorSecondName) {
-    writeFile(other.file("s"), "secret");
-    ASSERT_EQ(symlink(other.file("s").c_str(), known.file("soft").c_str()), 0);
-    ASSERT_EQ(link(other.file("s").c_str(), known.file("hard").c_str()), 0);
-    EXPECT_EQ(secretIn(known.file("soft")), kNone);
-    EXPECT_EQ(secretIn(known.file("hard")), kNone);
+    writeFile(other.path("s"), "secret");
+    ASSERT_EQ(symlink(other.path("s").c_str(), known.path("soft").c_str()), 0);
+    ASSERT_EQ(link(other.path("s").c_str(), known.path("hard").c_str()), 0);
+    EXPECT_EQ(secretIn(known.path("soft")), kNone);
+    EXPECT_EQ(secretIn(known.path("hard")), kNone);
 }
 
 TEST_F(LocalSecretTest, OnlyARegularFile) {
-    ASSERT_EQ(mkfifo(known.file("fifo").c_str(), 0600), 0);
-    mkdir(known.file("directory").c_str(), 0700);
-    EXPECT_EQ(secretIn(known.file("fifo")), kNone);
-    EXPECT_EQ(secretIn(known.file("directory")), kNone);
-    EXPECT_EQ(secretIn(known.file("missing")), kNone);
+    ASSERT_EQ(mkfifo(known.path("fifo").c_str(), 0600), 0);
+    mkdir(known.path("directory").c_str(), 0700);
+    EXPECT_EQ(secretIn(known.path("fifo")), kNone);
+    EXPECT_EQ(secretIn(known.path("directory")), kNone);
+    EXPECT_EQ(secretIn(known.path("missing")), kNone);
 }
 
 TEST_F(LocalSecretTest, OnlyAFileOfATrustedOwner) {
@@ -96,25 +96,25 @@ TEST_F(LocalSecretTest, OnlyAFileOfATrustedOwner) {
         GTEST_SKIP() << "only root can give a file away";
     }
     constexpr uid_t kStranger = 12345;
-    writeFile(known.file("s"), "secret");
-    ASSERT_EQ(chown(known.file("s").c_str(), kStranger, kStranger), 0);
-    EXPECT_EQ(secretIn(known.file("s")), kNone);
-    EXPECT_EQ(readLocalSecret(known.file("s"), {known.path()}, kStranger), "secret");
+    writeFile(known.path("s"), "secret");
+    ASSERT_EQ(chown(known.path("s").c_str(), kStranger, kStranger), 0);
+    EXPECT_EQ(secretIn(known.path("s")), kNone);
+    EXPECT_EQ(readLocalSecret(known.path("s"), {known.path()}, kStranger), "secret");
 }
 
 TEST_F(LocalSecretTest, NoMoreThanFourKibibytes) {
-    writeFile(known.file("full"), std::string(4096, 'x'));
-    writeFile(known.file("over"), std::string(4097, 'x'));
-    EXPECT_EQ(secretIn(known.file("full")), std::string(4096, 'x'));
-    EXPECT_EQ(secretIn(known.file("over")), kNone);
+    writeFile(known.path("full"), std::string(4096, 'x'));
+    writeFile(known.path("over"), std::string(4097, 'x'));
+    EXPECT_EQ(secretIn(known.path("full")), std::string(4096, 'x'));
+    EXPECT_EQ(secretIn(known.path("over")), kNone);
 }
 
 TEST_F(LocalSecretTest, OnlyTextThatFitsIntoAHeader) {
     for (const std::string& content :
          {std::string(""), std::string("\n"), std::string("a\"b"), std::string("a\tb"),
           std::string("a\0b", 3), std::string("a\xC3\xA9")}) {
-        writeFile(known.file("s"), content);
-        EXPECT_EQ(secretIn(known.file("s")), kNone) << content;
+        writeFile(known.path("s"), content);
+        EXPECT_EQ(secretIn(known.path("s")), kNone) << content;
     }
 }
 

@@ -108,11 +108,11 @@ TEST_F(LocalConnectorTest, TakesTheSocketThatTheEnvironmentNames) {
 TEST_F(LocalConnectorTest, TheNamedSocketIsTheOnlyOne) {
     FakeCimServer known;
     places.sockets = {known.socketPath()};
-    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.file("none"));
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.path("none"));
     const ScopedEnvironment childAllowed("CIM_EMBEDDED");
     const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
     const std::string message = messageOf<CannotConnectException>([&] { connect(); });
-    EXPECT_EQ(message, "Cannot connect to CIM server: " + directory.file("none") +
+    EXPECT_EQ(message, "Cannot connect to CIM server: " + directory.path("none") +
                            ": No such file or directory");
     EXPECT_EQ(known.connectionCount(), 0U);
 }
@@ -126,7 +126,7 @@ TEST_F(LocalConnectorTest, AnEmptyNameIsNoName) {
 
 TEST_F(LocalConnectorTest, TheNamedSocketMayBeALinkOrHaveALongPath) {
     FakeCimServer server;
-    const std::string deep = directory.file(std::string(200, 'd'));
+    const std::string deep = directory.path(std::string(200, 'd'));
     std::filesystem::create_directory(deep);
     std::filesystem::create_symlink(server.socketPath(), deep + "/link");
     const ScopedEnvironment name("CIM_LOCAL_SOCKET", deep + "/link");
@@ -134,16 +134,16 @@ TEST_F(LocalConnectorTest, TheNamedSocketMayBeALinkOrHaveALongPath) {
 }
 
 TEST_F(LocalConnectorTest, ANamedFileThatIsNoSocketIsRefused) {
-    support::writeFile(directory.file("f"), "");
-    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.file("f"));
+    support::writeFile(directory.path("f"), "");
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.path("f"));
     EXPECT_THROW(connect(), CannotConnectException);
 }
 
 TEST_F(LocalConnectorTest, TakesTheFirstKnownSocketThatAnswers) {
     FakeCimServer first;
     FakeCimServer second;
-    leaveStaleSocket(directory.file("stale"));
-    places.sockets = {directory.file("missing"), directory.file("stale"), first.socketPath(),
+    leaveStaleSocket(directory.path("stale"));
+    places.sockets = {directory.path("missing"), directory.path("stale"), first.socketPath(),
                       second.socketPath()};
     EXPECT_TRUE(connect().socket.isOpen());
     EXPECT_EQ(second.connectionCount(), 0U);
@@ -151,23 +151,23 @@ TEST_F(LocalConnectorTest, TakesTheFirstKnownSocketThatAnswers) {
 
 TEST_F(LocalConnectorTest, AKnownSocketThatIsALinkDoesNotCount) {
     FakeCimServer server;
-    std::filesystem::create_symlink(server.socketPath(), directory.file("link"));
-    places.sockets = {directory.file("link")};
+    std::filesystem::create_symlink(server.socketPath(), directory.path("link"));
+    places.sockets = {directory.path("link")};
     EXPECT_THROW(connect(), CannotConnectException);
     EXPECT_EQ(server.connectionCount(), 0U);
 }
 
 TEST_F(LocalConnectorTest, AStaleSocketMeansThatAServerIsInstalled) {
-    leaveStaleSocket(directory.file("stale"));
-    places.sockets = {directory.file("stale")};
+    leaveStaleSocket(directory.path("stale"));
+    places.sockets = {directory.path("stale")};
     const ScopedEnvironment childAllowed("CIM_EMBEDDED");
     const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
     EXPECT_EQ(messageOf<CannotConnectException>([&] { connect(); }),
-              "Cannot connect to CIM server: " + directory.file("stale") + ": Connection refused");
+              "Cannot connect to CIM server: " + directory.path("stale") + ": Connection refused");
 }
 
 TEST_F(LocalConnectorTest, AnInstalledProgramForbidsTheChild) {
-    places.programs = {directory.file("missing"), "/bin/sh"};
+    places.programs = {directory.path("missing"), "/bin/sh"};
     const ScopedEnvironment childAllowed("CIM_EMBEDDED");
     const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
     EXPECT_EQ(messageOf<CannotConnectException>([&] { connect(); }),
@@ -175,9 +175,9 @@ TEST_F(LocalConnectorTest, AnInstalledProgramForbidsTheChild) {
 }
 
 TEST_F(LocalConnectorTest, StartsAChildWhenNothingIsInstalled) {
-    places.sockets = {directory.file("missing")};
-    places.programs = {directory.file("missing")};
-    places.embeddedPrograms = {directory.file("missing"), FAKE_CIMOMD};
+    places.sockets = {directory.path("missing")};
+    places.programs = {directory.path("missing")};
+    places.embeddedPrograms = {directory.path("missing"), FAKE_CIMOMD};
     const ScopedEnvironment childAllowed("CIM_EMBEDDED");
     const ServerConnection connection = connect();
     EXPECT_TRUE(connection.socket.isOpen());
@@ -186,7 +186,7 @@ TEST_F(LocalConnectorTest, StartsAChildWhenNothingIsInstalled) {
 }
 
 TEST_F(LocalConnectorTest, TheEnvironmentNamesTheProgramToStart) {
-    places.embeddedPrograms = {directory.file("missing")};
+    places.embeddedPrograms = {directory.path("missing")};
     const ScopedEnvironment childAllowed("CIM_EMBEDDED");
     const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
     EXPECT_NE(connect().child, nullptr);
@@ -199,7 +199,7 @@ TEST_F(LocalConnectorTest, TheChildCanBeForbidden) {
 }
 
 TEST_F(LocalConnectorTest, SaysWhenThereIsNoProgramToStart) {
-    places.embeddedPrograms = {directory.file("missing")};
+    places.embeddedPrograms = {directory.path("missing")};
     const ScopedEnvironment childAllowed("CIM_EMBEDDED");
     EXPECT_EQ(messageOf<CannotConnectException>([&] { connect(); }),
               "No CIM server on this machine, and no cimomd to start");
@@ -210,17 +210,17 @@ TEST_F(LocalConnectorTest, AServerOfAnotherUserIsNotTrusted) {
         GTEST_SKIP() << "only root can be another user";
     }
     std::filesystem::permissions(directory.path(), std::filesystem::perms::all);
-    const StrangersServer stranger(directory.file("s"));
+    const StrangersServer stranger(directory.path("s"));
     {
-        const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.file("s"));
+        const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.path("s"));
         EXPECT_EQ(messageOf<CannotConnectException>([&] { connect(); }),
-                  "Cannot connect to CIM server: " + directory.file("s") +
+                  "Cannot connect to CIM server: " + directory.path("s") +
                       ": its server runs neither as root nor as this user");
     }
     // Even a socket file that was given to root does not make its listener root.
-    ASSERT_EQ(chown(directory.file("s").c_str(), 0, 0), 0);
+    ASSERT_EQ(chown(directory.path("s").c_str(), 0, 0), 0);
     FakeCimServer server;
-    places.sockets = {directory.file("s"), server.socketPath()};
+    places.sockets = {directory.path("s"), server.socketPath()};
     EXPECT_TRUE(connect().socket.isOpen());
 }
 
@@ -228,20 +228,20 @@ TEST_F(LocalConnectorTest, AStrangersSocketKeepsNobodyFromTheChild) {
     if (geteuid() != 0) {
         GTEST_SKIP() << "only root can be another user";
     }
-    leaveStaleSocket(directory.file("s"));
-    ASSERT_EQ(chown(directory.file("s").c_str(), kStranger, kStranger), 0);
-    places.sockets = {directory.file("s")};
+    leaveStaleSocket(directory.path("s"));
+    ASSERT_EQ(chown(directory.path("s").c_str(), kStranger, kStranger), 0);
+    places.sockets = {directory.path("s")};
     const ScopedEnvironment childAllowed("CIM_EMBEDDED");
     const ScopedEnvironment command("CIM_COMMAND", FAKE_CIMOMD);
     EXPECT_NE(connect().child, nullptr);
 }
 
 TEST_F(LocalConnectorTest, AServerThatTakesNoConnectionIsGivenUpAtTheDeadline) {
-    const FileDescriptor listener = listenAt(directory.file("busy"), 0);
+    const FileDescriptor listener = listenAt(directory.path("busy"), 0);
     std::vector<FileDescriptor> waiting;
     for (;;) {
         ConnectResult result =
-            connectUnixSocket(directory.file("busy"), FinalLink::Refuse, Deadline(0));
+            connectUnixSocket(directory.path("busy"), FinalLink::Refuse, Deadline(0));
         if (result.error != 0) {
             EXPECT_EQ(result.error, ETIMEDOUT);
             break;
@@ -249,7 +249,7 @@ TEST_F(LocalConnectorTest, AServerThatTakesNoConnectionIsGivenUpAtTheDeadline) {
         waiting.push_back(std::move(result.socket));
         ASSERT_LT(waiting.size(), 100U);
     }
-    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.file("busy"));
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.path("busy"));
     const Stopwatch watch;
     EXPECT_THROW(connect(150), ConnectionTimeoutException);
     EXPECT_GE(watch.milliseconds(), 150);

@@ -29,20 +29,20 @@ TEST(UnixSocketTest, ConnectsWithoutBlockingAndWithoutLeakingIntoPrograms) {
 
 TEST(UnixSocketTest, SaysWhyNot) {
     const support::TempDirectory directory;
-    support::writeFile(directory.file("f"), "");
+    support::writeFile(directory.path("f"), "");
     const Deadline deadline(1000);
-    EXPECT_EQ(connectUnixSocket(directory.file("none"), FinalLink::Follow, deadline).error, ENOENT);
-    EXPECT_EQ(connectUnixSocket(directory.file("f"), FinalLink::Follow, deadline).error, ENOTSOCK);
+    EXPECT_EQ(connectUnixSocket(directory.path("none"), FinalLink::Follow, deadline).error, ENOENT);
+    EXPECT_EQ(connectUnixSocket(directory.path("f"), FinalLink::Follow, deadline).error, ENOTSOCK);
     EXPECT_EQ(connectUnixSocket(directory.path(), FinalLink::Follow, deadline).error, ENOTSOCK);
 }
 
 TEST(UnixSocketTest, FollowsALinkOnlyWhenTold) {
     const support::FakeCimServer server;
     const support::TempDirectory directory;
-    ASSERT_EQ(symlink(server.socketPath().c_str(), directory.file("link").c_str()), 0);
+    ASSERT_EQ(symlink(server.socketPath().c_str(), directory.path("link").c_str()), 0);
     const Deadline deadline(1000);
-    EXPECT_EQ(connectUnixSocket(directory.file("link"), FinalLink::Follow, deadline).error, 0);
-    EXPECT_EQ(connectUnixSocket(directory.file("link"), FinalLink::Refuse, deadline).error,
+    EXPECT_EQ(connectUnixSocket(directory.path("link"), FinalLink::Follow, deadline).error, 0);
+    EXPECT_EQ(connectUnixSocket(directory.path("link"), FinalLink::Refuse, deadline).error,
               ENOTSOCK);
 }
 

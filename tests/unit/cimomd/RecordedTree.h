@@ -2,28 +2,20 @@
 
 // A machine's files below a directory of their own, for the time of one test.
 
-#include <gtest/gtest.h>
-
-#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <string>
 #include <string_view>
 
+#include "support/TempDirectory.h"
 #include "system/SystemPaths.h"
 
 namespace cimomd {
 
 class RecordedTree {
-  public:
-    RecordedTree() {
-        std::string pattern = (std::filesystem::temp_directory_path() / "machine-XXXXXX").string();
-        root = ::mkdtemp(pattern.data());
-    }
-    ~RecordedTree() { std::filesystem::remove_all(root); }
-    RecordedTree(const RecordedTree&) = delete;
-    RecordedTree& operator=(const RecordedTree&) = delete;
+    support::TempDirectory place;
 
+  public:
     RecordedTree& file(const std::string& path, std::string_view text) {
         const std::filesystem::path full = root / path;
         std::filesystem::create_directories(full.parent_path());
@@ -37,7 +29,7 @@ class RecordedTree {
 
     SystemPaths paths() const { return SystemPaths(root); }
 
-    std::filesystem::path root;
+    const std::filesystem::path root = place.path();
 };
 
 }  // namespace cimomd

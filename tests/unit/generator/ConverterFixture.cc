@@ -4,17 +4,6 @@ namespace generatortest {
 
 using namespace Pegasus;
 
-std::string crlf(const std::string& text) {
-    std::string result;
-    for (char c : text) {
-        if (c == '\n') {
-            result += '\r';
-        }
-        result += c;
-    }
-    return result;
-}
-
 Array<String> strings(std::initializer_list<const char*> texts) {
     Array<String> result;
     for (const char* text : texts) {

@@ -17,6 +17,7 @@
 #include "CimScriptParser/CimScriptParser.h"
 #include "SennetConverter/framework/CimInstanceLists.h"
 #include "support/Files.h"
+#include "support/LineEnds.h"
 #include "support/TempDirectory.h"
 
 namespace generatortest {
@@ -26,8 +27,7 @@ inline std::string utf8(const Pegasus::String& text) {
     return std::string(static_cast<const char*>(text.getCString()));
 }
 
-/// The text with CR LF in place of every LF.
-std::string crlf(const std::string& text);
+using support::crlf;
 
 template <typename T>
 Pegasus::Array<T> arrayOf(std::initializer_list<T> elements) {

@@ -1,3 +1,4 @@
+#include "support/TempDirectory.h"
 #include "velmclient/FileDescriptor.h"
 
 #include <fcntl.h>
@@ -12,10 +13,10 @@
 #include <thread>
 #include <utility>
 
-#include "TempDirectory.h"
-
 namespace Velm {
 namespace {
+
+using support::TempDirectory;
 
 bool isOpen(int descriptor) {
     return ::fcntl(descriptor, F_GETFD) >= 0;

@@ -6,10 +6,12 @@
 #include <string>
 
 #include "ChildProcess.h"
-#include "TempDirectory.h"
+#include "support/TempDirectory.h"
 
 namespace Velm {
 namespace {
+
+using support::TempDirectory;
 
 // All answers in a process of its own, since a process reads its configuration once.
 std::string answersWith(const std::string& configurationFile) {

@@ -10,12 +10,13 @@
 
 #include "ChildProcess.h"
 #include "SyslogSpy.h"
-#include "TempDirectory.h"
+#include "support/TempDirectory.h"
 
 namespace Velm {
 namespace {
 
 using namespace std::string_view_literals;
+using support::TempDirectory;
 
 constexpr std::size_t kMebibyte = 1024 * 1024;
 

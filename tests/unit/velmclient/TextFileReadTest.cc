@@ -8,14 +8,15 @@
 #include <vector>
 
 #include "SyslogSpy.h"
-#include "TempDirectory.h"
 #include "Velm/TextFile.h"
+#include "support/TempDirectory.h"
 
 namespace Velm {
 namespace {
 
 using namespace std::string_literals;
 using namespace std::string_view_literals;
+using support::TempDirectory;
 using testing::ElementsAre;
 using testing::IsEmpty;
 

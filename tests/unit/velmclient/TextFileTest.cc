@@ -10,11 +10,12 @@
 
 #include "ChildProcess.h"
 #include "SyslogSpy.h"
-#include "TempDirectory.h"
+#include "support/TempDirectory.h"
 
 namespace Velm {
 namespace {
 
+using support::TempDirectory;
 using testing::ElementsAre;
 using testing::IsEmpty;
 

@@ -13,12 +13,13 @@
 
 #include "ChildProcess.h"
 #include "SyslogSpy.h"
-#include "TempDirectory.h"
 #include "Velm/TextFile.h"
+#include "support/TempDirectory.h"
 
 namespace Velm {
 namespace {
 
+using support::TempDirectory;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
