@@ -251,7 +251,7 @@ MofType MofParser::parseType() {
         throw MofError(file, className.position, describe(className), "a type");
     take();
     type.type = Pegasus::CIMTYPE_REFERENCE;
-    type.referenceClass = className.text;
+    type.referenceClass = utf8::clean(className.text);
     return type;
 }
 

@@ -218,6 +218,14 @@ TEST_F(MofCompilerTest, namesTheIncludedFileInErrors) {
     }
 }
 
+// Bytes that are no UTF-8 in the class name of a reference once left the compiler as an exception
+// that nobody caught.
+TEST_F(MofCompilerTest, takesBytesThatAreNotUtf8InTheClassOfAReference) {
+    compile("class T { B\xFF ref other; };");
+    const Pegasus::CIMConstProperty other = compiledClass("T").getProperty(0);
+    EXPECT_EQ(utf8Of(other.getReferenceClassName().getString()), "B\xEF\xBF\xBD");
+}
+
 TEST_F(MofCompilerTest, endsAnIncludeOfItself) {
     RecordedTree tree;
     tree.file("main.mof", "#pragma include (\"main.mof\")\n");
