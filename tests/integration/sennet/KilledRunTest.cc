@@ -10,17 +10,16 @@
 
 #include "integration/sennet/BackgroundProgram.h"
 #include "integration/sennet/CimXml.h"
-#include "integration/sennet/SennetSetup.h"
+#include "integration/sennet/MifFileFixture.h"
 #include "support/Files.h"
 
 namespace {
 
 using namespace std::chrono_literals;
-using support::FakeCimServer;
 using support::Reply;
 using Names = std::vector<std::string>;
 
-class KilledRunTest : public ::testing::Test {
+class KilledRunTest : public MifFileFixture {
   protected:
     KilledRunTest() {
         for (const char* name : {"a", "b", "c"}) {
@@ -34,9 +33,9 @@ class KilledRunTest : public ::testing::Test {
         }
     }
 
-    void leaveFilesOfAnEarlierRun() const {
+    void leaveFilesOfAnEarlierRun() {
         for (const char* name : {"a.mif", "b.mif", "c.mif", "kwvinv.mif"}) {
-            setup.leaveMifFile(name, "earlier, whole");
+            leaveMifFile(name, "earlier, whole");
         }
     }
 
@@ -52,27 +51,23 @@ class KilledRunTest : public ::testing::Test {
     }
 
     std::string file(const char* name) const { return support::readFile(setup.mifFile(name)); }
-
-    SennetSetup setup;
-    FakeCimServer server;
 };
 
 TEST_F(KilledRunTest, ShowsEachLineThroughAPipeAtOnce) {
     server.onGetClass("CIM_c", Reply::silence());
-    BackgroundProgram run(SennetSetup::program(), "/SMS", setup.environment(server.socketPath()));
+    BackgroundProgram program = start("/SMS");
     const std::string expected = setup.start() + "Processing a...\nProcessing b...\n";
-    EXPECT_EQ(run.readUntil(expected, 20s), expected);
+    EXPECT_EQ(program.readUntil(expected, 20s), expected);
 }
 
 TEST_F(KilledRunTest, LeavesFilesWholeWhenKilledWhileTheServerIsSilent) {
     leaveFilesOfAnEarlierRun();
     server.onEnumerateInstances("CIM_c", Reply::silence());
     {
-        BackgroundProgram run(SennetSetup::program(), "/SMS",
-                              setup.environment(server.socketPath()));
+        BackgroundProgram program = start("/SMS");
         const std::string expected = setup.start() + "Processing a...\nProcessing b...\n";
-        ASSERT_EQ(run.readUntil(expected, 20s), expected);
-        run.kill();
+        ASSERT_EQ(program.readUntil(expected, 20s), expected);
+        program.kill();
     }
     EXPECT_EQ(visibleNames(), (Names{"a.mif", "b.mif", "c.mif", "kwvinv.mif"}));
     // The converter of a script is closed when the next script is written.
@@ -85,11 +80,10 @@ TEST_F(KilledRunTest, KeepsTheCombinedFileOfAnEarlierRun) {
     leaveFilesOfAnEarlierRun();
     server.onGetClass("CIM_c", Reply::silence());
     {
-        BackgroundProgram run(SennetSetup::program(), "/CA",
-                              setup.environment(server.socketPath()));
+        BackgroundProgram program = start("/CA");
         const std::string expected = setup.start() + "Processing a...\nProcessing b...\n";
-        ASSERT_EQ(run.readUntil(expected, 20s), expected);
-        run.kill();
+        ASSERT_EQ(program.readUntil(expected, 20s), expected);
+        program.kill();
     }
     EXPECT_EQ(file("kwvinv.mif"), "earlier, whole");
 }
@@ -97,11 +91,10 @@ TEST_F(KilledRunTest, KeepsTheCombinedFileOfAnEarlierRun) {
 TEST_F(KilledRunTest, ShowsNoHalfFileWhenThereWasNone) {
     server.onGetClass("CIM_b", Reply::silence());
     {
-        BackgroundProgram run(SennetSetup::program(), "/SMS",
-                              setup.environment(server.socketPath()));
+        BackgroundProgram program = start("/SMS");
         const std::string expected = setup.start() + "Processing a...\n";
-        ASSERT_EQ(run.readUntil(expected, 20s), expected);
-        run.kill();
+        ASSERT_EQ(program.readUntil(expected, 20s), expected);
+        program.kill();
     }
     EXPECT_EQ(visibleNames(), Names{});
 }
@@ -111,11 +104,11 @@ TEST_F(KilledRunTest, LeavesFilesWholeWhenKilledAtAnyMoment) {
     for (int moment = 0; moment < 60; ++moment) {
         leaveFilesOfAnEarlierRun();
         {
-            BackgroundProgram run(SennetSetup::program(), "/SMS",
-                                  setup.environment(server.socketPath()));
+            BackgroundProgram program = start("/SMS");
             std::this_thread::sleep_for(moment * 700us);
-            run.kill();
+            program.kill();
         }
+        expectReadableFiles();
         ASSERT_EQ(visibleNames(), all) << moment;
         for (const char* name : {"a", "b", "c"}) {
             const std::string bytes = support::readFile(setup.mifFile(name + std::string(".mif")));

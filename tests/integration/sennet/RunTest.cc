@@ -7,12 +7,11 @@
 #include <vector>
 
 #include "integration/sennet/CimXml.h"
-#include "integration/sennet/SennetSetup.h"
+#include "integration/sennet/MifFileFixture.h"
 #include "support/Files.h"
 
 namespace {
 
-using support::FakeCimServer;
 using support::ProgramResult;
 using support::RecordedRequest;
 using support::Reply;
@@ -32,7 +31,7 @@ bool hasParameter(const RecordedRequest& request, const std::string& name,
     return element.find(value) != std::string::npos;
 }
 
-class RunTest : public ::testing::Test {
+class RunTest : public MifFileFixture {
   protected:
     RunTest() {
         server.onGetClass("CIM_Fan", Reply::ok(namedClass("CIM_Fan")));
@@ -40,15 +39,12 @@ class RunTest : public ::testing::Test {
     }
 
     /// Runs and expects these lines after the start of the run.
-    void expectRun(const std::string& lines, const std::string& type = "/SMS") const {
-        const ProgramResult result = setup.run({type}, server);
+    void expectRun(const std::string& lines, const std::string& type = "/SMS") {
+        const ProgramResult result = run(type);
         EXPECT_EQ(result.exitStatus, 0);
         EXPECT_EQ(result.out, setup.start() + lines);
         EXPECT_EQ(result.err, "");
     }
-
-    SennetSetup setup;
-    FakeCimServer server;
 };
 
 TEST_F(RunTest, AsksForClassAndInstancesInSlotOrder) {
@@ -57,6 +53,8 @@ TEST_F(RunTest, AsksForClassAndInstancesInSlotOrder) {
     setup.addScript("all.script.inv",
                     "[DEFAULT]\ndefaultnamespace=root/first\n"
                     "[CIM]\nG[5]=CIM_Card\nN[5]=/root/second\nG[1]=CIM_Fan\nA[1]=Name\n");
+    // A class without properties has a place in the rows, one more than the group's attributes.
+    expectUnreadable("all.mif", "27:17: row of more values than the 2 attributes of its group");
     expectRun("Processing all...\n");
 
     const std::vector<RecordedRequest> requests = server.requests();
@@ -122,9 +120,9 @@ TEST_F(RunTest, ReplacesAndRemovesFilesOfAnEarlierRun) {
     server.onEnumerateInstances("CIM_Card", Reply::ok(""));
     setup.addScript("card.script.inv", "[CIM]\nG[0]=CIM_Card\nA[0]=Name\n");
     setup.addScript("fan.script.inv", kFanScript);
-    setup.leaveMifFile("card.mif", "stale card");
-    setup.leaveMifFile("fan.mif", "stale fan, much longer than anything\r\n");
-    setup.leaveMifFile("other.mif", "not ours");
+    leaveMifFile("card.mif", "stale card");
+    leaveMifFile("fan.mif", "stale fan, much longer than anything\r\n");
+    leaveMifFile("other.mif", "not ours");
     expectRun("Deleting card...\nProcessing fan...\n");
     EXPECT_EQ(setup.mifNames(), (Names{"fan.mif", "other.mif"}));
     EXPECT_EQ(support::readFile(setup.mifFile("fan.mif")), namedMif("fan", "f1"));
@@ -134,11 +132,11 @@ TEST_F(RunTest, ReplacesAndRemovesFilesOfAnEarlierRun) {
 TEST_F(RunTest, RemovesTheCombinedFilesWhenNoScriptHasInstances) {
     server.onEnumerateInstances("CIM_Fan", Reply::ok(""));
     setup.addScript("fan.script.inv", kFanScript);
-    setup.leaveMifFile("kwvinv.mif", "stale");
-    setup.leaveMifFile("kwinvlumo.mif", "stale");
+    leaveMifFile("kwvinv.mif", "stale");
+    leaveMifFile("kwinvlumo.mif", "stale");
     expectRun("Deleting fan...\n", "/QVE");
     EXPECT_EQ(setup.mifNames(), Names{});
-    setup.leaveMifFile("kwvinv.mif", "stale");
+    leaveMifFile("kwvinv.mif", "stale");
     expectRun("Deleting fan...\n", "/CA");
     EXPECT_EQ(setup.mifNames(), Names{});
 }
@@ -155,7 +153,7 @@ TEST_F(RunTest, LeavesARefusedClassOut) {
 
 TEST_F(RunTest, DeletesForAScriptWhoseClassesAreAllRefused) {
     setup.addScript("gone.script.inv", "[CIM]\nG[0]=CIM_Gone\nG[1]=CIM_Lost\n");
-    setup.leaveMifFile("gone.mif", "stale");
+    leaveMifFile("gone.mif", "stale");
     expectRun("Deleting gone...\n");
     EXPECT_EQ(setup.mifNames(), Names{});
 }
@@ -163,7 +161,7 @@ TEST_F(RunTest, DeletesForAScriptWhoseClassesAreAllRefused) {
 TEST_F(RunTest, AbandonsAScriptWithASlotOfTen) {
     setup.addScript("a.script.inv", "[CIM]\nG[0]=CIM_Fan\nA[0]=Name\nG[10]=CIM_Fan\n");
     setup.addScript("b.script.inv", kFanScript);
-    setup.leaveMifFile("a.mif", "earlier");
+    leaveMifFile("a.mif", "earlier");
     expectRun("Processing b...\n");
     EXPECT_EQ(support::readFile(setup.mifFile("a.mif")), "earlier");
     EXPECT_EQ(support::readFile(setup.mifFile("b.mif")), namedMif("b", "f1"));
@@ -180,7 +178,7 @@ TEST_F(RunTest, AbandonsAScriptWithAnIllegalNamespaceOrClassName) {
     setup.addScript("a.script.inv", std::string(kFanScript) + "N[0]=root//x\n");
     setup.addScript("b.script.inv", "[CIM]\nG[0] = CIM_Fan\n");
     setup.addScript("c.script.inv", kFanScript);
-    setup.leaveMifFile("a.mif", "earlier");
+    leaveMifFile("a.mif", "earlier");
     expectRun("Processing c...\n");
     EXPECT_EQ(support::readFile(setup.mifFile("a.mif")), "earlier");
     EXPECT_EQ(setup.mifNames(), (Names{"a.mif", "c.mif"}));
@@ -188,6 +186,7 @@ TEST_F(RunTest, AbandonsAScriptWithAnIllegalNamespaceOrClassName) {
 
 TEST_F(RunTest, WritesOnlyTheGroupHeadForATrailingComma) {
     setup.addScript("a.script.inv", "[CIM]\nG[0]=CIM_Fan\nA[0]=Name,\n");
+    expectUnreadable("a.mif", "14:5: expected 'group', found 'component'");
     setup.addScript("b.script.inv", kFanScript);
     expectRun("Processing a...\nProcessing b...\n");
     EXPECT_EQ(support::readFile(setup.mifFile("a.mif")),

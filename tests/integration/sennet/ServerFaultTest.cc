@@ -7,12 +7,11 @@
 #include <vector>
 
 #include "integration/sennet/CimXml.h"
-#include "integration/sennet/SennetSetup.h"
+#include "integration/sennet/MifFileFixture.h"
 #include "support/Files.h"
 
 namespace {
 
-using support::FakeCimServer;
 using support::ProgramResult;
 using support::Reply;
 using Names = std::vector<std::string>;
@@ -39,7 +38,7 @@ std::vector<Fault> brokenAnswers() {
     };
 }
 
-class ServerFaultTest : public ::testing::Test {
+class ServerFaultTest : public MifFileFixture {
   protected:
     ServerFaultTest() {
         setup.addScript("a.script.inv",
@@ -49,11 +48,11 @@ class ServerFaultTest : public ::testing::Test {
         server.onEnumerateInstances("CIM_Fan", Reply::ok(namedInstances("CIM_Fan", {"f1"})));
         server.onGetClass("CIM_Faulty", Reply::ok(namedClass("CIM_Faulty")));
         server.onEnumerateInstances("CIM_Faulty", Reply::ok(namedInstances("CIM_Faulty", {"x1"})));
-        setup.leaveMifFile("a.mif", "earlier");
+        leaveMifFile("a.mif", "earlier");
     }
 
-    void expectRun(const std::string& lines) const {
-        const ProgramResult result = setup.run({"/SMS"}, server);
+    void expectRun(const std::string& lines) {
+        const ProgramResult result = run("/SMS");
         EXPECT_EQ(result.exitStatus, 0);
         EXPECT_EQ(result.out, setup.start() + lines);
         EXPECT_EQ(result.err, "");
@@ -78,9 +77,6 @@ class ServerFaultTest : public ::testing::Test {
         const std::string row = "{ 1, \"f1\"}";
         return mif.replace(mif.find(row), row.size(), "{ 1, \"f1\",}");
     }
-
-    SennetSetup setup;
-    FakeCimServer server;
 };
 
 TEST_F(ServerFaultTest, DropsAClassAtAnyCimErrorOfItsRequest) {
@@ -162,7 +158,7 @@ TEST_F(ServerFaultTest, ReadsAnswersInAnyChunks) {
 TEST_F(ServerFaultTest, DeletesWhenEveryInstanceRequestFails) {
     server.onEnumerateInstances("CIM_Faulty", Reply::http(500, {}));
     server.onEnumerateInstances("CIM_Fan", Reply::cimError(1, "failed"));
-    const ProgramResult result = setup.run({"/SMS"}, server);
+    const ProgramResult result = run("/SMS");
     EXPECT_EQ(result.exitStatus, 0);
     EXPECT_EQ(result.out, setup.start() + "Deleting a...\nDeleting b...\n");
     EXPECT_EQ(setup.mifNames(), Names{});

@@ -7,6 +7,8 @@
 #include <string>
 
 #include "ConverterFixture.h"
+#include "MifFixture.h"
+#include "support/mif/Dialect.h"
 
 namespace {
 
@@ -31,8 +33,10 @@ std::string attribute(const std::string& name, int id, const std::string& type,
            "\n         Value = " + value + "\n      End Attribute\n";
 }
 
-class CaSennetConverterTest : public ConverterFixture {
+class CaSennetConverterTest : public MifFixture {
   protected:
+    CaSennetConverterTest() : MifFixture(Mif::kCaDialect) {}
+
     const CIMClass fanClass = cimClass(
         "CIM_Fan",
         {property("Name", text("spare"), {maxLen(64)}), property("Speed", null(CIMTYPE_UINT16)),
@@ -53,6 +57,7 @@ constexpr const char* kScript =
     "[DEFAULT]\ntitle=T\n[CIM]\nG[0]=CIM_Fan\nA[0]=Name Speed State\nG[1]=CIM_Port\nA[1]=Mac\n";
 
 TEST_F(CaSennetConverterTest, WritesAGroupPerInstanceAndNoTable) {
+    tolerate({Mif::Tolerance::IntegersAsText});
     EXPECT_EQ(convert<CaSennetConverter>(kScript, {{fanClass, {fan("a", 1), fan("b", 2)}},
                                                    {portClass, {port("x"), port("y"), port("z")}}}),
               crlf(kComponent +                                                      //
@@ -104,6 +109,7 @@ TEST_F(CaSennetConverterTest, WritesNothingWithoutInstances) {
 }
 
 TEST_F(CaSennetConverterTest, WritesTheComponentAgainAfterAnAbandonedFirstGroup) {
+    expectUnreadable("15:7: expected 'attribute', found 'component'");
     Inventory one({{portClass, {port("a")}}});
     {
         CaSennetConverter converter(outputName(), properties, 30);

@@ -97,7 +97,8 @@ class ConverterFixture : public ::testing::Test {
     }
 
     Pegasus::String outputName() const { return Pegasus::String(path("out.mif").c_str()); }
-    std::string output() const;
+    /// The bytes of that file.
+    virtual std::string output() const;
     bool outputExists() const { return std::filesystem::exists(path("out.mif")); }
 
     Velm::Properties properties;

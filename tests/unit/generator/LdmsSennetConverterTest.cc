@@ -7,14 +7,18 @@
 #include <string>
 
 #include "ConverterFixture.h"
+#include "MifFixture.h"
+#include "support/mif/Dialect.h"
 
 namespace {
 
 using namespace Pegasus;
 using namespace generatortest;
 
-class LdmsSennetConverterTest : public ConverterFixture {
+class LdmsSennetConverterTest : public MifFixture {
   protected:
+    LdmsSennetConverterTest() : MifFixture(Mif::kLanDeskDialect) {}
+
     std::string type(const CIMProperty& described) {
         return utf8(
             converter.getTypeString(cimClass("CIM_X", {described}), "P", described.getType()));

@@ -7,15 +7,19 @@
 #include <string>
 
 #include "ConverterFixture.h"
+#include "MifFixture.h"
 #include "SennetConverter/mif/QveLumoSennetConverter.h"
+#include "support/mif/Dialect.h"
 
 namespace {
 
 using namespace Pegasus;
 using namespace generatortest;
 
-class QveSennetConverterTest : public ConverterFixture {
+class QveSennetConverterTest : public MifFixture {
   protected:
+    QveSennetConverterTest() : MifFixture(Mif::kQveDialect) {}
+
     std::string value(const CIMProperty& rendered) {
         return utf8(converter.getValueString(rendered.getValue(), rendered.getType(), rendered));
     }
@@ -290,8 +294,10 @@ TEST_F(QveSennetConverterTest, ReplacesHalfACharacterLeftByACut) {
     EXPECT_NE(mif.find("         Name = \"" + kept + "\xEF\xBF\xBD\"\r\n"), std::string::npos);
 }
 
-class QveLumoSennetConverterTest : public ConverterFixture {
+class QveLumoSennetConverterTest : public MifFixture {
   protected:
+    QveLumoSennetConverterTest() : MifFixture(Mif::kQveDialect) {}
+
     QveLumoSennetConverter converter{outputName(), properties, 18};
 };
 
@@ -350,6 +356,7 @@ TEST_F(QveLumoSennetConverterTest, AbbreviatesGroupTableAndAttributeNames) {
 }
 
 TEST_F(QveLumoSennetConverterTest, ComparesNamesBeforeAbbreviatingThem) {
+    tolerate({Mif::Tolerance::RepeatedNames});
     const CIMClass described = cimClass(
         "CIM_X", {property("Drive", CIMValue(Uint8(1))), property("Driver", CIMValue(Uint8(2)))});
     const std::string mif = convert<QveLumoSennetConverter>(

@@ -8,14 +8,18 @@
 #include <vector>
 
 #include "ConverterFixture.h"
+#include "MifFixture.h"
+#include "support/mif/Dialect.h"
 
 namespace {
 
 using namespace Pegasus;
 using namespace generatortest;
 
-class SmsSennetConverterTest : public ConverterFixture {
+class SmsSennetConverterTest : public MifFixture {
   protected:
+    SmsSennetConverterTest() : MifFixture(Mif::kSmsDialect) {}
+
     const CIMClass fanClass =
         cimClass("CIM_Fan", {property("Speed", null(CIMTYPE_UINT16)),
                              property("Name", null(CIMTYPE_STRING), {maxLen(64)})});

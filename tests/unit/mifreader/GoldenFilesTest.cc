@@ -9,7 +9,8 @@
 #include <vector>
 
 #include "support/Files.h"
-#include "support/mif/MifReader.h"
+#include "support/mif/Dialect.h"
+#include "support/mif/Refusal.h"
 
 namespace {
 
@@ -33,15 +34,6 @@ std::vector<fs::path> expectedFiles(const std::string& product) {
         }
     }
     return files;
-}
-
-std::string refusal(const std::string& text, Tolerances tolerances) {
-    try {
-        MifReader(tolerances).read(text);
-    } catch (const Error& error) {
-        return error.what();
-    }
-    return "accepted";
 }
 
 /// A reference is cut to 32 characters once escaped. The one of the workstation loses its closing
@@ -74,25 +66,23 @@ void expectReadable(const std::string& product, Tolerances tolerances,
 
 // An enumeration is declared as text, and without a value it is a bare 0 all the same.
 TEST(GoldenFilesTest, SmsKeepsToTheGrammarButForEnumerationsWithoutAValue) {
-    expectReadable("SMS", {Tolerance::RawLineEnds}, "sensor.mif", Tolerance::IntegersAsText);
+    expectReadable("SMS", kSmsDialect, "sensor.mif", Tolerance::IntegersAsText);
 }
 
 TEST(GoldenFilesTest, LanDeskWritesIntegersWhereItDeclaresText) {
-    expectReadable("LD", {Tolerance::RawLineEnds, Tolerance::IntegersAsText}, "sensor.mif",
-                   Tolerance::EmptyDates);
+    expectReadable("LD", kLanDeskDialect, "sensor.mif", Tolerance::EmptyDates);
 }
 
 TEST(GoldenFilesTest, CaKeepsBackslashesPlain) {
-    expectReadable("CA", {Tolerance::RawLineEnds, Tolerance::PlainBackslashes}, "kwvinv.mif",
-                   Tolerance::IntegersAsText);
+    expectReadable("CA", kCaDialect, "kwvinv.mif", Tolerance::IntegersAsText);
 }
 
 TEST(GoldenFilesTest, QveDeclaresAndWritesTextOnly) {
     for (const fs::path& file : expectedFiles("QVE")) {
-        const Tolerances tolerances =
-            file.filename() == "kwinvlumo.mif"
-                ? Tolerances{Tolerance::RawLineEnds, Tolerance::RepeatedNames}
-                : Tolerances{Tolerance::RawLineEnds};
+        Tolerances tolerances = kQveDialect;
+        if (file.filename() == "kwinvlumo.mif") {
+            tolerances.add(Tolerance::RepeatedNames);
+        }
         EXPECT_EQ(refusal(support::readFile(file), tolerances), "accepted") << file;
     }
     EXPECT_THAT(expectedFiles("QVE"), Not(IsEmpty()));
@@ -101,8 +91,7 @@ TEST(GoldenFilesTest, QveDeclaresAndWritesTextOnly) {
 TEST(GoldenFilesTest, ACutReferenceMakesAFileUnreadable) {
     const fs::path cpu =
         fs::path(TEST_SOURCE_DIR) / "golden" / "workstation" / "expected" / "SMS" / "cpu.mif";
-    EXPECT_THAT(refusal(support::readFile(cpu), {Tolerance::RawLineEnds}),
-                HasSubstr("line end in a literal"));
+    EXPECT_THAT(refusal(support::readFile(cpu), kSmsDialect), HasSubstr("line end in a literal"));
 }
 
 }  // namespace
