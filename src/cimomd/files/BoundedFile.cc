@@ -39,6 +39,12 @@ bool meansAbsent(int error) {
     return error == ENOENT || error == ENOTDIR || error == ENODEV || error == ESRCH;
 }
 
+FileStatus failureOf(int error) {
+    if (meansAbsent(error))
+        return FileStatus::Absent;
+    return error == EACCES || error == EPERM ? FileStatus::Forbidden : FileStatus::Unreadable;
+}
+
 FileStatus readAll(int descriptor, std::size_t maxBytes, std::string& bytes) {
     std::size_t length = 0;
     while (true) {
@@ -50,7 +56,7 @@ FileStatus readAll(int descriptor, std::size_t maxBytes, std::string& bytes) {
         if (count < 0 && errno == EINTR)
             continue;
         if (count < 0)
-            return meansAbsent(errno) ? FileStatus::Absent : FileStatus::Unreadable;
+            return failureOf(errno);
         length += static_cast<std::size_t>(count);
         bytes.resize(length);
         if (length > maxBytes)
@@ -66,7 +72,7 @@ FileContent readBoundedFile(const std::filesystem::path& path, std::size_t maxBy
     FileContent content;
     const Descriptor descriptor(path);
     if (descriptor.get() < 0) {
-        content.status = meansAbsent(errno) ? FileStatus::Absent : FileStatus::Unreadable;
+        content.status = failureOf(errno);
         return content;
     }
     if (!descriptor.isRegularFile()) {

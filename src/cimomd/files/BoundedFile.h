@@ -9,7 +9,7 @@
 
 namespace cimomd {
 
-enum class FileStatus { Read, Absent, Unreadable, TooLong };
+enum class FileStatus { Read, Absent, Forbidden, Unreadable, TooLong };
 
 struct FileContent {
     FileStatus status = FileStatus::Absent;
@@ -17,8 +17,9 @@ struct FileContent {
     std::string bytes;
 };
 
-/// The bytes of a regular file of at most `maxBytes`. Unreadable: no permission, no regular file,
-/// or an error while reading. Absent: nothing has this name, also when it vanished meanwhile.
+/// The bytes of a regular file of at most `maxBytes`. Forbidden: no permission. Unreadable: no
+/// regular file, or an error while reading. Absent: nothing has this name, also when it vanished
+/// meanwhile.
 FileContent readBoundedFile(const std::filesystem::path& path, std::size_t maxBytes);
 
 }  // namespace cimomd

@@ -8,38 +8,56 @@
 
 namespace cimomd {
 
-std::optional<std::string> readText(const std::filesystem::path& path, std::size_t maxBytes) {
+namespace {
+
+Absence absenceOf(FileStatus status) {
+    switch (status) {
+        case FileStatus::Absent:
+            return Absence::Absent;
+        case FileStatus::Forbidden:
+            return Absence::NeedsRoot;
+        default:
+            return Absence::Unreadable;
+    }
+}
+
+Absence absenceOf(const std::error_code& error) {
+    if (error == std::errc::permission_denied || error == std::errc::operation_not_permitted)
+        return Absence::NeedsRoot;
+    return error == std::errc::no_such_file_or_directory ? Absence::Absent : Absence::Unreadable;
+}
+
+}  // namespace
+
+Fact<std::string> readText(const std::filesystem::path& path, std::size_t maxBytes) {
     FileContent content = readBoundedFile(path, maxBytes);
     if (content.status != FileStatus::Read)
-        return std::nullopt;
+        return absenceOf(content.status);
     return std::move(content.bytes);
 }
 
-std::optional<std::string> readFact(const std::filesystem::path& path) {
-    const std::optional<std::string> text = readText(path);
-    if (!text)
-        return std::nullopt;
-    const std::string_view fact = trimmed(*text);
-    if (fact.empty())
-        return std::nullopt;
-    return std::string(fact);
+Fact<std::string> readFact(const std::filesystem::path& path) {
+    return readText(path).then(
+        [](const std::string& text) {
+            const std::string_view fact = trimmed(text);
+            return fact.empty() ? std::nullopt : std::optional<std::string>(fact);
+        },
+        Absence::Absent);
 }
 
-std::optional<std::uint64_t> readNumber(const std::filesystem::path& path) {
-    const std::optional<std::string> fact = readFact(path);
-    return fact ? parseUnsigned(*fact) : std::nullopt;
+Fact<std::uint64_t> readNumber(const std::filesystem::path& path) {
+    return readFact(path).then([](const std::string& text) { return parseUnsigned(text); });
 }
 
-std::optional<std::int64_t> readSignedNumber(const std::filesystem::path& path) {
-    const std::optional<std::string> fact = readFact(path);
-    return fact ? parseSigned(*fact) : std::nullopt;
+Fact<std::int64_t> readSignedNumber(const std::filesystem::path& path) {
+    return readFact(path).then([](const std::string& text) { return parseSigned(text); });
 }
 
-std::optional<std::vector<std::string>> listDirectory(const std::filesystem::path& path) {
+Fact<std::vector<std::string>> listDirectory(const std::filesystem::path& path) {
     std::error_code error;
     std::filesystem::directory_iterator entry(path, error);
     if (error)
-        return std::nullopt;
+        return absenceOf(error);
     std::vector<std::string> names;
     const std::filesystem::directory_iterator end;
     while (entry != end && names.size() < kMaxListedEntries) {

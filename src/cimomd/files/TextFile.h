@@ -8,26 +8,28 @@
 #include <string>
 #include <vector>
 
+#include "system/Fact.h"
+
 namespace cimomd {
 
 inline constexpr std::size_t kMaxSmallFileBytes = std::size_t{64} << 10;
 inline constexpr std::size_t kMaxListedEntries = 100000;
 
 /// The file's text, at most `maxBytes` long; nothing when it cannot be read whole.
-std::optional<std::string> readText(const std::filesystem::path& path,
-                                    std::size_t maxBytes = kMaxSmallFileBytes);
+Fact<std::string> readText(const std::filesystem::path& path,
+                           std::size_t maxBytes = kMaxSmallFileBytes);
 
 /// The text without white space and NUL bytes at its ends; nothing also when that is empty.
-std::optional<std::string> readFact(const std::filesystem::path& path);
+Fact<std::string> readFact(const std::filesystem::path& path);
 
 /// A file that holds one number; nothing when it holds anything else, or a negative number.
-std::optional<std::uint64_t> readNumber(const std::filesystem::path& path);
+Fact<std::uint64_t> readNumber(const std::filesystem::path& path);
 
 /// The same, negative numbers included.
-std::optional<std::int64_t> readSignedNumber(const std::filesystem::path& path);
+Fact<std::int64_t> readSignedNumber(const std::filesystem::path& path);
 
 /// The names in a directory in byte order, at most kMaxListedEntries of them; nothing when the
 /// directory cannot be read.
-std::optional<std::vector<std::string>> listDirectory(const std::filesystem::path& path);
+Fact<std::vector<std::string>> listDirectory(const std::filesystem::path& path);
 
 }  // namespace cimomd

@@ -80,7 +80,11 @@ bool InstancesAnswer::openNextProvider() {
 
 bool InstancesAnswer::nextInstance(CIMInstance& instance) {
     try {
-        return stream->next(instance);
+        ProvidedInstance provided;
+        if (!stream->next(provided))
+            return false;
+        instance = std::move(provided.instance);
+        return true;
     } catch (const std::exception& error) {
         fail(current(), error.what());
     } catch (const Pegasus::Exception& error) {

@@ -22,6 +22,9 @@ inline constexpr std::uint16_t kEnabledButOffline = 6;
 // CIM_ComputerSystem.Dedicated
 inline constexpr std::uint16_t kNotDedicated = 0;
 
+// The class of the computer: a key of everything that belongs to it.
+inline constexpr const char* kComputerSystemClass = "Velmira_ComputerSystem";
+
 // MaxLen of CIM_ManagedElement.Caption and of names that are keys.
 inline constexpr std::size_t kCaptionLength = 64;
 inline constexpr std::size_t kSystemNameLength = 256;

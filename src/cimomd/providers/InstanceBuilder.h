@@ -2,51 +2,79 @@
 
 // Puts an instance together from what a reader found.
 
-#include <Pegasus/Common/CIMInstance.h>
 #include <Pegasus/Common/CIMValue.h>
 
-#include <optional>
+#include <initializer_list>
 #include <string>
 #include <string_view>
 #include <vector>
 
+#include "providers/ProvidedInstance.h"
+
 namespace cimomd {
 
-/// Each call adds one property. Nothing becomes a null of the property's type. Texts may hold any
-/// bytes: what CIM-XML cannot carry becomes U+FFFD.
+/// Each call adds one property, or the keys of a kind of element. A fact without a value becomes a
+/// null of the property's type, its reason is kept. Texts may hold any bytes: what CIM-XML cannot
+/// carry becomes U+FFFD.
 class InstanceBuilder {
   public:
     explicit InstanceBuilder(const char* className);
 
+    /// The keys of CIM_LogicalDevice.
+    InstanceBuilder& deviceKeys(const std::string& hostName, const std::string& deviceId);
+    /// The keys of CIM_PhysicalElement.
+    InstanceBuilder& physicalKeys(const std::string& tag);
+    /// The keys of CIM_Service.
+    InstanceBuilder& serviceKeys(const std::string& hostName, const std::string& name);
+    /// Any other key that tells the instance from others of its class.
+    InstanceBuilder& key(const char* name, const std::string& value, std::size_t maxLength = 0);
+
+    /// Caption and ElementName.
+    InstanceBuilder& label(const std::string& title);
+
     /// A string property; only the first `maxLength` characters are kept when that is not 0.
-    InstanceBuilder& text(const char* name, const std::optional<std::string>& value,
+    InstanceBuilder& text(const char* name, const Fact<std::string>& value,
                           std::size_t maxLength = 0);
-    InstanceBuilder& texts(const char* name, const std::vector<std::string>& values);
+    InstanceBuilder& texts(const char* name, const Fact<std::vector<std::string>>& values);
 
     /// A property of the scalar type T, one of the client library's types.
     template <typename T>
-    InstanceBuilder& value(const char* name, const std::optional<T>& scalar) {
-        return add(name, scalar ? Pegasus::CIMValue(*scalar)
-                                : Pegasus::CIMValue(Pegasus::kCimTypeOf<T>, false));
+    InstanceBuilder& value(const char* name, const Fact<T>& scalar) {
+        if (!scalar)
+            return addMissing(name, Pegasus::kCimTypeOf<T>, false, scalar.reason());
+        return add(name, Pegasus::CIMValue(*scalar));
     }
 
     /// An array property of that element type.
     template <typename T>
-    InstanceBuilder& values(const char* name, const std::optional<std::vector<T>>& elements) {
+    InstanceBuilder& values(const char* name, const Fact<std::vector<T>>& elements) {
         if (!elements)
-            return add(name, Pegasus::CIMValue(Pegasus::kCimTypeOf<T>, true));
+            return addMissing(name, Pegasus::kCimTypeOf<T>, true, elements.reason());
+        return addArray<T>(name, *elements);
+    }
+    template <typename T>
+    InstanceBuilder& values(const char* name, std::initializer_list<T> elements) {
+        return addArray<T>(name, elements);
+    }
+
+    ProvidedInstance take() { return std::move(provided); }
+
+  private:
+    template <typename T, typename Elements>
+    InstanceBuilder& addArray(const char* name, const Elements& elements) {
         Pegasus::Array<T> array;
-        for (const T& element : *elements)
+        for (const T& element : elements)
             array.append(element);
         return add(name, Pegasus::CIMValue(array));
     }
 
-    Pegasus::CIMInstance take() { return std::move(instance); }
-
-  private:
     InstanceBuilder& add(const char* name, const Pegasus::CIMValue& value);
+    InstanceBuilder& addMissing(const char* name, Pegasus::CIMType type, bool isArray,
+                                Absence reason);
+    InstanceBuilder& systemKeys(const std::string& hostName);
 
-    Pegasus::CIMInstance instance;
+    const char* creationClass;
+    ProvidedInstance provided;
 };
 
 }  // namespace cimomd

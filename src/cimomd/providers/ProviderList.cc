@@ -1,10 +1,11 @@
 #include "providers/ProviderList.h"
+#include "providers/MissingValueProvider.h"
 
-#include "providers/ComputerSystemProvider.h"
-#include "providers/EthernetPortProvider.h"
-#include "providers/LocalFileSystemProvider.h"
-#include "providers/OperatingSystemProvider.h"
-#include "providers/ProcessorProvider.h"
+#include "providers/computer/ComputerSystemProvider.h"
+#include "providers/network/EthernetPortProvider.h"
+#include "providers/processor/ProcessorProvider.h"
+#include "providers/software/OperatingSystemProvider.h"
+#include "providers/storage/LocalFileSystemProvider.h"
 
 namespace cimomd {
 
@@ -15,6 +16,7 @@ ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     providers.push_back(std::make_unique<ProcessorProvider>(paths));
     providers.push_back(std::make_unique<LocalFileSystemProvider>(paths, calls));
     providers.push_back(std::make_unique<EthernetPortProvider>(paths));
+    providers.push_back(std::make_unique<MissingValueProvider>(providers));
     return providers;
 }
 

@@ -13,13 +13,13 @@ namespace cimomd {
 template <typename Record>
 class RecordStream : public InstanceStream {
   public:
-    using Publish = std::function<Pegasus::CIMInstance(const Record&)>;
+    using Publish = std::function<ProvidedInstance(const Record&)>;
 
     /// `publish` makes the instance of one record; it is kept as long as the stream.
     RecordStream(std::vector<Record> sourceRecords, Publish publishRecord)
         : records(std::move(sourceRecords)), publish(std::move(publishRecord)) {}
 
-    bool next(Pegasus::CIMInstance& out) override {
+    bool next(ProvidedInstance& out) override {
         if (position == records.size())
             return false;
         out = publish(records[position++]);

@@ -33,9 +33,10 @@ class SystemPaths {
     /// Only in recorded trees: what statvfs said when the tree was recorded.
     std::filesystem::path recordedFileSystemSizes() const { return below("statvfs"); }
 
-  private:
+    /// `path`, relative to the root.
     std::filesystem::path below(std::string_view path) const;
 
+  private:
     std::filesystem::path root;
 };
 

@@ -30,7 +30,7 @@ class NumberProvider : public Provider {
     }
 
   private:
-    Pegasus::CIMInstance publish(int number) const {
+    ProvidedInstance publish(int number) const {
         if (number == failAt)
             throw ProviderError("the source broke");
         InstanceBuilder builder(name);

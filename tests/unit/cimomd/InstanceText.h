@@ -24,9 +24,9 @@ inline std::string textOf(const Pegasus::CIMConstInstance& instance, const char*
 
 inline std::vector<Pegasus::CIMInstance> all(std::unique_ptr<InstanceStream> stream) {
     std::vector<Pegasus::CIMInstance> instances;
-    Pegasus::CIMInstance instance;
-    while (stream->next(instance))
-        instances.push_back(instance);
+    ProvidedInstance provided;
+    while (stream->next(provided))
+        instances.push_back(provided.instance);
     return instances;
 }
 

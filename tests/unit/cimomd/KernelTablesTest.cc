@@ -1,4 +1,4 @@
-#include "system/KernelTables.h"
+#include "system/software/KernelTables.h"
 
 #include <gtest/gtest.h>
 #include <utmpx.h>

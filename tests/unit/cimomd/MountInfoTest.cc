@@ -1,4 +1,4 @@
-#include "system/MountInfo.h"
+#include "system/storage/MountInfo.h"
 
 #include <gtest/gtest.h>
 

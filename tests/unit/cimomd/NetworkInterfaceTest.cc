@@ -1,4 +1,4 @@
-#include "system/NetworkInterface.h"
+#include "system/network/NetworkInterface.h"
 
 #include <gtest/gtest.h>
 

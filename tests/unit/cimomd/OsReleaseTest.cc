@@ -1,4 +1,4 @@
-#include "system/OsRelease.h"
+#include "system/software/OsRelease.h"
 
 #include <gtest/gtest.h>
 

@@ -1,4 +1,4 @@
-#include "system/ProcessorPackage.h"
+#include "system/processor/ProcessorPackage.h"
 
 #include <gtest/gtest.h>
 

@@ -1,12 +1,12 @@
-#include "system/SystemIdentity.h"
+#include "system/computer/SystemIdentity.h"
 
 #include <gtest/gtest.h>
 
 #include <stdexcept>
 
 #include "RecordedTree.h"
-#include "system/FirmwareText.h"
 #include "system/RecordedSystemCalls.h"
+#include "system/computer/FirmwareText.h"
 
 namespace cimomd {
 namespace {

@@ -1,0 +1,26 @@
+#pragma once
+
+// The Ethernet ports that are hardware, a hypervisor's included. Reads /sys/class/net.
+
+#include "providers/Provider.h"
+#include "system/SystemPaths.h"
+#include "system/network/NetworkInterface.h"
+
+namespace cimomd {
+
+class EthernetPortProvider : public Provider {
+  public:
+    static constexpr const char* kClassName = "Velmira_EthernetPort";
+
+    explicit EthernetPortProvider(SystemPaths systemPaths) : paths(std::move(systemPaths)) {}
+
+    const char* className() const override { return kClassName; }
+    std::unique_ptr<InstanceStream> enumerate() const override;
+
+    static ProvidedInstance publish(const std::string& hostName, const NetworkInterface& interface);
+
+  private:
+    SystemPaths paths;
+};
+
+}  // namespace cimomd

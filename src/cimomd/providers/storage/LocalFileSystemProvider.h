@@ -1,0 +1,34 @@
+#pragma once
+
+// The mounted file systems on devices of this machine, each once. Reads the mount table; sizes come
+// from statvfs, which local file systems answer at once.
+
+#include <optional>
+
+#include "providers/Provider.h"
+#include "system/SystemCalls.h"
+#include "system/SystemPaths.h"
+#include "system/storage/MountInfo.h"
+
+namespace cimomd {
+
+class LocalFileSystemProvider : public Provider {
+  public:
+    static constexpr const char* kClassName = "Velmira_LocalFileSystem";
+
+    /// `systemCalls` must outlive the provider.
+    LocalFileSystemProvider(SystemPaths systemPaths, const SystemCalls& systemCalls)
+        : paths(std::move(systemPaths)), calls(systemCalls) {}
+
+    const char* className() const override { return kClassName; }
+    std::unique_ptr<InstanceStream> enumerate() const override;
+
+    static ProvidedInstance publish(const std::string& hostName, const Mount& mount,
+                                    const std::optional<FileSystemSize>& size);
+
+  private:
+    SystemPaths paths;
+    const SystemCalls& calls;
+};
+
+}  // namespace cimomd

@@ -1,0 +1,20 @@
+#pragma once
+
+// Texts that a maker should have filled in, and often has not.
+
+#include <string>
+#include <string_view>
+
+#include "system/Fact.h"
+
+namespace cimomd {
+
+/// Whether `text` only stands where a value should: a known placeholder (ignoring case and outer
+/// blanks), nothing at all, or one character repeated, blanks and dashes apart ("0000", and UUIDs
+/// of zeros or Fs).
+bool isPlaceholder(std::string_view text);
+
+/// The text without outer blanks; a placeholder is filtered.
+Fact<std::string> withoutPlaceholder(const Fact<std::string>& text);
+
+}  // namespace cimomd

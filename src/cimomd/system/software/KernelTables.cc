@@ -1,0 +1,57 @@
+#include "system/software/KernelTables.h"
+
+#include <utmpx.h>
+
+#include <cstring>
+
+#include "files/TextFields.h"
+
+namespace cimomd {
+namespace {
+
+std::optional<std::uint64_t> kilobytes(std::string_view value) {
+    const std::vector<std::string_view> fields = fieldsOf(value);
+    if (fields.size() != 2 || fields[1] != "kB")
+        return std::nullopt;
+    return parseUnsigned(fields[0]);
+}
+
+}  // namespace
+
+MemoryInfo parseMemoryInfo(std::string_view text) {
+    MemoryInfo out;
+    for (const std::string_view line : linesOf(text)) {
+        const auto entry = keyValueOf(line, ':');
+        if (!entry)
+            continue;
+        if (entry->key == "MemTotal")
+            out.totalKB = kilobytes(entry->value);
+        else if (entry->key == "MemFree")
+            out.freeKB = kilobytes(entry->value);
+        else if (entry->key == "SwapTotal")
+            out.swapTotalKB = kilobytes(entry->value);
+    }
+    return out;
+}
+
+std::optional<std::int64_t> parseBootTime(std::string_view text) {
+    for (const std::string_view line : linesOf(text)) {
+        const std::vector<std::string_view> fields = fieldsOf(line);
+        if (fields.size() == 2 && fields[0] == "btime")
+            return parseSigned(fields[1]);
+    }
+    return std::nullopt;
+}
+
+std::uint32_t countSessions(std::string_view bytes) {
+    std::uint32_t count = 0;
+    while (bytes.size() >= sizeof(utmpx)) {
+        utmpx record{};
+        std::memcpy(&record, bytes.data(), sizeof record);
+        count += record.ut_type == USER_PROCESS ? 1 : 0;
+        bytes.remove_prefix(sizeof record);
+    }
+    return count;
+}
+
+}  // namespace cimomd
