@@ -26,6 +26,8 @@ class SystemPaths {
     std::filesystem::path logicalProcessors() const { return below("sys/devices/system/cpu"); }
     std::filesystem::path networkInterfaces() const { return below("sys/class/net"); }
     std::filesystem::path firmwareIdentity() const { return below("sys/class/dmi/id"); }
+    std::filesystem::path firmwareTables() const { return below("sys/firmware/dmi/tables"); }
+    std::filesystem::path uefi() const { return below("sys/firmware/efi"); }
     std::filesystem::path osRelease() const { return below("etc/os-release"); }
     std::filesystem::path vendorOsRelease() const { return below("usr/lib/os-release"); }
     std::filesystem::path machineId() const { return below("etc/machine-id"); }
