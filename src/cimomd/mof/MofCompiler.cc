@@ -113,20 +113,14 @@ void MofCompiler::declare(const MofQualifierDeclaration& declaration, const Unit
     out.scopes = declaration.scopes;
     for (const MofFlavor& flavor : declaration.flavors)
         applyFlavor(flavor.word, out.flavor);
-    try {
-        draft.addQualifier(nameSpace, std::move(out));
-    } catch (const RepositoryError& error) {
+    for (const RepositoryError& error : draft.addQualifier(nameSpace, std::move(out)))
         throw MofError(file, declaration.name.position, error.found, error.expected);
-    }
 }
 
 void MofCompiler::declare(const MofClass& declaration, const Unit& unit) {
     const std::string file = unit.path.string();
-    try {
-        draft.addClass(nameSpace, classOf(declaration, file));
-    } catch (const RepositoryError& error) {
+    for (const RepositoryError& error : draft.addClass(nameSpace, classOf(declaration, file)))
         throw MofError(file, positionOf(error, declaration), error.found, error.expected);
-    }
 }
 
 void MofCompiler::declare(const MofInclude& include, const Unit& unit) {

@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "repository/Inheritance.h"
+#include "repository/MethodInheritance.h"
 #include "text/CimText.h"
 #include "text/Utf8.h"
 
@@ -12,36 +13,55 @@ namespace cimomd {
 namespace {
 
 using Pegasus::CIMClass;
+using Pegasus::CIMConstInstance;
 using Pegasus::CIMName;
 using Pegasus::CIMNamespaceName;
-
-std::string keyOf(const CIMName& name) {
-    return lowerCase(utf8Of(name.getString()));
-}
 
 std::string keyOf(const CIMNamespaceName& name) {
     return lowerCase(utf8Of(name.getString()));
 }
 
+RepositoryError errorOf(std::string found, std::string expected) {
+    RepositoryError error;
+    error.found = std::move(found);
+    error.expected = std::move(expected);
+    return error;
+}
+
+std::shared_ptr<const MethodList> shared(MethodList methods) {
+    return methods.empty() ? nullptr : std::make_shared<const MethodList>(std::move(methods));
+}
+
 }  // namespace
 
 void ClassRepository::addNamespace(const CIMNamespaceName& name) {
-    namespaces[keyOf(name)];
+    access(name);
 }
 
 bool ClassRepository::hasNamespace(const CIMNamespaceName& name) const {
     return find(name) != nullptr;
 }
 
-void ClassRepository::addQualifier(const CIMNamespaceName& nameSpace,
-                                   QualifierDeclaration declaration) {
+std::vector<CIMNamespaceName> ClassRepository::namespaceNames() const {
+    std::vector<CIMNamespaceName> names;
+    for (const auto& [key, space] : namespaces)
+        names.push_back(space.name);
+    return names;
+}
+
+RepositoryErrors ClassRepository::addQualifier(const CIMNamespaceName& nameSpace,
+                                               QualifierDeclaration declaration) {
     const CIMName name = declaration.name;
-    const auto [place, added] =
-        namespaces[keyOf(nameSpace)].qualifiers.emplace(keyOf(name), std::move(declaration));
-    if (!added)
-        throw RepositoryError{CIMName(), name,
-                              fmt::format("qualifier {} again", utf8Of(name.getString())),
-                              "a qualifier that is not declared yet"};
+    auto& qualifiers = access(nameSpace).qualifiers;
+    const auto place = qualifiers.find(name);
+    if (place == qualifiers.end()) {
+        qualifiers.emplace(name, std::move(declaration));
+        return {};
+    }
+    if (place->second.isSameAs(declaration))
+        return {};
+    return {errorOf(fmt::format("another declaration of qualifier {}", utf8Of(name.getString())),
+                    "one that says the same as the first")};
 }
 
 const QualifierDeclaration* ClassRepository::findQualifier(const CIMNamespaceName& nameSpace,
@@ -49,42 +69,102 @@ const QualifierDeclaration* ClassRepository::findQualifier(const CIMNamespaceNam
     const Namespace* space = find(nameSpace);
     if (space == nullptr)
         return nullptr;
-    const auto place = space->qualifiers.find(keyOf(name));
+    const auto place = space->qualifiers.find(name);
     return place == space->qualifiers.end() ? nullptr : &place->second;
 }
 
-void ClassRepository::addClass(const CIMNamespaceName& nameSpace, CIMClass declared) {
-    Namespace& space = namespaces[keyOf(nameSpace)];
-    const CIMName& name = declared.getClassName();
+RepositoryErrors ClassRepository::addClass(const CIMNamespaceName& nameSpace, CIMClass declared,
+                                           std::vector<MethodDeclaration> methods) {
+    Namespace& space = access(nameSpace);
+    if (find(space, declared.getClassName()) != nullptr)
+        return {errorOf(fmt::format("class {} again", utf8Of(declared.getClassName().getString())),
+                        "a class that is not declared yet")};
     const CIMName& superName = declared.getSuperClassName();
-    if (find(space, name) != nullptr)
-        throw RepositoryError{CIMName(), CIMName(),
-                              fmt::format("class {} again", utf8Of(name.getString())),
-                              "a class that is not declared yet"};
-    if (superName.isNull()) {
-        space.classes.emplace(keyOf(name), ClassEntry{asTopClass(declared), {}, 0});
-        return;
-    }
-    const auto super = space.classes.find(keyOf(superName));
-    if (super == space.classes.end())
-        throw RepositoryError{CIMName(), CIMName(),
-                              fmt::format("superclass {}", utf8Of(superName.getString())),
-                              "a class declared before", true};
-    const std::size_t depth = super->second.depth + 1;
-    if (depth > kMaxInheritanceDepth)
-        throw RepositoryError{CIMName(), CIMName(), fmt::format("a class {} levels deep", depth),
-                              fmt::format("at most {}", kMaxInheritanceDepth)};
-    checkOverrides(super->second.effective, declared);
-    space.classes.emplace(keyOf(name),
-                          ClassEntry{inherit(super->second.effective, declared), {}, depth});
-    super->second.subclasses.push_back(keyOf(name));
+    if (superName.isNull())
+        return addTopClass(space, std::move(declared), std::move(methods));
+    const auto super = space.classes.find(superName);
+    if (super != space.classes.end())
+        return addSubclass(space, super->second, std::move(declared), std::move(methods));
+    RepositoryError error = errorOf(fmt::format("superclass {}", utf8Of(superName.getString())),
+                                    "a class that is declared");
+    error.atSuperClass = true;
+    return {error};
+}
+
+RepositoryErrors ClassRepository::addTopClass(Namespace& space, CIMClass declared,
+                                              std::vector<MethodDeclaration> methods) {
+    const CIMName name = declared.getClassName();
+    RepositoryErrors errors = reserveFeatures(declared.getPropertyCount() + methods.size());
+    if (!errors.empty())
+        return errors;
+    ClassEntry entry;
+    entry.methods = shared(inheritMethods(MethodList(), std::move(methods), name));
+    entry.effective = asTopClass(std::move(declared));
+    space.classes.emplace(name, std::move(entry));
+    space.topClasses.push_back(name);
+    return {};
+}
+
+RepositoryErrors ClassRepository::addSubclass(Namespace& space, ClassEntry& super,
+                                              CIMClass declared,
+                                              std::vector<MethodDeclaration> methods) {
+    static const MethodList kNone;
+    const MethodList& inherited = super.methods ? *super.methods : kNone;
+    const CIMName name = declared.getClassName();
+    ClassEntry entry;
+    entry.depth = super.depth + 1;
+    if (entry.depth > kMaxInheritanceDepth)
+        return {errorOf(fmt::format("a class {} levels deep", entry.depth),
+                        fmt::format("at most {}", kMaxInheritanceDepth))};
+    RepositoryErrors errors = checkOverrides(super.effective, declared);
+    checkMethodOverrides(inherited, methods, errors);
+    if (errors.empty())
+        errors = reserveFeatures(super.effective.getPropertyCount() + inherited.size() +
+                                 declared.getPropertyCount() + methods.size());
+    if (!errors.empty())
+        return errors;
+    entry.methods = shared(inheritMethods(inherited, std::move(methods), name));
+    entry.effective = inherit(super.effective, std::move(declared));
+    space.classes.emplace(name, std::move(entry));
+    super.subclasses.push_back(name);
+    return {};
+}
+
+RepositoryErrors ClassRepository::reserveFeatures(std::size_t count) {
+    // A class costs memory without features too.
+    const std::size_t cost = count + 1;
+    if (cost > kMaxFeatures)
+        return {errorOf("a class with too many properties and methods",
+                        fmt::format("at most {}", kMaxFeatures))};
+    if (cost > kMaxAllFeatures - allFeatures)
+        return {errorOf("too many classes, properties and methods",
+                        fmt::format("at most {}", kMaxAllFeatures))};
+    allFeatures += cost;
+    return {};
 }
 
 const Pegasus::CIMConstClass* ClassRepository::findClass(const CIMNamespaceName& nameSpace,
                                                          const CIMName& name) const {
-    const Namespace* space = find(nameSpace);
-    const ClassEntry* entry = space == nullptr ? nullptr : find(*space, name);
+    const ClassEntry* entry = find(nameSpace, name);
     return entry == nullptr ? nullptr : &entry->effective;
+}
+
+const MethodList& ClassRepository::methodsOf(const CIMNamespaceName& nameSpace,
+                                             const CIMName& className) const {
+    static const MethodList kNone;
+    const ClassEntry* entry = find(nameSpace, className);
+    return entry == nullptr || !entry->methods ? kNone : *entry->methods;
+}
+
+std::vector<CIMName> ClassRepository::topClasses(const CIMNamespaceName& nameSpace) const {
+    const Namespace* space = find(nameSpace);
+    return space == nullptr ? std::vector<CIMName>() : space->topClasses;
+}
+
+std::vector<CIMName> ClassRepository::subclassesOf(const CIMNamespaceName& nameSpace,
+                                                   const CIMName& name) const {
+    const ClassEntry* entry = find(nameSpace, name);
+    return entry == nullptr ? std::vector<CIMName>() : entry->subclasses;
 }
 
 std::vector<CIMName> ClassRepository::withDescendants(const CIMNamespaceName& nameSpace,
@@ -98,10 +178,63 @@ std::vector<CIMName> ClassRepository::withDescendants(const CIMNamespaceName& na
         const ClassEntry* entry = open.back();
         open.pop_back();
         names.push_back(entry->effective.getClassName());
-        for (auto key = entry->subclasses.rbegin(); key != entry->subclasses.rend(); ++key)
-            open.push_back(&space->classes.at(*key));
+        for (auto sub = entry->subclasses.rbegin(); sub != entry->subclasses.rend(); ++sub)
+            open.push_back(find(*space, *sub));
     }
     return names;
+}
+
+bool ClassRepository::isSameOrSubclass(const CIMNamespaceName& nameSpace, const CIMName& name,
+                                       const CIMName& ancestor) const {
+    const Namespace* space = find(nameSpace);
+    if (space == nullptr)
+        return false;
+    for (const ClassEntry* entry = find(*space, name); entry != nullptr;
+         entry = find(*space, entry->effective.getSuperClassName())) {
+        if (entry->effective.getClassName().equal(ancestor))
+            return true;
+    }
+    return false;
+}
+
+RepositoryErrors ClassRepository::addInstance(const Pegasus::CIMInstance& instance) {
+    const CIMName& className = instance.getClassName();
+    Namespace& space = access(instance.getPath().getNameSpace());
+    const auto place = space.classes.find(className);
+    if (place == space.classes.end())
+        return {errorOf(fmt::format("class {}", utf8Of(className.getString())),
+                        "a class that is declared")};
+    std::shared_ptr<InstanceTable>& table = place->second.instances;
+    if (!table)
+        table = std::make_shared<InstanceTable>();
+    else if (table.use_count() > 1)
+        table = std::make_shared<InstanceTable>(*table);
+    if (table->add(instance))
+        return {};
+    return {errorOf(fmt::format("instance {} again", utf8Of(instance.getPath().toString())),
+                    "keys that no other instance has")};
+}
+
+const std::vector<CIMConstInstance>& ClassRepository::instancesOf(const CIMNamespaceName& nameSpace,
+                                                                  const CIMName& className) const {
+    static const std::vector<CIMConstInstance> kNone;
+    const ClassEntry* entry = find(nameSpace, className);
+    return entry == nullptr || !entry->instances ? kNone : entry->instances->all();
+}
+
+const CIMConstInstance* ClassRepository::findInstance(const CIMNamespaceName& nameSpace,
+                                                      const Pegasus::CIMObjectPath& path) const {
+    const ClassEntry* entry = find(nameSpace, path.getClassName());
+    if (entry == nullptr || !entry->instances)
+        return nullptr;
+    return entry->instances->find(nameSpace, path.getKeyBindings());
+}
+
+ClassRepository::Namespace& ClassRepository::access(const CIMNamespaceName& name) {
+    Namespace& space = namespaces[keyOf(name)];
+    if (space.name.isNull())
+        space.name = name;
+    return space;
 }
 
 const ClassRepository::Namespace* ClassRepository::find(const CIMNamespaceName& name) const {
@@ -109,9 +242,15 @@ const ClassRepository::Namespace* ClassRepository::find(const CIMNamespaceName& 
     return place == namespaces.end() ? nullptr : &place->second;
 }
 
+const ClassRepository::ClassEntry* ClassRepository::find(const CIMNamespaceName& nameSpace,
+                                                         const CIMName& className) const {
+    const Namespace* space = find(nameSpace);
+    return space == nullptr ? nullptr : find(*space, className);
+}
+
 const ClassRepository::ClassEntry* ClassRepository::find(const Namespace& nameSpace,
                                                          const CIMName& name) {
-    const auto place = nameSpace.classes.find(keyOf(name));
+    const auto place = nameSpace.classes.find(name);
     return place == nameSpace.classes.end() ? nullptr : &place->second;
 }
 

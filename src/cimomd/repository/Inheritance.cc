@@ -2,7 +2,9 @@
 
 #include <fmt/format.h>
 
-#include "repository/RepositoryError.h"
+#include <utility>
+
+#include "repository/QualifierInheritance.h"
 #include "text/CimText.h"
 
 namespace cimomd {
@@ -12,21 +14,10 @@ using Pegasus::CIMClass;
 using Pegasus::CIMConstClass;
 using Pegasus::CIMConstProperty;
 using Pegasus::CIMConstQualifier;
-using Pegasus::CIMFlavor;
 using Pegasus::CIMName;
 using Pegasus::CIMProperty;
 using Pegasus::CIMQualifier;
 using Pegasus::Uint32;
-
-/// The form of a superclass's qualifier in the subclass. Sharing what is propagated already keeps a
-/// schema of thousands of classes small.
-CIMQualifier propagated(CIMQualifier qualifier) {
-    if (qualifier.getPropagated())
-        return qualifier;
-    CIMQualifier copy = qualifier.clone();
-    copy.setPropagated(true);
-    return copy;
-}
 
 /// Gives `target` the qualifiers of `super` that go to subclasses and that `declared` does not
 /// repeat. Element is a class or a property.
@@ -36,7 +27,7 @@ void inheritQualifiers(Element& super, const ConstElement* declared, Element& ta
         const CIMQualifier qualifier = super.getQualifier(i);
         const bool repeated = declared != nullptr && declared->findQualifier(qualifier.getName()) !=
                                                          Pegasus::PEG_NOT_FOUND;
-        if (!repeated && qualifier.getFlavor().has(CIMFlavor::TOSUBCLASS))
+        if (!repeated && goesToSubclasses(qualifier))
             target.addQualifier(propagated(qualifier));
     }
 }
@@ -79,28 +70,29 @@ std::string typeText(const CIMConstProperty& property) {
                        property.isArray() ? "[]" : "");
 }
 
-bool sameValue(const CIMConstQualifier& a, const CIMConstQualifier& b) {
-    return a.getValue().isNull() == b.getValue().isNull() &&
-           a.getValue().toString() == b.getValue().toString();
-}
-
 template <typename Element>
-void checkQualifiers(const Element& super, const Element& declared, const CIMName& property) {
+void checkQualifiers(const Element& super, const Element& declared, RepositoryErrors& errors) {
     for (Uint32 i = 0; i < declared.getQualifierCount(); ++i) {
         const CIMConstQualifier qualifier = declared.getQualifier(i);
         const Uint32 index = super.findQualifier(qualifier.getName());
-        if (index == Pegasus::PEG_NOT_FOUND)
-            continue;
-        const CIMConstQualifier inherited = super.getQualifier(index);
-        const CIMFlavor& flavor = inherited.getFlavor();
-        const bool bound = flavor.has(CIMFlavor::TOSUBCLASS) && !flavor.has(CIMFlavor::OVERRIDABLE);
-        if (bound && !sameValue(inherited, qualifier))
-            throw RepositoryError{
-                property, qualifier.getName(),
-                fmt::format("qualifier {} with another value than the superclass gives it",
-                            utf8Of(qualifier.getName().getString())),
-                fmt::format("its value to stay {}", utf8Of(inherited.getValue().toString()))};
+        if (index != Pegasus::PEG_NOT_FOUND)
+            checkOverride(super.getQualifier(index), qualifier, errors);
     }
+}
+
+void checkProperty(const CIMConstProperty& super, const CIMConstProperty& declared,
+                   RepositoryErrors& errors) {
+    const std::size_t first = errors.size();
+    if (!sameType(super, declared)) {
+        RepositoryError error;
+        error.found =
+            fmt::format("{} {}", typeText(declared), utf8Of(declared.getName().getString()));
+        error.expected = fmt::format("the inherited type {}", typeText(super));
+        errors.push_back(std::move(error));
+    }
+    checkQualifiers(super, declared, errors);
+    for (std::size_t i = first; i < errors.size(); ++i)
+        errors[i].property = declared.getName();
 }
 
 }  // namespace
@@ -133,21 +125,16 @@ CIMClass inherit(CIMClass super, CIMClass declared) {
     return out;
 }
 
-void checkOverrides(const CIMConstClass& super, const CIMConstClass& declared) {
-    checkQualifiers(super, declared, CIMName());
+RepositoryErrors checkOverrides(const CIMConstClass& super, const CIMConstClass& declared) {
+    RepositoryErrors errors;
+    checkQualifiers(super, declared, errors);
     for (Uint32 i = 0; i < declared.getPropertyCount(); ++i) {
         const CIMConstProperty property = declared.getProperty(i);
         const Uint32 index = super.findProperty(property.getName());
-        if (index == Pegasus::PEG_NOT_FOUND)
-            continue;
-        const CIMConstProperty inherited = super.getProperty(index);
-        if (!sameType(inherited, property))
-            throw RepositoryError{
-                property.getName(), CIMName(),
-                fmt::format("{} {}", typeText(property), utf8Of(property.getName().getString())),
-                fmt::format("the inherited type {}", typeText(inherited))};
-        checkQualifiers(inherited, property, property.getName());
+        if (index != Pegasus::PEG_NOT_FOUND)
+            checkProperty(super.getProperty(index), property, errors);
     }
+    return errors;
 }
 
 }  // namespace cimomd

@@ -4,6 +4,8 @@
 
 #include <Pegasus/Common/CIMClass.h>
 
+#include "repository/RepositoryError.h"
+
 namespace cimomd {
 
 /// The effective form of a class without a superclass: every property originates in it.
@@ -15,8 +17,9 @@ Pegasus::CIMClass asTopClass(Pegasus::CIMClass declared);
 /// propagated. A property keeps the origin of the class that declared it first.
 Pegasus::CIMClass inherit(Pegasus::CIMClass super, Pegasus::CIMClass declared);
 
-/// Throws RepositoryError when `declared` changes the type of a property of `super`, or the value
-/// of a qualifier whose flavor is DisableOverride.
-void checkOverrides(const Pegasus::CIMConstClass& super, const Pegasus::CIMConstClass& declared);
+/// Where `declared` changes the type of a property of `super`, or the value of a qualifier whose
+/// flavor is DisableOverride.
+RepositoryErrors checkOverrides(const Pegasus::CIMConstClass& super,
+                                const Pegasus::CIMConstClass& declared);
 
 }  // namespace cimomd

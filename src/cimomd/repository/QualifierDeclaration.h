@@ -16,6 +16,9 @@ struct QualifierDeclaration {
     Pegasus::CIMValue defaultValue;
     QualifierScopes scopes = kScopeAny;
     Pegasus::CIMFlavor flavor;
+
+    /// Whether both say the same; only the case of the name may differ.
+    bool isSameAs(const QualifierDeclaration& other) const;
 };
 
 }  // namespace cimomd

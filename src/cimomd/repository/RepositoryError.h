@@ -5,19 +5,24 @@
 #include <Pegasus/Common/CIMName.h>
 
 #include <string>
+#include <vector>
 
 namespace cimomd {
 
-/// Thrown by ClassRepository; names the part of the declaration that is at fault.
+/// Names the part of the declaration that is at fault.
 struct RepositoryError {
-    /// Null when the class itself is at fault.
+    /// At most one of the two is set; none when the class, instance or qualifier itself is at
+    /// fault.
     Pegasus::CIMName property;
-    /// Null when no qualifier is at fault.
+    Pegasus::CIMName method;
+    /// Null when no qualifier of the part is at fault.
     Pegasus::CIMName qualifier;
     std::string found;
     std::string expected;
     /// The fault is in the name of the superclass.
     bool atSuperClass = false;
 };
+
+using RepositoryErrors = std::vector<RepositoryError>;
 
 }  // namespace cimomd

@@ -151,7 +151,7 @@ TEST_F(MofCompilerTest, saysWhatIsWrongAndWhere) {
         {"class X { [Key : Often] string a; };",
          "1:18: found Often, expected a flavor such as ToSubclass"},
         {"class X { string a; string A; };", "1:28: found A, expected each property once"},
-        {"class X : Y {};", "1:11: found superclass Y, expected a class declared before"},
+        {"class X : Y {};", "1:11: found superclass Y, expected a class that is declared"},
         {"class X {};\nclass x {};",
          "2:7: found class x again, expected a class that is not declared yet"},
         {"class X { uint8 a; };\nclass Y : X { uint16 a; };",
@@ -162,7 +162,8 @@ TEST_F(MofCompilerTest, saysWhatIsWrongAndWhere) {
          "2:16: found qualifier Key with another value than the superclass gives it, expected its "
          "value to stay TRUE"},
         {"Qualifier Key : boolean, Scope(any);",
-         "1:11: found qualifier Key again, expected a qualifier that is not declared yet"},
+         "1:11: found another declaration of qualifier Key, expected one that says the same as the "
+         "first"},
         {"Qualifier Q : boolean, Scope(classes);",
          "1:30: found classes, expected a scope such as class or property"},
         {"Qualifier Q : boolean;", "1:22: found ;, expected ','"},
@@ -214,7 +215,7 @@ TEST_F(MofCompilerTest, namesTheIncludedFileInErrors) {
     } catch (const MofError& error) {
         EXPECT_EQ(std::string(error.what()),
                   (tree.root / "a.mof").string() +
-                      ":2:11: found superclass None, expected a class declared before");
+                      ":2:11: found superclass None, expected a class that is declared");
     }
 }
 

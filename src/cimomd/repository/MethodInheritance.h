@@ -1,0 +1,21 @@
+#pragma once
+
+// What a class gets from the methods of its superclass (DSP0004).
+
+#include "repository/MethodDeclaration.h"
+#include "repository/RepositoryError.h"
+
+namespace cimomd {
+
+/// All methods of the class `className`: those of its superclass, `super`, marked as propagated,
+/// then its own. An override takes the place and the origin of what it overrides, and its
+/// qualifiers by their flavors.
+MethodList inheritMethods(const MethodList& super, std::vector<MethodDeclaration> declared,
+                          const Pegasus::CIMName& className);
+
+/// Appends to `errors` where `declared` changes the return type of a method of `super`, or the
+/// value of a qualifier of one whose flavor is DisableOverride.
+void checkMethodOverrides(const MethodList& super, const std::vector<MethodDeclaration>& declared,
+                          RepositoryErrors& errors);
+
+}  // namespace cimomd

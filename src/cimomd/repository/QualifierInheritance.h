@@ -1,0 +1,29 @@
+#pragma once
+
+// How qualifiers go from a superclass to its subclasses (DSP0004, qualifier flavors).
+
+#include <Pegasus/Common/CIMQualifier.h>
+
+#include "repository/RepositoryError.h"
+
+namespace cimomd {
+
+/// The form of a superclass's qualifier in the subclass. Shares what is propagated already: that
+/// keeps a schema of thousands of classes small. Qualifier is CIMQualifier or CIMConstQualifier.
+template <typename Qualifier>
+Qualifier propagated(const Qualifier& qualifier) {
+    if (qualifier.getPropagated())
+        return qualifier;
+    Pegasus::CIMQualifier copy = qualifier.clone();
+    copy.setPropagated(true);
+    return copy;
+}
+
+bool goesToSubclasses(const Pegasus::CIMConstQualifier& qualifier);
+
+/// Appends to `errors` when `inherited` may not be overridden and `declared`, the qualifier of the
+/// same name, has another value.
+void checkOverride(const Pegasus::CIMConstQualifier& inherited,
+                   const Pegasus::CIMConstQualifier& declared, RepositoryErrors& errors);
+
+}  // namespace cimomd
