@@ -1,6 +1,5 @@
 #include "system/LiveSystemCalls.h"
 
-#include <sys/statvfs.h>
 #include <sys/utsname.h>
 
 #include <ctime>
@@ -19,12 +18,15 @@ int LiveSystemCalls::utcOffsetMinutes(std::int64_t time) const {
     return static_cast<int>(local.tm_gmtoff / 60);
 }
 
-std::optional<FileSystemSize> LiveSystemCalls::fileSystemSize(const std::string& mountPoint) const {
-    struct statvfs status {};
-    if (::statvfs(mountPoint.c_str(), &status) != 0)
-        return std::nullopt;
-    return FileSystemSize{status.f_frsize, status.f_blocks, status.f_bavail, status.f_files,
-                          status.f_ffree};
+Fact<FileSystemSize> LiveSystemCalls::fileSystemSize(const std::string& mountPoint) const {
+    FileSystemSize size;
+    const int error = readFileSystemSize(mountPoint.c_str(), size);
+    return error == 0 ? Fact<FileSystemSize>(size) : absenceOfSize(error);
+}
+
+Fact<FileSystemSize> LiveSystemCalls::fileSystemSizeInTime(const std::string& mountPoint,
+                                                           const std::string& device) const {
+    return guard.ask(device, mountPoint);
 }
 
 std::optional<std::string> LiveSystemCalls::machine() const {

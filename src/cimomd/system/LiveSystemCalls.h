@@ -3,6 +3,7 @@
 // The system calls of the machine this runs on.
 
 #include "system/SystemCalls.h"
+#include "system/storage/FileSystemSizeGuard.h"
 
 namespace cimomd {
 
@@ -10,8 +11,13 @@ class LiveSystemCalls : public SystemCalls {
   public:
     std::int64_t now() const override;
     int utcOffsetMinutes(std::int64_t time) const override;
-    std::optional<FileSystemSize> fileSystemSize(const std::string& mountPoint) const override;
+    Fact<FileSystemSize> fileSystemSize(const std::string& mountPoint) const override;
+    Fact<FileSystemSize> fileSystemSizeInTime(const std::string& mountPoint,
+                                              const std::string& device) const override;
     std::optional<std::string> machine() const override;
+
+  private:
+    mutable FileSystemSizeGuard guard;
 };
 
 }  // namespace cimomd

@@ -7,22 +7,34 @@
 
 namespace cimomd {
 
-std::map<std::string, FileSystemSize> parseRecordedSizes(std::string_view text) {
-    constexpr std::size_t kFieldCount = 6;
-    std::map<std::string, FileSystemSize> sizes;
+namespace {
+
+constexpr std::string_view kTimedOut = "timeout";
+constexpr std::size_t kNumberCount = 5;
+
+std::optional<FileSystemSize> sizeOf(const std::vector<std::string_view>& fields) {
+    if (fields.size() != kNumberCount + 1)
+        return std::nullopt;
+    std::array<std::uint64_t, kNumberCount> numbers{};
+    for (std::size_t i = 0; i < kNumberCount; ++i) {
+        const auto number = parseUnsigned(fields[i + 1]);
+        if (!number)
+            return std::nullopt;
+        numbers[i] = *number;
+    }
+    return FileSystemSize{numbers[0], numbers[1], numbers[2], numbers[3], numbers[4]};
+}
+
+}  // namespace
+
+std::map<std::string, Fact<FileSystemSize>> parseRecordedSizes(std::string_view text) {
+    std::map<std::string, Fact<FileSystemSize>> sizes;
     for (const std::string_view line : linesOf(text)) {
         const std::vector<std::string_view> fields = fieldsOf(line);
-        if (fields.size() != kFieldCount)
-            continue;
-        std::array<std::optional<std::uint64_t>, kFieldCount - 1> numbers;
-        bool complete = true;
-        for (std::size_t i = 0; i < numbers.size(); ++i) {
-            numbers[i] = parseUnsigned(fields[i + 1]);
-            complete = complete && numbers[i].has_value();
-        }
-        if (complete)
-            sizes[unescapeOctal(fields[0])] = {*numbers[0], *numbers[1], *numbers[2], *numbers[3],
-                                               *numbers[4]};
+        if (const auto size = sizeOf(fields))
+            sizes[unescapeOctal(fields[0])] = *size;
+        else if (fields.size() == 2 && fields[1] == kTimedOut)
+            sizes[unescapeOctal(fields[0])] = Absence::TimedOut;
     }
     return sizes;
 }
@@ -30,12 +42,16 @@ std::map<std::string, FileSystemSize> parseRecordedSizes(std::string_view text) 
 RecordedSystemCalls::RecordedSystemCalls(const SystemPaths& paths)
     : sizes(parseRecordedSizes(readText(paths.recordedFileSystemSizes()).value_or(""))) {}
 
-std::optional<FileSystemSize> RecordedSystemCalls::fileSystemSize(
-    const std::string& mountPoint) const {
+Fact<FileSystemSize> RecordedSystemCalls::fileSystemSize(const std::string& mountPoint) const {
     const auto place = sizes.find(mountPoint);
     if (place == sizes.end())
         return std::nullopt;
     return place->second;
+}
+
+Fact<FileSystemSize> RecordedSystemCalls::fileSystemSizeInTime(const std::string& mountPoint,
+                                                               const std::string&) const {
+    return fileSystemSize(mountPoint);
 }
 
 std::optional<std::string> RecordedSystemCalls::machine() const {

@@ -11,20 +11,23 @@
 
 namespace cimomd {
 
-/// Reads lines `mount-point fragment-bytes blocks available-blocks inodes free-inodes`; blanks in
-/// the mount point are written as \040. Other lines are dropped.
-std::map<std::string, FileSystemSize> parseRecordedSizes(std::string_view text);
+/// Reads lines `mount-point fragment-bytes blocks available-blocks inodes free-inodes`, and
+/// `mount-point timeout` of a file system that did not answer; blanks in the mount point are
+/// written as \040. Other lines are dropped.
+std::map<std::string, Fact<FileSystemSize>> parseRecordedSizes(std::string_view text);
 
 class RecordedSystemCalls : public LiveSystemCalls {
   public:
     explicit RecordedSystemCalls(const SystemPaths& paths);
 
-    std::optional<FileSystemSize> fileSystemSize(const std::string& mountPoint) const override;
+    Fact<FileSystemSize> fileSystemSize(const std::string& mountPoint) const override;
+    Fact<FileSystemSize> fileSystemSizeInTime(const std::string& mountPoint,
+                                              const std::string& device) const override;
     /// Always nothing: a tree says it in proc/sys/kernel/arch or not at all.
     std::optional<std::string> machine() const override;
 
   private:
-    std::map<std::string, FileSystemSize> sizes;
+    std::map<std::string, Fact<FileSystemSize>> sizes;
 };
 
 }  // namespace cimomd

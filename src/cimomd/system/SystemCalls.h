@@ -6,6 +6,8 @@
 #include <optional>
 #include <string>
 
+#include "system/Fact.h"
+
 namespace cimomd {
 
 /// As statvfs reports it; counts of blocks are in units of `fragmentBytes`.
@@ -30,7 +32,14 @@ class SystemCalls {
     /// The size of the file system mounted at `mountPoint`, a path without the injected root;
     /// nothing when it cannot be told. Call it for local file systems only: on a dead server the
     /// system call never returns.
-    virtual std::optional<FileSystemSize> fileSystemSize(const std::string& mountPoint) const = 0;
+    virtual Fact<FileSystemSize> fileSystemSize(const std::string& mountPoint) const = 0;
+    /// The same for any file system, within some seconds: TimedOut when it does not answer.
+    /// `device` (major:minor) tells the file system from others.
+    virtual Fact<FileSystemSize> fileSystemSizeInTime(const std::string& mountPoint,
+                                                      const std::string& device) const {
+        static_cast<void>(device);
+        return fileSystemSize(mountPoint);
+    }
     /// The machine's name as uname has it, for example "x86_64".
     virtual std::optional<std::string> machine() const = 0;
 

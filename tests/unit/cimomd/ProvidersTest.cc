@@ -24,7 +24,7 @@ class FixedSystemCalls : public SystemCalls {
   public:
     std::int64_t now() const override { return 1700000000; }
     int utcOffsetMinutes(std::int64_t time) const override { return time < 1690000000 ? 120 : 60; }
-    std::optional<FileSystemSize> fileSystemSize(const std::string& mountPoint) const override {
+    Fact<FileSystemSize> fileSystemSize(const std::string& mountPoint) const override {
         if (mountPoint == "/")
             return FileSystemSize{4096, 2621440, 1310720, 655360, 600000};
         if (mountPoint == "/huge")

@@ -65,12 +65,16 @@ TEST(SystemPaths, refusesToNameAPathWithoutARoot) {
 TEST(RecordedSystemCalls, takesSizesFromTheTreeOnly) {
     RecordedTree tree;
     tree.file("statvfs",
-              "/ 4096 1000 400 50 20\n/my\\040disk 512 8 4 0 0\nnonsense\n/x a b c d e\n");
+              "/ 4096 1000 400 50 20\n/my\\040disk 512 8 4 0 0\nnonsense\n/x a b c d e\n"
+              "/dead timeout\n/odd nothing\n");
     const RecordedSystemCalls calls(tree.paths());
     EXPECT_EQ(calls.fileSystemSize("/"), (FileSystemSize{4096, 1000, 400, 50, 20}));
     EXPECT_EQ(calls.fileSystemSize("/my disk"), (FileSystemSize{512, 8, 4, 0, 0}));
     EXPECT_EQ(calls.fileSystemSize("/x"), std::nullopt);
     EXPECT_EQ(calls.fileSystemSize("/proc"), std::nullopt);
+    EXPECT_EQ(calls.fileSystemSizeInTime("/", "8:1"), calls.fileSystemSize("/"));
+    EXPECT_EQ(calls.fileSystemSizeInTime("/dead", "0:40").reason(), Absence::TimedOut);
+    EXPECT_EQ(calls.fileSystemSize("/odd").reason(), Absence::Absent);
     EXPECT_EQ(calls.machine(), std::nullopt);
 }
 
