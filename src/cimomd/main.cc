@@ -60,12 +60,14 @@ void serveSocket(const std::string& path, HttpServer& server, StopSignal& stop) 
 
 void serve(const Options& options) {
     StopSignal stop;
-    ClassRepository repository;
-    MofCompiler(repository, Pegasus::CIMNamespaceName(kNamespace))
-        .compileFile(options.schemaDirectory / kSchemaFile);
+    const Pegasus::CIMNamespaceName nameSpace(kNamespace);
+    auto classes = std::make_shared<ClassRepository>();
+    MofCompiler(*classes, nameSpace).compileFile(options.schemaDirectory / kSchemaFile);
+    CurrentRepository repository(std::move(classes));
     const std::unique_ptr<SystemCalls> calls = systemCallsFor(options);
     const ProviderList providers = makeProviders(SystemPaths(options.rootDirectory), *calls);
-    const Dispatcher dispatcher(repository, providers);
+    const ProviderIndex index(providers, nameSpace);
+    const Dispatcher dispatcher(repository, index);
     const CimService service(dispatcher);
     HttpServer server(service, {options.maxConnections, options.idleSeconds});
     if (options.connectedDescriptor)

@@ -26,6 +26,8 @@ void appendFlag(std::string& xml, std::string_view name, Boolean value, Boolean 
     }
 }
 
+}  // namespace
+
 void appendQualifier(std::string& xml, const CIMConstQualifier& qualifier) {
     const CIMFlavor& flavor = qualifier.getFlavor();
     xml += "<QUALIFIER";
@@ -40,6 +42,8 @@ void appendQualifier(std::string& xml, const CIMConstQualifier& qualifier) {
     appendValue(xml, qualifier.getValue());
     xml += "</QUALIFIER>";
 }
+
+namespace {
 
 template <typename Owner>
 void appendQualifiers(std::string& xml, const Owner& owner, const ObjectXmlOptions& options) {
@@ -124,6 +128,12 @@ void appendProperties(std::string& xml, const Owner& owner, const ObjectXmlOptio
 
 void appendClassElement(std::string& xml, const CIMConstClass& cimClass,
                         const ObjectXmlOptions& options) {
+    beginClassElement(xml, cimClass, options);
+    endClassElement(xml);
+}
+
+void beginClassElement(std::string& xml, const CIMConstClass& cimClass,
+                       const ObjectXmlOptions& options) {
     xml += "<CLASS";
     appendAttribute(xml, "NAME", cimClass.getClassName().getString());
     if (!cimClass.getSuperClassName().isNull()) {
@@ -132,6 +142,9 @@ void appendClassElement(std::string& xml, const CIMConstClass& cimClass,
     xml += '>';
     appendQualifiers(xml, cimClass, options);
     appendProperties(xml, cimClass, options);
+}
+
+void endClassElement(std::string& xml) {
     xml += "</CLASS>";
 }
 

@@ -12,6 +12,7 @@
 #include <Pegasus/Common/CIMObject.h>
 #include <Pegasus/Common/CIMObjectPath.h>
 #include <Pegasus/Common/CIMPropertyList.h>
+#include <Pegasus/Common/CIMQualifier.h>
 #include <Pegasus/Common/CIMValue.h>
 
 #include <string>
@@ -38,6 +39,14 @@ void appendClassName(std::string& xml, const CIMName& className);
 /// CLASS with its qualifiers and properties. The class must be initialized.
 void appendClassElement(std::string& xml, const CIMConstClass& cimClass,
                         const ObjectXmlOptions& options = ObjectXmlOptions());
+
+/// The same without its end, so that more can be put into the element behind the properties.
+void beginClassElement(std::string& xml, const CIMConstClass& cimClass,
+                       const ObjectXmlOptions& options);
+void endClassElement(std::string& xml);
+
+/// QUALIFIER.
+void appendQualifier(std::string& xml, const CIMConstQualifier& qualifier);
 
 /// INSTANCE with its properties. The instance must be initialized.
 void appendInstance(std::string& xml, const CIMConstInstance& instance,

@@ -1,4 +1,4 @@
-// An operation as a server receives it: one intrinsic method call of DSP0200.
+// An operation as a server receives it: one method call of DSP0200.
 
 #pragma once
 
@@ -39,6 +39,8 @@ class CimRequest {
     std::string messageId;
     /// For example "GetClass", in the client's spelling.
     std::string method;
+    /// A method of a class or an instance (METHODCALL), whose parameters are not kept.
+    Boolean isExtrinsic = false;
     /// The parts of LOCALNAMESPACEPATH, joined by "/"; never null.
     CIMNamespaceName nameSpace;
     std::vector<CimParameter> parameters;

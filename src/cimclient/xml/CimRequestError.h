@@ -6,8 +6,9 @@
 
 namespace Pegasus {
 
-/// Thrown by decodeRequest. To be answered with HTTP status 400 (501 for "unsupported-operation")
-/// and the header `CIMError: <cimError>`, as DSP0200 defines them.
+/// Thrown by decodeRequest. To be answered with HTTP status 400 (501 for "unsupported-operation"
+/// and "multiple-requests-unsupported") and the header `CIMError: <cimError>`, as DSP0200 defines
+/// them.
 struct CimRequestError {
     /// One of DSP0200's words, for example "request-not-valid".
     std::string cimError;

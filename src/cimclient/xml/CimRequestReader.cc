@@ -26,12 +26,15 @@ class RequestReader {
         CimRequest request;
         request.messageId = readMessageHead(reader);
         enterCall();
+        request.isExtrinsic = reader.is("METHODCALL");
         request.method = reader.requiredAttribute("NAME");
-        reader.requireChildNamed("LOCALNAMESPACEPATH");
-        request.nameSpace = PathReader(reader, context).readLocalNamespacePath();
-        readParameters(request);
+        if (request.isExtrinsic) {
+            readMethodCall(request);
+        } else {
+            readOperation(request);
+        }
         if (reader.nextChild()) {
-            reader.failUnexpected("one IMETHODCALL");
+            reader.failUnexpected("one call");
         }
         readMessageEnd(reader);
         return request;
@@ -49,12 +52,33 @@ class RequestReader {
         if (!reader.is("SIMPLEREQ")) {
             reader.failUnexpected("SIMPLEREQ");
         }
-        reader.requireChild("IMETHODCALL");
-        if (reader.is("METHODCALL")) {
-            throw CimRequestError{"unsupported-operation", "methods of classes are not served"};
+        reader.requireChild("IMETHODCALL or METHODCALL");
+        if (!reader.is("IMETHODCALL") && !reader.is("METHODCALL")) {
+            reader.failUnexpected("IMETHODCALL or METHODCALL");
         }
-        if (!reader.is("IMETHODCALL")) {
-            reader.failUnexpected("IMETHODCALL");
+    }
+
+    void readOperation(CimRequest& request) {
+        reader.requireChildNamed("LOCALNAMESPACEPATH");
+        request.nameSpace = PathReader(reader, context).readLocalNamespacePath();
+        readParameters(request);
+    }
+
+    void readMethodCall(CimRequest& request) {
+        reader.requireChild("LOCALCLASSPATH or LOCALINSTANCEPATH");
+        PathReader paths(reader, context);
+        if (reader.is("LOCALCLASSPATH")) {
+            request.nameSpace = paths.readLocalClassPath().getNameSpace();
+        } else if (reader.is("LOCALINSTANCEPATH")) {
+            request.nameSpace = paths.readLocalInstancePath().getNameSpace();
+        } else {
+            reader.failUnexpected("LOCALCLASSPATH or LOCALINSTANCEPATH");
+        }
+        while (reader.nextChild()) {
+            if (!reader.is("PARAMVALUE")) {
+                reader.failUnexpected("PARAMVALUE");
+            }
+            reader.skip();
         }
     }
 

@@ -56,6 +56,10 @@ void endCall(std::string& xml) {
     endMessage(xml);
 }
 
+std::string_view responseElement(CallKind kind) {
+    return kind == CallKind::Extrinsic ? "METHODRESPONSE" : "IMETHODRESPONSE";
+}
+
 }  // namespace
 
 std::string encodeGetClassRequest(std::string_view messageId, const CIMNamespaceName& nameSpace,
@@ -89,15 +93,16 @@ std::string encodeEnumerateInstancesRequest(std::string_view messageId,
     return xml;
 }
 
-void beginResponse(std::string& xml, std::string_view messageId, std::string_view method) {
+void beginResponse(std::string& xml, std::string_view messageId, std::string_view method,
+                   CallKind kind) {
     beginMessage(xml, messageId);
-    xml += "<SIMPLERSP><IMETHODRESPONSE";
+    xml.append("<SIMPLERSP><").append(responseElement(kind));
     appendAttribute(xml, "NAME", method);
     xml += '>';
 }
 
-void endResponse(std::string& xml) {
-    xml += "</IMETHODRESPONSE></SIMPLERSP>";
+void endResponse(std::string& xml, CallKind kind) {
+    xml.append("</").append(responseElement(kind)).append("></SIMPLERSP>");
     endMessage(xml);
 }
 

@@ -33,12 +33,17 @@ std::string encodeEnumerateInstancesRequest(std::string_view messageId,
                                             Boolean includeClassOrigin,
                                             const CIMPropertyList& propertyList);
 
-/// Opens an answer, up to and with the start tag of IMETHODRESPONSE. Follow it with one ERROR, or
-/// with one IRETURNVALUE holding the result, or with nothing when the status goes into trailers.
-void beginResponse(std::string& xml, std::string_view messageId, std::string_view method);
+/// Whether a call is an operation of DSP0200 or a method that a class declares.
+enum class CallKind { Intrinsic, Extrinsic };
+
+/// Opens an answer, up to and with the start tag of IMETHODRESPONSE or METHODRESPONSE. Follow it
+/// with one ERROR, or with one IRETURNVALUE holding the result, or with nothing when the status
+/// goes into trailers.
+void beginResponse(std::string& xml, std::string_view messageId, std::string_view method,
+                   CallKind kind = CallKind::Intrinsic);
 
 /// Closes what beginResponse opened.
-void endResponse(std::string& xml);
+void endResponse(std::string& xml, CallKind kind = CallKind::Intrinsic);
 
 void beginReturnValue(std::string& xml);
 void endReturnValue(std::string& xml);

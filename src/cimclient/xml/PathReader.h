@@ -27,12 +27,14 @@ class PathReader {
     CIMObjectPath readInstanceName();
     /// VALUE.REFERENCE, with any of the six kinds of path in it.
     CIMObjectPath readReference();
+    /// LOCALINSTANCEPATH.
+    CIMObjectPath readLocalInstancePath();
+    /// LOCALCLASSPATH.
+    CIMObjectPath readLocalClassPath();
 
   private:
     CIMObjectPath readAnyPath();
-    CIMObjectPath readLocalInstancePath();
     CIMObjectPath readInstancePath();
-    CIMObjectPath readLocalClassPath();
     CIMObjectPath readClassPath();
     void readNamespacePath(CIMObjectPath& path);
     void readHost(CIMObjectPath& path);

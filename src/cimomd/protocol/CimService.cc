@@ -83,19 +83,22 @@ bool namesNamespace(const std::string& header, const Pegasus::CimRequest& reques
 std::optional<HttpAnswer> headerMismatch(const HttpHead& head, const Pegasus::CimRequest& request) {
     if (head.cimMethod && !namesMethod(*head.cimMethod, request))
         return cimRefusal(kBadRequest, "header-mismatch", "CIMMethod is not the request's method");
-    if (head.cimObject && !namesNamespace(*head.cimObject, request))
+    // A method's object is a path whose spelling differs from client to client.
+    if (!request.isExtrinsic && head.cimObject && !namesNamespace(*head.cimObject, request))
         return cimRefusal(kBadRequest, "header-mismatch",
                           "CIMObject is not the request's namespace");
     return std::nullopt;
 }
 
 unsigned statusOf(const Pegasus::CimRequestError& error) {
-    return error.cimError == "unsupported-operation" ? kNotImplemented : kBadRequest;
+    const bool isMissing = error.cimError == "unsupported-operation" ||
+                           error.cimError == "multiple-requests-unsupported";
+    return isMissing ? kNotImplemented : kBadRequest;
 }
 
 std::unique_ptr<ResponseStream> respond(const Dispatcher& dispatcher,
                                         const Pegasus::CimRequest& request, bool trailers) {
-    auto stream = std::make_unique<ResponseStream>(request.messageId, request.method, trailers);
+    auto stream = std::make_unique<ResponseStream>(request, trailers);
     try {
         stream->succeed(dispatcher.dispatch(request));
     } catch (const Pegasus::CIMException& error) {

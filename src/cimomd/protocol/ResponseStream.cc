@@ -8,7 +8,6 @@
 
 #include "text/CimText.h"
 #include "utf8/Utf8.h"
-#include "xml/CimXmlWriter.h"
 
 namespace cimomd {
 namespace {
@@ -21,8 +20,11 @@ CimStatus CimStatus::of(const Pegasus::CIMException& error) {
     return {static_cast<unsigned>(error.getCode()), utf8Of(error.getMessage())};
 }
 
-ResponseStream::ResponseStream(std::string requestId, std::string methodName, bool trailers)
-    : messageId(std::move(requestId)), method(std::move(methodName)), withTrailers(trailers) {}
+ResponseStream::ResponseStream(const Pegasus::CimRequest& request, bool trailers)
+    : messageId(request.messageId),
+      method(request.method),
+      kind(request.isExtrinsic ? Pegasus::CallKind::Extrinsic : Pegasus::CallKind::Intrinsic),
+      withTrailers(trailers) {}
 
 void ResponseStream::fail(const CimStatus& status) {
     if (handedOver && !withTrailers) {
@@ -32,7 +34,7 @@ void ResponseStream::fail(const CimStatus& status) {
     if (!handedOver) {
         pending.clear();
         offset = 0;
-        Pegasus::beginResponse(pending, messageId, method);
+        Pegasus::beginResponse(pending, messageId, method, kind);
         if (!withTrailers)
             Pegasus::appendError(pending, status.code, cimString(status.description));
     } else if (begun) {
@@ -40,7 +42,7 @@ void ResponseStream::fail(const CimStatus& status) {
     }
     if (withTrailers)
         trailer = status;
-    Pegasus::endResponse(pending);
+    Pegasus::endResponse(pending, kind);
     finished = true;
 }
 
@@ -69,7 +71,7 @@ void ResponseStream::fill() {
 
 void ResponseStream::step() {
     if (!begun) {
-        Pegasus::beginResponse(pending, messageId, method);
+        Pegasus::beginResponse(pending, messageId, method, kind);
         Pegasus::beginReturnValue(pending);
         begun = true;
     }
@@ -91,7 +93,7 @@ void ResponseStream::step() {
 
 void ResponseStream::finish() {
     Pegasus::endReturnValue(pending);
-    Pegasus::endResponse(pending);
+    Pegasus::endResponse(pending, kind);
     finished = true;
 }
 

@@ -11,6 +11,8 @@
 #include <string>
 
 #include "protocol/Answer.h"
+#include "xml/CimRequest.h"
+#include "xml/CimXmlWriter.h"
 
 namespace cimomd {
 
@@ -26,7 +28,7 @@ class ResponseStream {
   public:
     /// `trailers`: the client reads the CIM status from HTTP trailers, so failures are left out of
     /// the body.
-    ResponseStream(std::string requestId, std::string methodName, bool trailers);
+    ResponseStream(const Pegasus::CimRequest& request, bool trailers);
 
     /// What the body shall hold; call one of them once, before read.
     void succeed(std::unique_ptr<Answer> operationAnswer) { answer = std::move(operationAnswer); }
@@ -49,6 +51,7 @@ class ResponseStream {
 
     std::string messageId;
     std::string method;
+    Pegasus::CallKind kind;
     bool withTrailers;
     std::unique_ptr<Answer> answer;
     std::optional<CimStatus> trailer;

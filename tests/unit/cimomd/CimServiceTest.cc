@@ -3,7 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "CimRequests.h"
-#include "mof/MofCompiler.h"
+#include "ServedModel.h"
 #include "protocol/PercentCoding.h"
 
 namespace cimomd {
@@ -12,8 +12,6 @@ namespace {
 class CimServiceTest : public testing::Test {
   protected:
     CimServiceTest() {
-        MofCompiler(repository, Pegasus::CIMNamespaceName("root/cimv2"))
-            .compileText("class A {};", "t");
         head.method = "POST";
         head.path = "/cimom";
         head.contentType = "application/xml; charset=\"utf-8\"";
@@ -45,10 +43,8 @@ class CimServiceTest : public testing::Test {
         return "no header";
     }
 
-    ClassRepository repository;
-    ProviderList providers;
-    Dispatcher dispatcher{repository, providers};
-    CimService service{dispatcher};
+    ServedModel model{"class A {};"};
+    CimService service{model.dispatcher};
     HttpHead head;
 };
 

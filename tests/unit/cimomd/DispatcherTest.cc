@@ -1,96 +1,25 @@
 #include "protocol/Dispatcher.h"
 
-#include <Pegasus/Common/Exception.h>
 #include <gtest/gtest.h>
 
-#include "CimRequests.h"
-#include "mof/MofCompiler.h"
-#include "providers/InstanceBuilder.h"
-#include "providers/RecordStream.h"
-#include "text/CimText.h"
+#include "OperationFixture.h"
 
 namespace cimomd {
 namespace {
 
-/// Serves numbered instances of a class; fails before the one that `failAt` counts.
-class NumberProvider : public Provider {
-  public:
-    NumberProvider(const char* name, int count, int failAt = -1)
-        : name(name), count(count), failAt(failAt) {}
-
-    const char* className() const override { return name; }
-
-    std::unique_ptr<InstanceStream> enumerate() const override {
-        std::vector<int> numbers;
-        for (int i = 1; i <= count; ++i)
-            numbers.push_back(i);
-        const NumberProvider* self = this;
-        return std::make_unique<RecordStream<int>>(
-            numbers, [self](const int& number) { return self->publish(number); });
-    }
-
-  private:
-    ProvidedInstance publish(int number) const {
-        if (number == failAt)
-            throw ProviderError("the source broke");
-        InstanceBuilder builder(name);
-        builder.value<Pegasus::Uint32>("Id", static_cast<Pegasus::Uint32>(number))
-            .text("Note", std::nullopt);
-        if (std::string(name) == "Leaf")
-            builder.text("More", "m");
-        return builder.take();
-    }
-
-    const char* name;
-    int count;
-    int failAt;
-};
-
-class DispatcherTest : public testing::Test {
-  protected:
-    DispatcherTest() {
-        MofCompiler(repository, Pegasus::CIMNamespaceName("root/cimv2")).compileText(kText, "t");
-    }
-
-    /// The elements that the operation returns, or "code: description" of its failure.
-    std::string answerTo(const std::string& body) {
-        const Pegasus::CimRequest request = decoded(body);
-        std::string xml;
-        try {
-            const auto answer = Dispatcher(repository, providers).dispatch(request);
-            while (answer->next(xml)) {
-            }
-        } catch (const Pegasus::CIMException& error) {
-            return std::to_string(error.getCode()) + ": " + utf8Of(error.getMessage());
-        }
-        return xml;
-    }
-
-    static bool has(const std::string& xml, std::string_view part) {
-        return xml.find(part) != std::string::npos;
-    }
-    static int count(const std::string& xml, std::string_view part) {
-        int found = 0;
-        for (std::size_t at = xml.find(part); at != std::string::npos; at = xml.find(part, at + 1))
-            ++found;
-        return found;
-    }
-
-    static constexpr std::string_view kText =
-        "Qualifier Key : boolean = false, Scope(property), Flavor(DisableOverride);\n"
-        "Qualifier Description : string, Scope(any), Flavor(Translatable);\n"
-        "[Description(\"d\")] class Base { [Key] uint32 Id; string Note; };\n"
-        "class Leaf : Base { string More; };\n"
-        "class Other : Base { };\n";
-
-    ClassRepository repository;
-    ProviderList providers;
-};
+class DispatcherTest : public OperationFixture {};
 
 TEST_F(DispatcherTest, namesWhatIsWrongWithARequest) {
     const std::string unknownOperation = "7: the operation DeleteClass is not supported";
     EXPECT_EQ(answerTo(requestBody("DeleteClass", "root/cimv2", "Base")), unknownOperation);
     EXPECT_EQ(answerTo(requestBody("DeleteClass", "root/none", "Base")), unknownOperation);
+    std::string method = requestBody("Reset", "root/cimv2", "");
+    method.replace(method.find("<IMETHODCALL"), 12, "<METHODCALL");
+    method.replace(method.find("</IMETHODCALL"), 13, "</METHODCALL");
+    method.replace(method.find("<LOCALNAMESPACEPATH>"), 20, "<LOCALCLASSPATH><LOCALNAMESPACEPATH>");
+    method.replace(method.find("</LOCALNAMESPACEPATH>"), 21,
+                   "</LOCALNAMESPACEPATH><CLASSNAME NAME=\"Base\"/></LOCALCLASSPATH>");
+    EXPECT_EQ(answerTo(method), "7: methods are not executed here: Reset");
     EXPECT_EQ(answerTo(requestBody("OpenEnumerateInstances", "root/cimv2", "Base")),
               "7: the operation OpenEnumerateInstances is not supported");
     EXPECT_EQ(answerTo(requestBody("GetClass", "root/none", "Base")),
@@ -143,8 +72,8 @@ TEST_F(DispatcherTest, answersGetClassByItsFlags) {
 }
 
 TEST_F(DispatcherTest, givesTheInstancesOfAClassAndItsSubclasses) {
-    providers.push_back(std::make_unique<NumberProvider>("Other", 1));
-    providers.push_back(std::make_unique<NumberProvider>("Leaf", 2));
+    provide("Other", 1);
+    provide("Leaf", 2);
     const std::string all =
         answerTo(requestBody("EnumerateInstances", "root/cimv2", "Base", flag("LocalOnly", false)));
     EXPECT_EQ(count(all, "<VALUE.NAMEDINSTANCE>"), 3);
@@ -160,7 +89,7 @@ TEST_F(DispatcherTest, givesTheInstancesOfAClassAndItsSubclasses) {
 }
 
 TEST_F(DispatcherTest, leavesOutWhatTheFlagsLeaveOut) {
-    providers.push_back(std::make_unique<NumberProvider>("Leaf", 1));
+    provide("Leaf", 1);
     const std::string shallow =
         answerTo(requestBody("EnumerateInstances", "root/cimv2", "Base",
                              flag("LocalOnly", false) + flag("DeepInheritance", false)));
@@ -173,9 +102,12 @@ TEST_F(DispatcherTest, leavesOutWhatTheFlagsLeaveOut) {
     EXPECT_TRUE(has(shallowSome, "PROPERTY NAME=\"Note\""));
     EXPECT_FALSE(has(shallowSome, "NAME=\"More\""));
     EXPECT_FALSE(has(shallowSome, "PROPERTY NAME=\"Id\""));
-    const std::string local = answerTo(requestBody("EnumerateInstances", "root/cimv2", "Leaf"));
+    const std::string local =
+        answerTo(requestBody("EnumerateInstances", "root/cimv2", "Leaf",
+                             flag("LocalOnly", true) + flag("IncludeQualifiers", true)));
     EXPECT_TRUE(has(local, "PROPERTY NAME=\"More\""));
-    EXPECT_FALSE(has(local, "PROPERTY NAME=\"Id\""));
+    EXPECT_TRUE(has(local, "PROPERTY NAME=\"Id\""));
+    EXPECT_FALSE(has(local, "<QUALIFIER"));
     const std::string origin =
         answerTo(requestBody("EnumerateInstances", "root/cimv2", "Leaf",
                              flag("LocalOnly", false) + flag("IncludeClassOrigin", true)));
@@ -187,8 +119,8 @@ TEST_F(DispatcherTest, leavesOutWhatTheFlagsLeaveOut) {
 }
 
 TEST_F(DispatcherTest, anotherClassDoesNotSufferFromAFailingProvider) {
-    providers.push_back(std::make_unique<NumberProvider>("Other", 3, 2));
-    providers.push_back(std::make_unique<NumberProvider>("Leaf", 1));
+    provide("Other", 3, 2);
+    provide("Leaf", 1);
     EXPECT_EQ(answerTo(requestBody("EnumerateInstances", "root/cimv2", "Other")),
               "1: Other: the source broke");
     EXPECT_EQ(count(answerTo(requestBody("EnumerateInstances", "root/cimv2", "Leaf")),

@@ -34,6 +34,13 @@ class RepeatedAnswer : public Answer {
     bool fails;
 };
 
+Pegasus::CimRequest requestFor(const char* method) {
+    Pegasus::CimRequest request;
+    request.messageId = "7";
+    request.method = method;
+    return request;
+}
+
 struct Result {
     std::string body;
     Outcome outcome = Outcome::Data;
@@ -63,7 +70,7 @@ bool endsWhole(const Result& result) {
 }
 
 TEST(ResponseStream, wrapsElements) {
-    ResponseStream stream("7", "GetClass", true);
+    ResponseStream stream(requestFor("GetClass"), true);
     stream.succeed(std::make_unique<RepeatedAnswer>(2, 3, false));
     const Result result = readAll(stream, 7);
     EXPECT_TRUE(endsWhole(result));
@@ -73,13 +80,13 @@ TEST(ResponseStream, wrapsElements) {
 }
 
 TEST(ResponseStream, givesAnEmptyReturnValueForNoElements) {
-    ResponseStream stream("7", "EnumerateInstances", false);
+    ResponseStream stream(requestFor("EnumerateInstances"), false);
     stream.succeed(std::make_unique<RepeatedAnswer>(0, 0, false));
     EXPECT_TRUE(has(readAll(stream), "<IRETURNVALUE></IRETURNVALUE>"));
 }
 
 TEST(ResponseStream, tellsAnErrorInTheBody) {
-    ResponseStream stream("7", "GetClass", false);
+    ResponseStream stream(requestFor("GetClass"), false);
     stream.fail({6, "no \"A\""});
     const Result result = readAll(stream);
     EXPECT_TRUE(endsWhole(result));
@@ -88,8 +95,19 @@ TEST(ResponseStream, tellsAnErrorInTheBody) {
     EXPECT_FALSE(stream.trailerStatus());
 }
 
+TEST(ResponseStream, answersAMethodCallAsSuch) {
+    Pegasus::CimRequest request = requestFor("Reset");
+    request.isExtrinsic = true;
+    ResponseStream stream(request, false);
+    stream.fail({7, "no"});
+    const Result result = readAll(stream);
+    EXPECT_TRUE(has(result,
+                    "<SIMPLERSP><METHODRESPONSE NAME=\"Reset\"><ERROR CODE=\"7\" "
+                    "DESCRIPTION=\"no\"/></METHODRESPONSE></SIMPLERSP>"));
+}
+
 TEST(ResponseStream, tellsAnErrorInTrailersOnly) {
-    ResponseStream stream("7", "GetClass", true);
+    ResponseStream stream(requestFor("GetClass"), true);
     stream.fail({6, "no A"});
     const Result result = readAll(stream);
     EXPECT_TRUE(endsWhole(result));
@@ -101,7 +119,7 @@ TEST(ResponseStream, tellsAnErrorInTrailersOnly) {
 }
 
 TEST(ResponseStream, takesAnEarlyFailureBackEntirely) {
-    ResponseStream stream("7", "EnumerateInstances", false);
+    ResponseStream stream(requestFor("EnumerateInstances"), false);
     stream.succeed(std::make_unique<RepeatedAnswer>(3, 10, true));
     const Result result = readAll(stream);
     EXPECT_TRUE(endsWhole(result));
@@ -110,7 +128,7 @@ TEST(ResponseStream, takesAnEarlyFailureBackEntirely) {
 }
 
 TEST(ResponseStream, breaksOffWhenItIsTooLateForAnError) {
-    ResponseStream stream("7", "EnumerateInstances", false);
+    ResponseStream stream(requestFor("EnumerateInstances"), false);
     stream.succeed(std::make_unique<RepeatedAnswer>(100, 1000, true));
     const Result result = readAll(stream);
     EXPECT_EQ(result.outcome, Outcome::Broken);
@@ -118,7 +136,7 @@ TEST(ResponseStream, breaksOffWhenItIsTooLateForAnError) {
 }
 
 TEST(ResponseStream, tellsALateFailureInTrailers) {
-    ResponseStream stream("7", "EnumerateInstances", true);
+    ResponseStream stream(requestFor("EnumerateInstances"), true);
     stream.succeed(std::make_unique<RepeatedAnswer>(100, 1000, true));
     const Result result = readAll(stream);
     EXPECT_TRUE(endsWhole(result));

@@ -175,7 +175,7 @@ TEST(CimRequest, OtherKindsOfRequests) {
     EXPECT_EQ(refusal(head + "<MULTIEXPREQ/>" + tail), "multiple-requests-unsupported");
     EXPECT_EQ(refusal(head + "<SIMPLEEXPREQ/>" + tail), "unsupported-operation");
     EXPECT_EQ(refusal(head + "<SIMPLEREQ><METHODCALL NAME=\"Reset\"/></SIMPLEREQ>" + tail),
-              "unsupported-operation");
+              "request-not-valid");
     EXPECT_EQ(refusal(head + "<SIMPLERSP/>" + tail), "request-not-valid");
     EXPECT_EQ(refusal(head + "<SIMPLEREQ/>" + tail), "request-not-valid");
     EXPECT_EQ(refusal(head + "<SIMPLEREQ><OTHER/></SIMPLEREQ>" + tail), "request-not-valid");

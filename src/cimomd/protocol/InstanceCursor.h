@@ -1,0 +1,50 @@
+#pragma once
+
+// The instances of one or more classes, one after the other: for each class those that MOF files
+// declare, then those of its provider.
+
+#include <Pegasus/Common/CIMClass.h>
+#include <Pegasus/Common/CIMInstance.h>
+
+#include <memory>
+#include <vector>
+
+#include "protocol/Model.h"
+#include "providers/InstanceStream.h"
+
+namespace cimomd {
+
+class InstanceCursor {
+  public:
+    /// Gives the instances of exactly these classes, all of which the model has in the namespace.
+    InstanceCursor(Model servedModel, Pegasus::CIMNamespaceName instanceNamespace,
+                   std::vector<Pegasus::CIMName> classNames);
+
+    /// The next instance with its path and with the class of origin of its properties; false when
+    /// there is none left. Raises Pegasus::CIMException with CIM_ERR_FAILED and the name of the
+    /// class whose provider failed.
+    bool next(Pegasus::CIMInstance& instance);
+
+  private:
+    bool openNextClass();
+    void openProvider(const Provider& provider);
+    bool nextOfClass(Pegasus::CIMInstance& instance);
+    bool nextProvided(Pegasus::CIMInstance& instance);
+    void setOrigins(Pegasus::CIMInstance& instance) const;
+    Pegasus::CIMObjectPath pathOf(const Pegasus::CIMInstance& instance) const;
+    [[noreturn]] void fail(const std::string& reason) const;
+
+    Model model;
+    Pegasus::CIMNamespaceName nameSpace;
+    std::vector<Pegasus::CIMName> classes;
+    /// One past the class that is being read.
+    std::size_t position = 0;
+    Pegasus::CIMConstClass cimClass;
+    /// Of that class, owned by the model.
+    const std::vector<Pegasus::CIMConstInstance>* declared = nullptr;
+    std::size_t declaredPosition = 0;
+    std::vector<Pegasus::CIMName> keys;
+    std::unique_ptr<InstanceStream> stream;
+};
+
+}  // namespace cimomd

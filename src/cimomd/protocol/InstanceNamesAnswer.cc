@@ -1,0 +1,20 @@
+#include "protocol/InstanceNamesAnswer.h"
+
+#include <utility>
+
+#include "model/ObjectXml.h"
+
+namespace cimomd {
+
+InstanceNamesAnswer::InstanceNamesAnswer(InstanceCursor instances) : cursor(std::move(instances)) {}
+
+bool InstanceNamesAnswer::next(std::string& xml) {
+    Pegasus::CIMInstance instance;
+    if (!cursor.next(instance))
+        return false;
+    Pegasus::appendInstanceName(xml, instance.getPath());
+    xml += '\n';
+    return true;
+}
+
+}  // namespace cimomd
