@@ -6,17 +6,25 @@
 #include <optional>
 #include <string>
 
+#include "protocol/HttpServer.h"
+#include "protocol/LoopbackAddress.h"
+#include "service/UnixListener.h"
+
 namespace cimomd {
 
 struct Options {
-    /// Exactly one of the two is set.
+    /// The only client, which excludes the places to listen at.
     std::optional<int> connectedDescriptor;
+    /// Empty for none.
     std::string socketPath;
+    SocketAccess socketAccess;
+    std::optional<LoopbackAddress> httpAddress;
     /// The directory of the schema.
     std::filesystem::path schemaDirectory;
+    /// The administrator's own MOF files, if any shall be served.
+    std::optional<std::filesystem::path> mofDirectory;
     std::filesystem::path rootDirectory = "/";
-    unsigned maxConnections = 128;
-    unsigned idleSeconds = 30;
+    HttpLimits limits;
 };
 
 /// The options, or the exit status when there is nothing to serve: 0 after --help and --version, 1

@@ -1,5 +1,5 @@
-// cimomd: a local CIM object manager. It compiles its schema, then serves one connection, or a
-// socket, until it is told to stop.
+// cimomd: a local CIM object manager. It compiles its schema, then serves one connection, or those
+// of its sockets, until it is told to stop.
 
 #include <fmt/format.h>
 #include <sys/prctl.h>
@@ -11,11 +11,14 @@
 #include <stdexcept>
 
 #include "Options.h"
-#include "StopSignal.h"
-#include "mof/MofCompiler.h"
-#include "protocol/HttpServer.h"
-#include "protocol/UnixListener.h"
+#include "protocol/CimService.h"
 #include "providers/ProviderList.h"
+#include "repository/CurrentRepository.h"
+#include "service/Log.h"
+#include "service/LoopbackListener.h"
+#include "service/MainLoop.h"
+#include "service/SchemaLoader.h"
+#include "service/ServiceManager.h"
 #include "system/LiveSystemCalls.h"
 #include "system/RecordedSystemCalls.h"
 
@@ -45,35 +48,79 @@ void endWithParent() {
     ::prctl(PR_SET_PDEATHSIG, SIGTERM);
 }
 
-void serveDescriptor(int descriptor, HttpServer& server, StopSignal& stop) {
-    requireStreamSocket(descriptor);
-    endWithParent();
-    server.serveConnection(descriptor, [&stop] { stop.request(); });
-    stop.wait();
+/// The listening sockets of a daemon, those that were handed over included.
+class Listeners {
+  public:
+    Listeners(const Options& options, MainLoop& loop) {
+        if (!options.socketPath.empty())
+            loop.listenOn(unixSocket.emplace(options.socketPath, options.socketAccess).socket());
+        if (options.httpAddress) {
+            loop.listenOn(http.emplace(*options.httpAddress).descriptor());
+            fmt::print("listening on {}\n", http->url());
+            std::fflush(stdout);
+        }
+        const std::vector<int> handedOver = ServiceManager::takeListeningSockets();
+        for (const int socket : handedOver)
+            loop.listenOn(socket);
+        if (!unixSocket && !http && handedOver.empty())
+            throw std::runtime_error("nowhere to serve: give --fd, --socket or --http");
+    }
+
+  private:
+    std::optional<UnixListener> unixSocket;
+    std::optional<LoopbackListener> http;
+};
+
+/// Old classes stay when the new ones are wrong.
+void reload(const SchemaLoader& loader, CurrentRepository& repository) {
+    ServiceManager::notifyReloading();
+    try {
+        repository.replace(loader.loadAll());
+        logLine(LogLevel::Info, "the classes have been loaded again");
+    } catch (const std::exception& error) {
+        logLine(LogLevel::Error, fmt::format("the old classes stay: {}", error.what()));
+    }
+    ServiceManager::notify("READY=1");
 }
 
-void serveSocket(const std::string& path, HttpServer& server, StopSignal& stop) {
-    UnixListener listener(path);
-    server.listenOn(listener.release());
-    stop.wait();
+void runDaemon(const Options& options, MainLoop& loop, const SchemaLoader& loader,
+               CurrentRepository& repository) {
+    const Listeners listeners(options, loop);
+    ServiceManager::notify("READY=1");
+    loop.run([&] { reload(loader, repository); });
+    ServiceManager::notify("STOPPING=1");
+}
+
+void runEmbedded(int descriptor, MainLoop& loop, const SchemaLoader& loader,
+                 CurrentRepository& repository) {
+    requireStreamSocket(descriptor);
+    endWithParent();
+    loop.serveOnly(descriptor);
+    loop.run([&] { reload(loader, repository); });
+}
+
+HttpLimits limitsFor(const Options& options) {
+    // The parent may be as slow as it likes.
+    return options.connectedDescriptor ? HttpLimits{1, std::chrono::seconds(0)} : options.limits;
 }
 
 void serve(const Options& options) {
-    StopSignal stop;
+    Signals signals;
     const Pegasus::CIMNamespaceName nameSpace(kNamespace);
-    auto classes = std::make_shared<ClassRepository>();
-    MofCompiler(*classes, nameSpace).compileFile(options.schemaDirectory / kSchemaFile);
-    CurrentRepository repository(std::move(classes));
+    const SchemaLoader loader(
+        {options.schemaDirectory / kSchemaFile, options.mofDirectory, nameSpace});
+    CurrentRepository repository(loader.loadWhatIsRight());
     const std::unique_ptr<SystemCalls> calls = systemCallsFor(options);
     const ProviderList providers = makeProviders(SystemPaths(options.rootDirectory), *calls);
     const ProviderIndex index(providers, nameSpace);
     const Dispatcher dispatcher(repository, index);
     const CimService service(dispatcher);
-    HttpServer server(service, {options.maxConnections, options.idleSeconds});
+    HttpServer server(service, limitsFor(options));
+    MainLoop loop(server, signals);
     if (options.connectedDescriptor)
-        serveDescriptor(*options.connectedDescriptor, server, stop);
+        runEmbedded(*options.connectedDescriptor, loop, loader, repository);
     else
-        serveSocket(options.socketPath, server, stop);
+        runDaemon(options, loop, loader, repository);
 }
 
 }  // namespace
@@ -88,7 +135,7 @@ int main(int argc, char** argv) {
         cimomd::serve(parsed.options);
         return 0;
     } catch (const std::exception& error) {
-        std::fputs(fmt::format("cimomd: {}\n", error.what()).c_str(), stderr);
+        cimomd::logLine(cimomd::LogLevel::Error, error.what());
         return 1;
     }
 }

@@ -7,6 +7,7 @@
 #include <utility>
 
 #include "files/TextFields.h"
+#include "protocol/LoopbackAddress.h"
 #include "protocol/PercentCoding.h"
 #include "text/CimText.h"
 #include "text/Utf8.h"
@@ -19,6 +20,7 @@ namespace {
 constexpr std::string_view kPath = "/cimom";
 
 constexpr unsigned kBadRequest = 400;
+constexpr unsigned kForbidden = 403;
 constexpr unsigned kNotFound = 404;
 constexpr unsigned kMethodNotAllowed = 405;
 constexpr unsigned kBodyTooLarge = 413;
@@ -114,6 +116,8 @@ std::unique_ptr<ResponseStream> respond(const Dispatcher& dispatcher,
 }  // namespace
 
 std::optional<HttpAnswer> CimService::refusalOf(const HttpHead& head) const {
+    if (head.fromNetwork && (!head.host || !isLoopbackHost(*head.host)))
+        return refusal(kForbidden);
     if (head.method == "M-POST")
         return refusal(kNotImplemented);
     if (head.method != "POST") {

@@ -17,6 +17,9 @@ namespace cimomd {
 struct HttpHead {
     std::string method;
     std::string path;
+    /// Over TCP, where the Host header tells under which name the client looked for this server.
+    bool fromNetwork = false;
+    std::optional<std::string> host;
     std::optional<std::string> contentType;
     std::optional<std::string> contentLength;
     std::optional<std::string> te;

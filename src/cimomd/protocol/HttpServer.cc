@@ -4,21 +4,33 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
-#include <algorithm>
+#include <atomic>
 #include <chrono>
 #include <stdexcept>
 #include <string>
 #include <utility>
 
+#include "protocol/ConnectionWatch.h"
 #include "protocol/PercentCoding.h"
 
 namespace cimomd {
 
 struct HttpServer::State {
+    State(const CimService& cimService, HttpLimits httpLimits)
+        : service(cimService), limits(httpLimits) {}
+
     const CimService& service;
     HttpLimits limits;
     std::function<void()> closed;
+    ConnectionWatch watch;
+    /// Handed to the library, which takes them up in its own time, and not closed yet.
+    std::atomic<std::size_t> connections = 0;
     MHD_Daemon* daemon = nullptr;
+
+    MHD_Result handle(MHD_Connection* connection, const char* url, const char* method,
+                      std::string_view data, void** context);
+    MHD_Result begin(MHD_Connection* connection, const char* url, const char* method,
+                     void** context);
 };
 
 namespace {
@@ -26,11 +38,9 @@ namespace {
 // A connection's memory holds the request's head and the piece of the answer being sent.
 constexpr std::size_t kConnectionMemoryBytes = std::size_t{32} << 10;
 constexpr std::size_t kAnswerPieceBytes = std::size_t{8} << 10;
-constexpr unsigned kListenThreads = 4;
 // A body that is too long is read to its end, so that the client sees the refusal instead of a
 // reset; beyond this the connection is simply closed.
 constexpr std::size_t kMaxDrainedBytes = std::size_t{16} << 20;
-constexpr auto kMaxUploadTime = std::chrono::seconds(60);
 
 /// One request while it arrives.
 struct Exchange {
@@ -38,7 +48,6 @@ struct Exchange {
     std::optional<HttpAnswer> refusal;
     std::string body;
     std::size_t receivedBytes = 0;
-    std::chrono::steady_clock::time_point started = std::chrono::steady_clock::now();
 
     bool takes(std::string_view piece) {
         receivedBytes += piece.size();
@@ -46,8 +55,7 @@ struct Exchange {
             refusal = CimService::bodyTooLarge();
         if (!refusal)
             body += piece;
-        const bool tooSlow = std::chrono::steady_clock::now() - started > kMaxUploadTime;
-        return receivedBytes <= kMaxDrainedBytes && !tooSlow;
+        return receivedBytes <= kMaxDrainedBytes;
     }
 };
 
@@ -55,8 +63,37 @@ struct Exchange {
 struct Sending {
     std::unique_ptr<ResponseStream> body;
     MHD_Response* response = nullptr;
-    bool trailers = false;
+    WatchedConnection* watched = nullptr;
+    std::chrono::seconds patience{};
 };
+
+/// The server's turn: the time until its end does not count against the client.
+class ServersTurn {
+  public:
+    ServersTurn(WatchedConnection* connection, std::chrono::seconds clientsPatience)
+        : watched(connection), patience(clientsPatience) {
+        watched->waitForServer();
+    }
+    ~ServersTurn() { watched->expectProgress(patience); }
+    ServersTurn(const ServersTurn&) = delete;
+    ServersTurn& operator=(const ServersTurn&) = delete;
+
+  private:
+    WatchedConnection* watched;
+    std::chrono::seconds patience;
+};
+
+WatchedConnection* watchedOf(MHD_Connection* connection) {
+    const MHD_ConnectionInfo* info =
+        MHD_get_connection_info(connection, MHD_CONNECTION_INFO_SOCKET_CONTEXT);
+    return static_cast<WatchedConnection*>(info->socket_context);
+}
+
+bool isFromNetwork(MHD_Connection* connection) {
+    const MHD_ConnectionInfo* info =
+        MHD_get_connection_info(connection, MHD_CONNECTION_INFO_CLIENT_ADDRESS);
+    return info->client_addr->sa_family != AF_UNIX;
+}
 
 std::optional<std::string> header(MHD_Connection* connection, const char* name) {
     const char* value = MHD_lookup_connection_value(connection, MHD_HEADER_KIND, name);
@@ -67,6 +104,8 @@ HttpHead headOf(MHD_Connection* connection, const char* url, const char* method)
     HttpHead head;
     head.method = method;
     head.path = url;
+    head.fromNetwork = isFromNetwork(connection);
+    head.host = header(connection, MHD_HTTP_HEADER_HOST);
     head.contentType = header(connection, MHD_HTTP_HEADER_CONTENT_TYPE);
     head.contentLength = header(connection, MHD_HTTP_HEADER_CONTENT_LENGTH);
     head.te = header(connection, MHD_HTTP_HEADER_TE);
@@ -88,6 +127,7 @@ void addTrailers(const Sending& sending) {
 
 ssize_t readAnswer(void* closure, std::uint64_t, char* buffer, std::size_t capacity) try {
     auto* sending = static_cast<Sending*>(closure);
+    const ServersTurn turn(sending->watched, sending->patience);
     std::size_t count = 0;
     switch (sending->body->read(buffer, capacity, count)) {
         case ResponseStream::Outcome::Data:
@@ -108,14 +148,16 @@ void freeSending(void* closure) {
     delete static_cast<Sending*>(closure);
 }
 
-MHD_Response* responseOf(HttpAnswer& answer) {
+MHD_Response* responseOf(HttpAnswer& answer, WatchedConnection* watched,
+                         std::chrono::seconds patience) {
     MHD_Response* response = nullptr;
     if (answer.body == nullptr) {
         response = MHD_create_response_from_buffer(0, nullptr, MHD_RESPMEM_PERSISTENT);
     } else {
         auto sending = std::make_unique<Sending>();
         sending->body = std::move(answer.body);
-        sending->trailers = answer.trailers;
+        sending->watched = watched;
+        sending->patience = patience;
         Sending* closure = sending.release();
         response = MHD_create_response_from_callback(MHD_SIZE_UNKNOWN, kAnswerPieceBytes,
                                                      readAnswer, closure, freeSending);
@@ -131,8 +173,8 @@ MHD_Response* responseOf(HttpAnswer& answer) {
     return response;
 }
 
-MHD_Result queue(MHD_Connection* connection, HttpAnswer answer) {
-    MHD_Response* response = responseOf(answer);
+MHD_Result queue(MHD_Connection* connection, HttpAnswer answer, std::chrono::seconds patience) {
+    MHD_Response* response = responseOf(answer, watchedOf(connection), patience);
     if (response == nullptr)
         return MHD_NO;
     const MHD_Result result = MHD_queue_response(connection, answer.status, response);
@@ -140,89 +182,124 @@ MHD_Result queue(MHD_Connection* connection, HttpAnswer answer) {
     return result;
 }
 
-MHD_Result begin(const CimService& service, MHD_Connection* connection, const char* url,
-                 const char* method, void** context) {
+void freeExchange(void** context) {
+    delete static_cast<Exchange*>(*context);
+    *context = nullptr;
+}
+
+}  // namespace
+
+MHD_Result HttpServer::State::begin(MHD_Connection* connection, const char* url, const char* method,
+                                    void** context) {
     auto exchange = std::make_unique<Exchange>();
     exchange->head = headOf(connection, url, method);
     exchange->refusal = service.refusalOf(exchange->head);
     const auto expect = header(connection, MHD_HTTP_HEADER_EXPECT);
     // A client that asks before it sends its body is told at once.
     if (exchange->refusal && expect)
-        return queue(connection, std::move(*exchange->refusal));
+        return queue(connection, std::move(*exchange->refusal), limits.patience);
     *context = exchange.release();
+    watchedOf(connection)->expectProgress(limits.patience);
     return MHD_YES;
 }
 
-MHD_Result handle(void* closure, MHD_Connection* connection, const char* url, const char* method,
-                  const char*, const char* data, std::size_t* size, void** context) try {
-    const CimService& service = *static_cast<const CimService*>(closure);
+MHD_Result HttpServer::State::handle(MHD_Connection* connection, const char* url,
+                                     const char* method, std::string_view data, void** context) {
     auto* exchange = static_cast<Exchange*>(*context);
     if (exchange == nullptr)
-        return begin(service, connection, url, method, context);
-    if (*size != 0) {
-        const bool goOn = exchange->takes({data, *size});
-        *size = 0;
-        return goOn ? MHD_YES : MHD_NO;
-    }
+        return begin(connection, url, method, context);
+    if (!data.empty())
+        return exchange->takes(data) ? MHD_YES : MHD_NO;
+    const ServersTurn turn(watchedOf(connection), limits.patience);
     if (exchange->refusal)
-        return queue(connection, std::move(*exchange->refusal));
-    return queue(connection, service.answer(exchange->head, exchange->body));
-} catch (...) {
-    // Out of memory: give this connection up, the others go on.
-    return MHD_NO;
+        return queue(connection, std::move(*exchange->refusal), limits.patience);
+    return queue(connection, service.answer(exchange->head, exchange->body), limits.patience);
 }
-
-void completed(void*, MHD_Connection*, void** context, MHD_RequestTerminationCode) {
-    delete static_cast<Exchange*>(*context);
-    *context = nullptr;
-}
-
-void connectionChanged(void* closure, MHD_Connection*, void**,
-                       MHD_ConnectionNotificationCode code) {
-    const auto& closed = *static_cast<const std::function<void()>*>(closure);
-    if (code == MHD_CONNECTION_NOTIFY_CLOSED && closed)
-        closed();
-}
-
-}  // namespace
 
 HttpServer::HttpServer(const CimService& cimService, HttpLimits httpLimits)
-    : state(new State{cimService, httpLimits, {}, nullptr}) {}
+    : state(std::make_unique<State>(cimService, httpLimits)) {}
 
 HttpServer::~HttpServer() {
-    if (state->daemon != nullptr)
-        MHD_stop_daemon(state->daemon);
+    stop();
 }
 
-void HttpServer::listenOn(int listeningSocket) {
-    // The library shares the connections out among its threads and wants at least one for each.
-    const unsigned connections = std::max(state->limits.maxConnections, kListenThreads);
+void HttpServer::stop() {
+    if (state->daemon != nullptr)
+        MHD_stop_daemon(state->daemon);
+    state->daemon = nullptr;
+}
+
+void HttpServer::start(std::function<void()> closed) {
+    state->closed = std::move(closed);
+    const auto handle = [](void* closure, MHD_Connection* connection, const char* url,
+                           const char* method, const char*, const char* data, std::size_t* size,
+                           void** context) -> MHD_Result {
+        try {
+            const std::string_view piece(data, std::exchange(*size, 0));
+            return static_cast<State*>(closure)->handle(connection, url, method, piece, context);
+        } catch (...) {
+            // Out of memory: give this connection up, the others go on.
+            return MHD_NO;
+        }
+    };
+    const auto completed = [](void* closure, MHD_Connection* connection, void** context,
+                              MHD_RequestTerminationCode) {
+        freeExchange(context);
+        watchedOf(connection)->expectProgress(static_cast<State*>(closure)->limits.patience);
+    };
+    const auto changed = [](void* closure, MHD_Connection* connection, void** socketContext,
+                            MHD_ConnectionNotificationCode code) {
+        auto* server = static_cast<State*>(closure);
+        if (code == MHD_CONNECTION_NOTIFY_STARTED) {
+            WatchedConnection* watched = server->watch.add(
+                MHD_get_connection_info(connection, MHD_CONNECTION_INFO_CONNECTION_FD)->connect_fd);
+            watched->expectProgress(server->limits.patience);
+            *socketContext = watched;
+        } else {
+            server->watch.remove(static_cast<WatchedConnection*>(*socketContext));
+            --server->connections;
+            server->closed();
+        }
+    };
+    using Handler = MHD_AccessHandlerCallback;
     state->daemon = MHD_start_daemon(
-        MHD_USE_INTERNAL_POLLING_THREAD | MHD_USE_EPOLL, 0, nullptr, nullptr, handle,
-        const_cast<CimService*>(&state->service), MHD_OPTION_LISTEN_SOCKET, listeningSocket,
-        MHD_OPTION_THREAD_POOL_SIZE, kListenThreads, MHD_OPTION_CONNECTION_LIMIT, connections,
-        MHD_OPTION_CONNECTION_TIMEOUT, state->limits.idleSeconds,
+        MHD_USE_INTERNAL_POLLING_THREAD | MHD_USE_THREAD_PER_CONNECTION | MHD_USE_POLL |
+            MHD_USE_ITC | MHD_USE_NO_LISTEN_SOCKET,
+        0, nullptr, nullptr, static_cast<Handler>(handle), state.get(), MHD_OPTION_CONNECTION_LIMIT,
+        state->limits.maxConnections + 1, MHD_OPTION_CONNECTION_TIMEOUT, 0U,
         MHD_OPTION_CONNECTION_MEMORY_LIMIT, kConnectionMemoryBytes, MHD_OPTION_NOTIFY_COMPLETED,
-        completed, nullptr, MHD_OPTION_END);
+        static_cast<MHD_RequestCompletedCallback>(completed), state.get(),
+        MHD_OPTION_NOTIFY_CONNECTION, static_cast<MHD_NotifyConnectionCallback>(changed),
+        state.get(), MHD_OPTION_END);
     if (state->daemon == nullptr)
         throw std::runtime_error("the HTTP server cannot be started");
 }
 
-void HttpServer::serveConnection(int connectedSocket, std::function<void()> closed) {
-    state->closed = std::move(closed);
-    state->daemon = MHD_start_daemon(
-        MHD_USE_INTERNAL_POLLING_THREAD | MHD_USE_POLL | MHD_USE_ITC | MHD_USE_NO_LISTEN_SOCKET, 0,
-        nullptr, nullptr, handle, const_cast<CimService*>(&state->service),
-        MHD_OPTION_CONNECTION_LIMIT, 1U, MHD_OPTION_CONNECTION_TIMEOUT, 0U,
-        MHD_OPTION_CONNECTION_MEMORY_LIMIT, kConnectionMemoryBytes, MHD_OPTION_NOTIFY_COMPLETED,
-        completed, nullptr, MHD_OPTION_NOTIFY_CONNECTION, connectionChanged, &state->closed,
-        MHD_OPTION_END);
+bool HttpServer::serve(int connectedSocket) {
     sockaddr_storage peer{};
-    peer.ss_family = AF_UNIX;
-    if (state->daemon == nullptr ||
-        MHD_add_connection(state->daemon, connectedSocket, reinterpret_cast<sockaddr*>(&peer),
-                           sizeof(sa_family_t)) != MHD_YES)
-        throw std::runtime_error("the connection cannot be served");
+    socklen_t length = sizeof peer;
+    if (::getpeername(connectedSocket, reinterpret_cast<sockaddr*>(&peer), &length) != 0) {
+        ::close(connectedSocket);
+        return false;
+    }
+    ++state->connections;
+    if (MHD_add_connection(state->daemon, connectedSocket, reinterpret_cast<sockaddr*>(&peer),
+                           length) == MHD_YES)
+        return true;
+    --state->connections;
+    return false;
+}
+
+std::size_t HttpServer::connections() const {
+    return state->connections;
+}
+
+bool HttpServer::hasRoom() const {
+    return connections() < state->limits.maxConnections;
+}
+
+void HttpServer::closeOverdue() {
+    state->watch.shutDownOverdue();
 }
 
 }  // namespace cimomd

@@ -2,6 +2,7 @@
 
 // HTTP/1.1 for the CIM service, by libmicrohttpd, which runs its own threads.
 
+#include <chrono>
 #include <functional>
 #include <memory>
 
@@ -11,27 +12,34 @@ namespace cimomd {
 
 struct HttpLimits {
     unsigned maxConnections = 128;
-    /// Seconds without traffic after which a connection is closed; 0 for never.
-    unsigned idleSeconds = 30;
+    /// What a client has for each step: to send a request's head, its body, and to take each
+    /// piece of the answer; also how long a connection may stay idle. 0 for ever.
+    std::chrono::seconds patience{30};
 };
 
+/// Every connection has a thread of its own, so that a slow source keeps nobody else waiting.
 class HttpServer {
   public:
     /// `cimService` must outlive the server.
     HttpServer(const CimService& cimService, HttpLimits httpLimits);
-    /// Stops serving: closes all connections and, when it listened, the listening socket.
     ~HttpServer();
     HttpServer(const HttpServer&) = delete;
     HttpServer& operator=(const HttpServer&) = delete;
 
-    /// Accepts connections from a listening socket, which the server closes at its end. Raises
-    /// std::runtime_error when it cannot start. Call one of the two once.
-    void listenOn(int listeningSocket);
+    /// Raises std::runtime_error when it cannot start. `closed` is called from other threads when
+    /// a connection has ended.
+    void start(std::function<void()> closed);
+    /// Closes all connections.
+    void stop();
 
-    /// Serves one connected stream socket, which the server closes at its end. `closed` is called
-    /// from another thread when the connection has ended. Raises std::runtime_error when it cannot
-    /// start.
-    void serveConnection(int connectedSocket, std::function<void()> closed);
+    /// Serves a connected stream socket and closes it at its end, also when false says that it
+    /// cannot be served.
+    bool serve(int connectedSocket);
+
+    std::size_t connections() const;
+    bool hasRoom() const;
+    /// Ends the connections of clients that are too slow. To be called now and then.
+    void closeOverdue();
 
   private:
     struct State;

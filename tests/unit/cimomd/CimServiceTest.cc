@@ -2,6 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include <string>
+#include <vector>
+
 #include "CimRequests.h"
 #include "ServedModel.h"
 #include "protocol/PercentCoding.h"
@@ -79,6 +82,23 @@ TEST_F(CimServiceTest, refusesABadHead) {
     EXPECT_EQ(refusedWith(), 413U);
 }
 
+TEST_F(CimServiceTest, takesRequestsOverTheNetworkUnderLoopbackNamesOnly) {
+    head.fromNetwork = true;
+    EXPECT_EQ(refusedWith(), 403U);
+    for (const char* name :
+         {"localhost", "LOCALHOST:5988", "127.0.0.1:5988", "127.8.9.1", "[::1]:5988", "[::1]"}) {
+        head.host = name;
+        EXPECT_EQ(refusedWith(), 0U) << name;
+    }
+    for (const char* name : {"", "example.org", "localhost.example.org:80", "10.0.0.1", "128.0.0.1",
+                             "127.0.0.1.example.org", "localhost:x", "[::2]", "127.1"}) {
+        head.host = name;
+        EXPECT_EQ(refusedWith(), 403U) << name;
+    }
+    head.fromNetwork = false;
+    EXPECT_EQ(refusedWith(), 0U);
+}
+
 TEST_F(CimServiceTest, answersAnOperation) {
     const std::string answer = answerTo(requestBody("GetClass", "root/cimv2", "A"));
     EXPECT_NE(answer.find("200 "), std::string::npos);
@@ -100,13 +120,65 @@ TEST_F(CimServiceTest, checksTheHeadersAgainstTheBody) {
 }
 
 TEST_F(CimServiceTest, refusesABodyThatIsNoOperation) {
-    EXPECT_EQ(answerTo(""), "400 request-not-well-formed");
-    EXPECT_EQ(answerTo("<CIM"), "400 request-not-well-formed");
-    EXPECT_EQ(answerTo("hello"), "400 request-not-well-formed");
-    EXPECT_EQ(answerTo("<CIM CIMVERSION=\"2.0\" DTDVERSION=\"2.0\"/>"), "400 request-not-valid");
-    std::string body = requestBody("GetClass", "root/cimv2", "A");
-    body.replace(body.find("PROTOCOLVERSION=\"1.0\""), 21, "PROTOCOLVERSION=\"3.0\"");
-    EXPECT_EQ(answerTo(body), "400 unsupported-protocol-version");
+    const std::string good = requestBody("GetClass", "root/cimv2", "A");
+    struct Case {
+        std::string from;
+        std::string to;
+        std::string answer;
+    };
+    const std::vector<Case> cases{
+        {good, "", "400 request-not-well-formed"},
+        {good, "<CIM", "400 request-not-well-formed"},
+        {good, "hello", "400 request-not-well-formed"},
+        {"</MESSAGE>", "", "400 request-not-well-formed"},
+        {"<MESSAGE ID=\"7\"", "<MESSAGE ID=\"7\" ID=\"8\"", "400 request-not-well-formed"},
+        {good, "<CIM CIMVERSION=\"2.0\" DTDVERSION=\"2.0\"/>", "400 request-not-valid"},
+        {"<MESSAGE ID=\"7\"", "<MESSAGE", "400 request-not-valid"},
+        {" NAME=\"GetClass\"", "", "400 request-not-valid"},
+        {"PROTOCOLVERSION=\"1.0\"", "PROTOCOLVERSION=\"3.0\"", "400 unsupported-protocol-version"},
+        {"CIMVERSION=\"2.0\"", "CIMVERSION=\"3.0\"", "400 unsupported-cim-version"},
+        {"DTDVERSION=\"2.0\"", "DTDVERSION=\"3.0\"", "400 unsupported-dtd-version"},
+        {good.substr(good.find("<SIMPLEREQ>"), good.find("</MESSAGE>") - good.find("<SIMPLEREQ>")),
+         "<MULTIREQ/>", "501 multiple-requests-unsupported"},
+        {good.substr(good.find("<SIMPLEREQ>"), good.find("</MESSAGE>") - good.find("<SIMPLEREQ>")),
+         "<SIMPLEEXPREQ/>", "501 unsupported-operation"},
+    };
+    for (const Case& each : cases) {
+        std::string body = good;
+        body.replace(body.find(each.from), each.from.size(), each.to);
+        EXPECT_EQ(answerTo(body), each.answer) << body;
+    }
+}
+
+TEST_F(CimServiceTest, tellsWhatDsp0200NamesForEachFailure) {
+    struct Case {
+        std::string body;
+        std::string error;
+    };
+    std::string method = requestBody("Reset", "root/cimv2", "");
+    method.replace(method.find("<IMETHODCALL"), 12, "<METHODCALL");
+    method.replace(method.find("</IMETHODCALL"), 13, "</METHODCALL");
+    method.replace(method.find("<LOCALNAMESPACEPATH>"), 20, "<LOCALCLASSPATH><LOCALNAMESPACEPATH>");
+    method.replace(method.find("</LOCALNAMESPACEPATH>"), 21,
+                   "</LOCALNAMESPACEPATH><CLASSNAME NAME=\"A\"/></LOCALCLASSPATH>");
+    const std::vector<Case> cases{
+        {requestBody("ModifyInstance", "root/cimv2", "A"),
+         "IMETHODRESPONSE NAME=\"ModifyInstance\"><ERROR CODE=\"7\""},
+        {requestBody("NoSuchOperation", "root/cimv2", "A"),
+         "IMETHODRESPONSE NAME=\"NoSuchOperation\"><ERROR CODE=\"7\""},
+        {method, "<METHODRESPONSE NAME=\"Reset\"><ERROR CODE=\"7\""},
+        {requestBody("GetClass", "root/none", "A"), "<ERROR CODE=\"3\""},
+        {requestBody("GetClass", "root/cimv2", ""), "<ERROR CODE=\"4\""},
+        {requestBody("GetClass", "root/cimv2", "A", flag("Unknown", true)), "<ERROR CODE=\"4\""},
+        {requestBody("GetClass", "root/cimv2", "B"), "<ERROR CODE=\"6\""},
+        {requestBody("EnumerateClasses", "root/cimv2", "B"), "<ERROR CODE=\"5\""},
+        {requestBody("EnumerateInstances", "root/cimv2", "B"), "<ERROR CODE=\"5\""},
+    };
+    for (const Case& each : cases) {
+        const std::string answer = answerTo(each.body);
+        EXPECT_EQ(answer.substr(0, 4), "200 ") << each.body;
+        EXPECT_NE(answer.find(each.error), std::string::npos) << answer;
+    }
 }
 
 TEST_F(CimServiceTest, usesTrailersOnlyForClientsThatTakeThem) {

@@ -7,8 +7,10 @@
 #include <unistd.h>
 
 #include <array>
+#include <chrono>
 #include <csignal>
 #include <memory>
+#include <thread>
 #include <vector>
 
 #include "CimRequests.h"
@@ -95,10 +97,13 @@ TEST_F(ServedSocketTest, sendsNoStatusTrailersWithASuccess) {
 }
 
 TEST_F(ServedSocketTest, refusesOtherMethodsAndLivesOn) {
-    for (const char* method : {"GET", "PUT", "DELETE", "OPTIONS"})
-        EXPECT_TRUE(has(answerTo(std::string(method) + " /cimom HTTP/1.1\r\nHost: x\r\n\r\n"),
-                        "HTTP/1.1 405 "))
-            << method;
+    for (const char* method : {"GET", "HEAD", "PUT", "DELETE", "OPTIONS", "TRACE"}) {
+        const std::string answer =
+            answerTo(std::string(method) + " /cimom HTTP/1.1\r\nHost: x\r\n\r\n");
+        EXPECT_TRUE(has(answer, "HTTP/1.1 405 ")) << method;
+        EXPECT_TRUE(has(answer, "\r\nAllow: POST\r\n")) << method;
+    }
+    EXPECT_TRUE(has(answerTo("M-POST /cimom HTTP/1.1\r\nHost: x\r\n\r\n"), "HTTP/1.1 501 "));
     EXPECT_TRUE(
         has(answerTo("POST / HTTP/1.1\r\nHost: x\r\nContent-Length: 0\r\n\r\n"), "HTTP/1.1 404 "));
     EXPECT_TRUE(has(answerTo(postOf(systemRequest())), "</CIM>"));
@@ -145,6 +150,21 @@ TEST_F(ServedSocketTest, refusesBodiesThatAreTooLong) {
     EXPECT_TRUE(has(answerTo(chunked + "0\r\n\r\n"), "HTTP/1.1 413 "));
 }
 
+TEST_F(ServedSocketTest, refusesHeadsThatAreTooLong) {
+    const std::string head = "POST /cimom HTTP/1.1\r\nHost: x\r\nX-Long: ";
+    EXPECT_TRUE(has(answerTo(head + std::string(40000, 'y') + "\r\n\r\n"), "HTTP/1.1 431 "));
+}
+
+TEST_F(ServedSocketTest, tellsClientsThatAskToSendTheirBody) {
+    const Connection connection(socketPath);
+    const std::string request = postOf(systemRequest(), "Expect: 100-continue\r\n");
+    const std::size_t bodyAt = request.find("\r\n\r\n") + 4;
+    connection.send(request.substr(0, bodyAt));
+    EXPECT_EQ(connection.readSome(), "HTTP/1.1 100 Continue\r\n\r\n");
+    connection.send(request.substr(bodyAt));
+    EXPECT_TRUE(has(connection.readAnswer(), "</CIM>"));
+}
+
 TEST_F(ServedSocketTest, servesManyConnectionsAtOnce) {
     constexpr int kConnections = 64;
     std::vector<std::unique_ptr<Connection>> connections;
@@ -173,6 +193,66 @@ TEST_F(CimomdProgramTest, closesIdleConnections) {
     connection.send("POST /cimom HTTP/1.1\r\n");
     EXPECT_FALSE(has(connection.readToEnd(), "200 OK"));
     server.signal(SIGINT);
+    EXPECT_EQ(server.wait(), 0);
+}
+
+TEST_F(CimomdProgramTest, closesConnectionsThatSendDropByDrop) {
+    RunningCimomd server({"--socket", socketPath, "--root", machine(), "--idle-timeout", "1"});
+    ASSERT_TRUE(server.serves(socketPath));
+    const Connection inHead(socketPath);
+    const Connection inBody(socketPath);
+    const std::string request = postOf(systemRequest());
+    const std::size_t bodyAt = request.find("\r\n\r\n") + 4;
+    inBody.send(request.substr(0, bodyAt));
+    for (std::size_t i = 0; i < 30; ++i) {
+        inHead.send(request.substr(i, 1));
+        inBody.send(request.substr(bodyAt + i, 1));
+        std::this_thread::sleep_for(std::chrono::milliseconds(100));
+    }
+    EXPECT_TRUE(inHead.peerHasClosed());
+    EXPECT_TRUE(inBody.peerHasClosed());
+}
+
+TEST_F(CimomdProgramTest, keepsTheOldClassesWhenTheNewOnesAreWrong) {
+    const std::string own = (tree.root / "own").string();
+    tree.file("own/b.mof", "class Own_B : Own_A {};")
+        .file("own/a.mof", "class Own_A {};")
+        .file("own/c.mof", "class Own_C {")
+        .file("own/d.txt", "class Own_D {};");
+    RunningCimomd server({"--socket", socketPath, "--root", machine(), "--mof-dir", own});
+    ASSERT_TRUE(server.serves(socketPath));
+    const Connection connection(socketPath);
+    const auto knows = [&connection](const char* name) {
+        connection.send(postOf(requestBody("GetClass", "root/cimv2", name)));
+        return has(connection.readAnswer(), "<CLASS ");
+    };
+    const auto learns = [&knows](const char* name) {
+        for (int i = 0; i < 500; ++i) {
+            if (knows(name))
+                return true;
+            std::this_thread::sleep_for(std::chrono::milliseconds(10));
+        }
+        return false;
+    };
+    EXPECT_TRUE(knows("Own_A"));
+    EXPECT_TRUE(knows("Own_B"));
+    EXPECT_FALSE(knows("Own_C"));
+    EXPECT_FALSE(knows("Own_D"));
+    tree.file("own/c.mof", "class Own_C {};");
+    server.signal(SIGHUP);
+    EXPECT_TRUE(learns("Own_C"));
+    tree.file("own/a.mof", "class Own_A2 {};").file("own/b.mof", "class Own_B : {");
+    server.signal(SIGHUP);
+    for (int i = 0; i < 30; ++i) {
+        EXPECT_TRUE(knows("Own_A"));
+        EXPECT_FALSE(knows("Own_A2"));
+        std::this_thread::sleep_for(std::chrono::milliseconds(10));
+    }
+    tree.file("own/b.mof", "class Own_B {};");
+    server.signal(SIGHUP);
+    EXPECT_TRUE(learns("Own_A2"));
+    EXPECT_FALSE(knows("Own_A"));
+    server.signal(SIGTERM);
     EXPECT_EQ(server.wait(), 0);
 }
 
@@ -236,6 +316,15 @@ TEST_F(CimomdProgramTest, saysWhatItCannotDo) {
     EXPECT_EQ(statusOf({}), 1);
     EXPECT_EQ(statusOf({"--nonsense"}), 1);
     EXPECT_EQ(statusOf({"--fd", "3", "--socket", socketPath}), 1);
+    EXPECT_EQ(statusOf({"--fd", "3", "--http", "127.0.0.1:0"}), 1);
+    for (const char* address : {"0.0.0.0:0", "10.1.2.3:5988", "[::]:0", "example.org:80",
+                                "127.0.0.1", "127.0.0.1:65536", ":5988"})
+        EXPECT_EQ(statusOf({"--http", address}), 1) << address;
+    EXPECT_EQ(statusOf({"--socket", socketPath, "--socket-mode", "rw"}), 1);
+    EXPECT_EQ(statusOf({"--socket", socketPath, "--socket-mode", "01777"}), 1);
+    EXPECT_EQ(statusOf({"--socket", socketPath, "--socket-group", "no such group"}), 1);
+    EXPECT_EQ(statusOf({"--socket-mode", "0660", "--http", "127.0.0.1:0"}), 1);
+    EXPECT_EQ(statusOf({"--socket", socketPath, "--mof-dir", "/does/not/exist"}), 1);
     EXPECT_EQ(statusOf({"--fd", "999"}), 1);
     EXPECT_EQ(statusOf({"--fd", "1"}), 1);
     EXPECT_EQ(statusOf({"--fd", "-1"}), 1);

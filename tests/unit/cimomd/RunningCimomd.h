@@ -24,6 +24,8 @@ class Connection {
     std::string readToEnd() const;
     /// One HTTP answer: up to the end of its chunks, or of its Content-Length.
     std::string readAnswer() const;
+    /// What comes next, at most for ten seconds.
+    std::string readSome() const { return readMore(); }
     /// Whether reading finds the end at once: tells a closed connection from a silent one.
     bool peerHasClosed() const;
     void close();

@@ -1,4 +1,4 @@
-#include "protocol/UnixListener.h"
+#include "service/UnixListener.h"
 
 #include <gtest/gtest.h>
 #include <sys/stat.h>
@@ -28,13 +28,22 @@ TEST(UnixListener, makesAPrivateSocketAndRemovesIt) {
     EXPECT_FALSE(isThere(path));
 }
 
+TEST(UnixListener, letsInWhoTheModeAndTheGroupLetIn) {
+    RecordedTree tree;
+    const std::string path = (tree.root / "s").string();
+    const UnixListener listener(path, SocketAccess{0660, ::getegid()});
+    struct stat status {};
+    ASSERT_EQ(::lstat(path.c_str(), &status), 0);
+    EXPECT_EQ(status.st_mode & 07777, 0660U);
+    EXPECT_EQ(status.st_gid, ::getegid());
+}
+
 TEST(UnixListener, replacesASocketThatNobodyServes) {
     RecordedTree tree;
     const std::string path = (tree.root / "s").string();
     {
-        UnixListener listener(path);
+        const UnixListener listener(path);
         std::filesystem::rename(path, path + ".kept");
-        ::close(listener.release());
     }
     std::filesystem::rename(path + ".kept", path);
     EXPECT_NO_THROW(UnixListener{path});

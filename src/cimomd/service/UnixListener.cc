@@ -1,4 +1,4 @@
-#include "protocol/UnixListener.h"
+#include "service/UnixListener.h"
 
 #include <fmt/format.h>
 #include <sys/socket.h>
@@ -28,7 +28,7 @@ sockaddr_un addressOf(const std::string& path) {
 }
 
 int makeSocket(const std::string& path) {
-    const int descriptor = ::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0);
+    const int descriptor = ::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0);
     if (descriptor < 0)
         fail(path, std::strerror(errno));
     return descriptor;
@@ -66,15 +66,22 @@ int bindPrivately(int descriptor, const sockaddr_un& address) {
     return result;
 }
 
+bool grant(const std::string& path, const SocketAccess& access) {
+    if (access.group && ::lchown(path.c_str(), static_cast<uid_t>(-1), *access.group) != 0)
+        return false;
+    return ::chmod(path.c_str(), access.mode) == 0;
+}
+
 }  // namespace
 
-UnixListener::UnixListener(std::string socketPath) : path(std::move(socketPath)) {
+UnixListener::UnixListener(std::string socketPath, const SocketAccess& access)
+    : path(std::move(socketPath)) {
     const sockaddr_un address = addressOf(path);
     clearPath(path, address);
     descriptor = makeSocket(path);
     struct stat status {};
-    if (bindPrivately(descriptor, address) != 0 || ::listen(descriptor, SOMAXCONN) != 0 ||
-        ::lstat(path.c_str(), &status) != 0) {
+    if (bindPrivately(descriptor, address) != 0 || !grant(path, access) ||
+        ::listen(descriptor, SOMAXCONN) != 0 || ::lstat(path.c_str(), &status) != 0) {
         const int error = errno;
         ::close(descriptor);
         fail(path, std::strerror(error));
@@ -89,10 +96,6 @@ UnixListener::~UnixListener() {
         ::unlink(path.c_str());
     if (descriptor >= 0)
         ::close(descriptor);
-}
-
-int UnixListener::release() {
-    return std::exchange(descriptor, -1);
 }
 
 }  // namespace cimomd
