@@ -12,7 +12,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     try {
         // Includes are relative to a directory that is not there.
         compiler.compileText({reinterpret_cast<const char*>(data), size}, "/nowhere/input.mof");
-    } catch (const cimomd::MofError&) {
+    } catch (const cimomd::MofErrors&) {
         if (repository.hasNamespace("root/cimv2"))
             __builtin_trap();
     }

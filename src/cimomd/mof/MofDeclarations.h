@@ -27,7 +27,7 @@ struct MofName {
 struct MofType {
     Pegasus::CIMType type = Pegasus::CIMTYPE_STRING;
     /// The class of a reference, else empty.
-    std::string referenceClass;
+    MofName referenceClass;
     bool isArray = false;
     std::uint32_t arraySize = 0;
 };
@@ -45,11 +45,44 @@ struct MofProperty {
     std::optional<MofLiteral> defaultValue;
 };
 
+struct MofParameter {
+    std::vector<MofQualifier> qualifiers;
+    MofName name;
+    MofType type;
+};
+
+struct MofMethod {
+    std::vector<MofQualifier> qualifiers;
+    MofName name;
+    MofType returnType;
+    std::vector<MofParameter> parameters;
+};
+
 struct MofClass {
     std::vector<MofQualifier> qualifiers;
     MofName name;
     std::optional<MofName> superClass;
     std::vector<MofProperty> properties;
+    std::vector<MofMethod> methods;
+    /// False when a mistake made the parser leave something out.
+    bool isComplete = true;
+};
+
+/// What an instance declaration gives one property.
+struct MofPropertyValue {
+    std::vector<MofQualifier> qualifiers;
+    MofName name;
+    MofLiteral value;
+};
+
+struct MofInstance {
+    std::vector<MofQualifier> qualifiers;
+    MofName className;
+    /// Without the dollar sign.
+    std::optional<MofName> alias;
+    std::vector<MofPropertyValue> values;
+    /// False when a mistake made the parser leave something out.
+    bool isComplete = true;
 };
 
 struct MofQualifierDeclaration {
@@ -70,6 +103,7 @@ struct MofNamespace {
     MofName name;
 };
 
-using MofDeclaration = std::variant<MofQualifierDeclaration, MofClass, MofInclude, MofNamespace>;
+using MofDeclaration =
+    std::variant<MofQualifierDeclaration, MofClass, MofInstance, MofInclude, MofNamespace>;
 
 }  // namespace cimomd

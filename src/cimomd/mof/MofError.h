@@ -1,10 +1,11 @@
 #pragma once
 
-// The one error that lexer, parser and compiler of MOF raise.
+// The mistakes that compiling MOF files finds: one, and all of a compilation.
 
 #include <stdexcept>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "mof/MofPosition.h"
 
@@ -20,6 +21,18 @@ class MofError : public std::runtime_error {
 
   private:
     MofPosition position_;
+};
+
+/// Why a compilation failed. what() has one line for each mistake.
+class MofErrors : public std::runtime_error {
+  public:
+    /// `errors` is not empty. `isCut` says that there may be more mistakes.
+    MofErrors(std::vector<MofError> errors, bool isCut);
+
+    const std::vector<MofError>& errors() const { return errors_; }
+
+  private:
+    std::vector<MofError> errors_;
 };
 
 }  // namespace cimomd

@@ -8,7 +8,15 @@
 
 namespace cimomd {
 
-enum class FlavorWord { EnableOverride, DisableOverride, ToSubclass, Restricted, Translatable };
+/// Ignored: a word of other versions of MOF that means nothing here.
+enum class FlavorWord {
+    EnableOverride,
+    DisableOverride,
+    ToSubclass,
+    Restricted,
+    Translatable,
+    Ignored
+};
 
 struct MofFlavor {
     FlavorWord word;
@@ -33,6 +41,8 @@ inline void applyFlavor(FlavorWord word, Pegasus::CIMFlavor& flavor) {
             break;
         case FlavorWord::Translatable:
             flavor.set(CIMFlavor::TRANSLATABLE, true);
+            break;
+        case FlavorWord::Ignored:
             break;
     }
 }

@@ -10,6 +10,7 @@ namespace cimomd {
 namespace {
 
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+constexpr std::string_view kPunctuation = "[]{}(),;:=";
 constexpr std::size_t kMaxHexDigits = 4;
 
 bool isDigit(char c) {
@@ -48,33 +49,38 @@ std::string describe(char c) {
 
 }  // namespace
 
-MofLexer::MofLexer(std::string_view mofText, std::string_view fileName)
-    : text(mofText), file(fileName) {
+MofLexer::MofLexer(std::string_view mofText, std::string_view fileName, MofErrorLog& errorLog)
+    : text(mofText), file(fileName), log(errorLog) {
     if (text.substr(0, kByteOrderMark.size()) == kByteOrderMark)
         offset = kByteOrderMark.size();
 }
 
 MofToken MofLexer::next() {
-    skipBlanksAndComments();
-    if (atEnd())
-        return tokenFrom(MofTokenKind::End, offset, position);
-    const char c = current();
-    if (startsNumber())
-        return number();
-    if (isNameStart(c))
-        return identifier();
-    if (c == '"')
-        return quoted('"', MofTokenKind::String);
-    if (c == '\'')
-        return quoted('\'', MofTokenKind::Char);
-    if (c == '#')
-        return pragma();
-    if (std::string_view("[]{}(),;:=").find(c) == std::string_view::npos)
-        fail(position, describe(c), "a declaration");
-    const MofPosition start = position;
-    const std::size_t startOffset = offset;
-    advance();
-    return tokenFrom(MofTokenKind::Punctuation, startOffset, start);
+    for (skipBlanksAndComments(); !atEnd(); skipBlanksAndComments()) {
+        const char c = current();
+        if (startsNumber())
+            return number();
+        if (isNameStart(c))
+            return identifier();
+        if (c == '"')
+            return quoted('"', MofTokenKind::String);
+        if (c == '\'')
+            return quoted('\'', MofTokenKind::Char);
+        if (c == '$' && isNameStart(peek(1)))
+            return alias();
+        if (kPunctuation.find(c) != std::string_view::npos)
+            return punctuation();
+        if (c == '#') {
+            const MofPosition start = position;
+            const std::size_t startOffset = offset;
+            if (startsPragma())
+                return tokenFrom(MofTokenKind::Pragma, startOffset, start);
+            continue;
+        }
+        report(position, describe(c), "a declaration");
+        advance();
+    }
+    return tokenFrom(MofTokenKind::End, offset, position);
 }
 
 char MofLexer::peek(std::size_t distance) const {
@@ -118,7 +124,7 @@ void MofLexer::skipBlockComment() {
         }
         advance();
     }
-    fail(start, "a comment without an end", "*/");
+    report(start, "a comment without an end", "*/");
 }
 
 MofToken MofLexer::identifier() {
@@ -154,21 +160,46 @@ MofToken MofLexer::number() {
         advance();
     }
     MofToken token = tokenFrom(MofTokenKind::Integer, startOffset, start);
-    if (!parseMofNumber(token))
-        fail(start, token.text, "a number within 64 bits");
+    if (!parseMofNumber(token)) {
+        report(start, shownText(token.text), "a number within 64 bits");
+        token.magnitude = 1;  // fits every type, so that the value is not told again
+    }
     return token;
 }
 
-MofToken MofLexer::pragma() {
+/// Passes the word #pragma. False, and the line is passed, when it is another one.
+bool MofLexer::startsPragma() {
     const MofPosition start = position;
     const std::size_t startOffset = offset;
     advance();
     while (!atEnd() && isNameStart(current()))
         advance();
-    MofToken token = tokenFrom(MofTokenKind::Pragma, startOffset, start);
-    if (!equalsIgnoringCase(token.text, "#pragma"))
-        fail(start, token.text, "#pragma");
+    const std::string_view word = text.substr(startOffset, offset - startOffset);
+    if (equalsIgnoringCase(word, "#pragma"))
+        return true;
+    report(start, shownText(word), "#pragma");
+    while (!atEnd() && current() != '\n')
+        advance();
+    return false;
+}
+
+MofToken MofLexer::alias() {
+    const MofPosition start = position;
+    const std::size_t startOffset = offset;
+    advance();
+    MofToken token = identifier();
+    token.characters = utf8::clean(token.text);
+    token.kind = MofTokenKind::Alias;
+    token.text = text.substr(startOffset, offset - startOffset);
+    token.position = start;
     return token;
+}
+
+MofToken MofLexer::punctuation() {
+    const MofPosition start = position;
+    const std::size_t startOffset = offset;
+    advance();
+    return tokenFrom(MofTokenKind::Punctuation, startOffset, start);
 }
 
 MofToken MofLexer::quoted(char quote, MofTokenKind kind) {
@@ -176,24 +207,43 @@ MofToken MofLexer::quoted(char quote, MofTokenKind kind) {
     const std::size_t startOffset = offset;
     std::string characters;
     advance();
-    while (current() != quote || atEnd()) {
-        if (atEnd())
-            fail(start, "a text without an end", fmt::format("a closing {}", quote));
-        if (current() == '\n' || current() == '\r')
-            fail(position, "the end of the line", fmt::format("a closing {}", quote));
-        if (current() == '\\') {
+    bool isClosed = false;
+    while (!isClosed) {
+        if (atEnd()) {
+            report(start, "a text without an end", fmt::format("a closing {}", quote));
+            break;
+        }
+        if (current() == '\n' || current() == '\r') {
+            report(position, "the end of the line", fmt::format("a closing {}", quote));
+            stepBackToMarks(startOffset + 1);
+            break;
+        }
+        if (current() == quote) {
+            isClosed = true;
+            advance();
+        } else if (current() == '\\') {
             readEscape(characters);
         } else {
             characters += current();
             advance();
         }
     }
-    advance();
     MofToken token = tokenFrom(kind, startOffset, start);
     // Published schemas carry single bytes of other encodings in descriptions; they are no reason
     // to refuse a class.
     token.characters = utf8::clean(characters);
     return token;
+}
+
+/// A forgotten quote would swallow the marks at the end of its line, and their absence would be
+/// told as further mistakes.
+void MofLexer::stepBackToMarks(std::size_t firstOffset) {
+    const std::string_view inside = text.substr(firstOffset, offset - firstOffset);
+    const std::size_t lastOther = inside.find_last_not_of(";,)]} \t");
+    const std::size_t marks = lastOther == std::string_view::npos ? 0 : lastOther + 1;
+    const auto distance = static_cast<unsigned>(inside.size() - marks);
+    offset -= distance;
+    position.column -= distance;
 }
 
 void MofLexer::readEscape(std::string& out) {
@@ -206,8 +256,10 @@ void MofLexer::readEscape(std::string& out) {
         return;
     }
     const std::size_t index = atEnd() ? std::string_view::npos : kLetters.find(current());
-    if (index == std::string_view::npos)
-        fail(start, "a backslash", "one of \\b \\t \\n \\f \\r \\\" \\' \\\\ \\x");
+    if (index == std::string_view::npos) {
+        report(start, "a backslash", "one of \\b \\t \\n \\f \\r \\\" \\' \\\\ \\x");
+        return;
+    }
     out += kMeanings[index];
     advance();
 }
@@ -222,8 +274,10 @@ void MofLexer::readHexEscape(std::string& out, MofPosition start) {
         ++digits;
         advance();
     }
-    if (digits == 0 || code == 0)
-        fail(start, "\\x", "\\x with one to four hexadecimal digits, not 0");
+    if (digits == 0 || code == 0) {
+        report(start, "\\x", "\\x with one to four hexadecimal digits, not 0");
+        return;
+    }
     utf8::append(out, code);
 }
 
@@ -236,8 +290,8 @@ MofToken MofLexer::tokenFrom(MofTokenKind kind, std::size_t start,
     return token;
 }
 
-void MofLexer::fail(MofPosition where, std::string_view found, std::string_view expected) const {
-    throw MofError(file, where, found, expected);
+void MofLexer::report(MofPosition where, std::string_view found, std::string_view expected) {
+    log.add(file, where, found, expected);
 }
 
 }  // namespace cimomd

@@ -4,6 +4,7 @@
 
 #include <cstdint>
 #include <string>
+#include <string_view>
 #include <variant>
 #include <vector>
 
@@ -23,13 +24,18 @@ struct MofChar {
     std::string character;
 };
 
-using MofScalar = std::variant<MofNull, bool, MofInteger, double, std::string, MofChar>;
+/// The instance declared `as $name`.
+struct MofAlias {
+    std::string name;
+};
+
+using MofScalar = std::variant<MofNull, bool, MofInteger, double, std::string, MofChar, MofAlias>;
 
 struct MofElement {
     MofScalar value;
     MofPosition position;
-    /// The words of the value, for messages.
-    std::string text;
+    /// The first word of the value, for messages. Lives as long as the text that was parsed.
+    std::string_view text;
 };
 
 /// One scalar, or the elements between braces.

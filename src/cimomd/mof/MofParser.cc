@@ -2,293 +2,379 @@
 
 #include <fmt/format.h>
 
-#include <array>
 #include <utility>
 
+#include "mof/MofWords.h"
 #include "text/Utf8.h"
 #include "utf8/Utf8.h"
 
 namespace cimomd {
-namespace {
 
-constexpr std::size_t kMaxShownText = 40;
+MofParser::MofParser(std::string_view text, std::string_view fileName, MofErrorLog& errorLog)
+    : tokens(text, fileName, errorLog), log(errorLog), file(fileName) {}
 
-struct NamedType {
-    std::string_view name;
-    Pegasus::CIMType type;
-};
-
-constexpr std::array<NamedType, 14> kTypes{{
-    {"boolean", Pegasus::CIMTYPE_BOOLEAN},
-    {"uint8", Pegasus::CIMTYPE_UINT8},
-    {"sint8", Pegasus::CIMTYPE_SINT8},
-    {"uint16", Pegasus::CIMTYPE_UINT16},
-    {"sint16", Pegasus::CIMTYPE_SINT16},
-    {"uint32", Pegasus::CIMTYPE_UINT32},
-    {"sint32", Pegasus::CIMTYPE_SINT32},
-    {"uint64", Pegasus::CIMTYPE_UINT64},
-    {"sint64", Pegasus::CIMTYPE_SINT64},
-    {"real32", Pegasus::CIMTYPE_REAL32},
-    {"real64", Pegasus::CIMTYPE_REAL64},
-    {"char16", Pegasus::CIMTYPE_CHAR16},
-    {"string", Pegasus::CIMTYPE_STRING},
-    {"datetime", Pegasus::CIMTYPE_DATETIME},
-}};
-
-struct NamedScope {
-    std::string_view name;
-    QualifierScopes scope;
-};
-
-constexpr std::array<NamedScope, 10> kScopes{{
-    {"class", kScopeClass},
-    {"association", kScopeAssociation},
-    {"indication", kScopeIndication},
-    {"property", kScopeProperty},
-    {"reference", kScopeReference},
-    {"method", kScopeMethod},
-    {"parameter", kScopeParameter},
-    {"schema", kScopeSchema},
-    {"qualifier", kScopeQualifier},
-    {"any", kScopeAny},
-}};
-
-struct NamedFlavor {
-    std::string_view name;
-    FlavorWord word;
-};
-
-constexpr std::array<NamedFlavor, 5> kFlavors{{
-    {"EnableOverride", FlavorWord::EnableOverride},
-    {"DisableOverride", FlavorWord::DisableOverride},
-    {"ToSubclass", FlavorWord::ToSubclass},
-    {"Restricted", FlavorWord::Restricted},
-    {"Translatable", FlavorWord::Translatable},
-}};
-
-/// The entry of that name in one of the tables above, or null.
-template <typename Table>
-auto findNamed(const Table& table, std::string_view name) -> const typename Table::value_type* {
-    for (const auto& entry : table) {
-        if (equalsIgnoringCase(entry.name, name))
-            return &entry;
+std::optional<MofDeclaration> MofParser::next() {
+    while (!tokens.atEnd()) {
+        try {
+            if (std::optional<MofDeclaration> declaration = parseDeclaration())
+                return declaration;
+        } catch (const MofError& error) {
+            log.add(file, error);
+            skipDeclaration();
+        }
     }
-    return nullptr;
+    return std::nullopt;
 }
 
-std::string describe(const MofToken& token) {
-    if (token.kind == MofTokenKind::End)
-        return "the end of the file";
-    if (token.text.size() > kMaxShownText)
-        return cleanText(token.text.substr(0, kMaxShownText)) + "...";
-    return cleanText(token.text);
+std::optional<MofDeclaration> MofParser::parseDeclaration() {
+    if (tokens.at(MofTokenKind::Pragma))
+        return parsePragma();
+    if (tokens.atWord("qualifier"))
+        return parseQualifierDeclaration();
+    std::vector<MofQualifier> qualifiers = parseQualifierList();
+    if (tokens.atWord("instance"))
+        return parseInstance(std::move(qualifiers));
+    if (tokens.atWord("class"))
+        return parseClass(std::move(qualifiers));
+    tokens.fail(qualifiers.empty() ? "class, instance, qualifier or #pragma" : "class or instance");
 }
 
-}  // namespace
-
-MofParser::MofParser(std::string_view text, std::string_view fileName)
-    : lexer(text, fileName), file(fileName) {}
-
-std::vector<MofDeclaration> MofParser::parse() {
-    std::vector<MofDeclaration> out;
-    token = lexer.next();
-    while (token.kind != MofTokenKind::End) {
-        if (token.kind == MofTokenKind::Pragma)
-            parsePragma(out);
-        else if (atWord("qualifier"))
-            out.emplace_back(parseQualifierDeclaration());
-        else
-            out.emplace_back(parseClass());
+/// A mistake ends with its line: pragmas have no semicolon to skip to.
+std::optional<MofDeclaration> MofParser::parsePragma() {
+    try {
+        return parseDirective();
+    } catch (const MofError& error) {
+        log.add(file, error);
+        while (!tokens.atEnd() && !tokens.atNewLine())
+            tokens.take();
+        return std::nullopt;
     }
-    return out;
 }
 
-void MofParser::parsePragma(std::vector<MofDeclaration>& out) {
-    take();
+std::optional<MofDeclaration> MofParser::parseDirective() {
+    tokens.take();
     const MofName directive = parseName("a directive");
-    expect("(");
-    if (token.kind != MofTokenKind::String)
-        fail("a text in quotes");
-    const MofToken argument = take();
-    expect(")");
+    const bool isInclude = equalsIgnoringCase(directive.text, "include");
+    const bool isNamespace = equalsIgnoringCase(directive.text, "namespace");
+    tokens.expect("(");
+    if (!isInclude && !isNamespace) {
+        while (!tokens.atEnd() && !tokens.atMark(")") && !tokens.at(MofTokenKind::Pragma))
+            tokens.take();
+        tokens.expect(")");
+        return std::nullopt;
+    }
+    if (!tokens.at(MofTokenKind::String))
+        tokens.fail("a text in quotes");
+    const MofToken argument = tokens.take();
+    tokens.expect(")");
     MofName name{argument.characters, argument.position};
-    if (equalsIgnoringCase(directive.text, "include"))
-        out.emplace_back(MofInclude{std::move(name)});
-    else if (equalsIgnoringCase(directive.text, "namespace"))
-        out.emplace_back(MofNamespace{std::move(name)});
+    if (isInclude)
+        return MofInclude{std::move(name)};
+    return MofNamespace{std::move(name)};
 }
 
 MofQualifierDeclaration MofParser::parseQualifierDeclaration() {
     MofQualifierDeclaration declaration;
-    take();
+    tokens.take();
     declaration.name = parseName("a qualifier's name");
-    expect(":");
+    tokens.expect(":");
     declaration.type = parseType();
     parseArrayBounds(declaration.type);
-    if (accept("="))
+    if (tokens.accept("="))
         declaration.defaultValue = parseLiteral();
-    expect(",");
-    if (!atWord("scope"))
-        fail("Scope");
+    tokens.expect(",");
+    if (!tokens.atWord("scope"))
+        tokens.fail("Scope");
     declaration.scopes = parseScopes();
-    if (accept(","))
+    if (tokens.accept(","))
         declaration.flavors = parseFlavorClause();
-    expect(";");
+    parseEndOfDeclaration();
     return declaration;
 }
 
 QualifierScopes MofParser::parseScopes() {
-    take();
-    expect("(");
+    tokens.take();
+    tokens.expect("(");
     QualifierScopes scopes = parseScope();
-    while (accept(","))
+    while (tokens.accept(","))
         scopes |= parseScope();
-    expect(")");
+    tokens.expect(")");
     return scopes;
 }
 
 QualifierScopes MofParser::parseScope() {
-    const NamedScope* scope = findNamed(kScopes, token.text);
-    if (token.kind != MofTokenKind::Identifier || scope == nullptr)
-        fail("a scope such as class or property");
-    take();
-    return scope->scope;
+    const std::optional<QualifierScopes> scope = scopeNamed(tokens.current().text);
+    if (!scope)
+        tokens.fail("a scope such as class or property");
+    tokens.take();
+    return *scope;
 }
 
 std::vector<MofFlavor> MofParser::parseFlavorClause() {
-    if (!atWord("flavor"))
-        fail("Flavor");
-    take();
-    expect("(");
+    if (!tokens.atWord("flavor"))
+        tokens.fail("Flavor");
+    tokens.take();
+    tokens.expect("(");
     std::vector<MofFlavor> flavors{parseFlavor()};
-    while (accept(","))
+    while (tokens.accept(","))
         flavors.push_back(parseFlavor());
-    expect(")");
+    tokens.expect(")");
     return flavors;
 }
 
-MofClass MofParser::parseClass() {
-    MofClass declaration;
-    declaration.qualifiers = parseQualifierList();
-    if (!atWord("class"))
-        fail(declaration.qualifiers.empty() ? "class, qualifier or #pragma" : "class");
-    take();
-    declaration.name = parseName("a class name");
-    if (accept(":"))
-        declaration.superClass = parseName("a class name");
-    expect("{");
-    while (!atPunctuation("}"))
-        declaration.properties.push_back(parseProperty());
-    take();
-    expect(";");
-    return declaration;
+MofClass MofParser::parseClass(std::vector<MofQualifier> qualifiers) {
+    MofClass out;
+    out.qualifiers = std::move(qualifiers);
+    tokens.take();
+    out.name = parseName("a class name");
+    parseAlias();
+    if (tokens.accept(":"))
+        out.superClass = parseName("a class name");
+    out.isComplete = parseBody([&] { parseFeature(out); });
+    return out;
+}
+
+void MofParser::parseFeature(MofClass& out) {
+    MofProperty property;
+    property.qualifiers = parseQualifierList();
+    property.type = parseType();
+    const bool isReference = property.type.type == Pegasus::CIMTYPE_REFERENCE;
+    property.name = parseName(isReference ? "a reference name" : "a property name");
+    if (!isReference && tokens.accept("(")) {
+        out.methods.push_back({std::move(property.qualifiers), std::move(property.name),
+                               std::move(property.type), parseParameters()});
+        parseEndOfDeclaration();
+        return;
+    }
+    if (!isReference)
+        parseArrayBounds(property.type);
+    if (tokens.accept("="))
+        property.defaultValue = parseLiteral();
+    out.properties.push_back(std::move(property));
+    parseEndOfDeclaration();
+}
+
+std::vector<MofParameter> MofParser::parseParameters() {
+    std::vector<MofParameter> parameters;
+    if (tokens.accept(")"))
+        return parameters;
+    parameters.push_back(parseParameter());
+    while (tokens.atMark(",")) {
+        if (parameters.size() == kMaxParameters)
+            tokens.fail(fmt::format("at most {} parameters", kMaxParameters));
+        tokens.take();
+        parameters.push_back(parseParameter());
+    }
+    if (!tokens.accept(")"))
+        tokens.fail("',' or ')'");
+    return parameters;
+}
+
+MofParameter MofParser::parseParameter() {
+    MofParameter parameter;
+    parameter.qualifiers = parseQualifierList();
+    parameter.type = parseType();
+    parameter.name = parseName("a parameter name");
+    parseArrayBounds(parameter.type);
+    return parameter;
+}
+
+MofInstance MofParser::parseInstance(std::vector<MofQualifier> qualifiers) {
+    MofInstance out;
+    out.qualifiers = std::move(qualifiers);
+    tokens.take();
+    if (!tokens.atWord("of"))
+        tokens.fail("of");
+    tokens.take();
+    out.className = parseName("a class name");
+    out.alias = parseAlias();
+    out.isComplete = parseBody([&] { out.values.push_back(parsePropertyValue()); });
+    return out;
+}
+
+std::optional<MofName> MofParser::parseAlias() {
+    if (!tokens.atWord("as"))
+        return std::nullopt;
+    tokens.take();
+    if (!tokens.at(MofTokenKind::Alias))
+        tokens.fail("an alias such as $name");
+    const MofToken alias = tokens.take();
+    return MofName{alias.characters, alias.position};
+}
+
+MofPropertyValue MofParser::parsePropertyValue() {
+    MofPropertyValue out;
+    out.qualifiers = parseQualifierList();
+    out.name = parseName("a property name");
+    tokens.expect("=");
+    out.value = parseLiteral();
+    parseEndOfDeclaration();
+    return out;
+}
+
+/// The part of a class or an instance between braces and the semicolon after it. False when a
+/// mistake made it leave something out.
+bool MofParser::parseBody(const std::function<void()>& parseOne) {
+    bool isComplete = true;
+    tokens.expect("{");
+    while (!tokens.atMark("}")) {
+        try {
+            if (tokens.atEnd() || startsDeclaration())
+                tokens.fail("'}'");
+            parseOne();
+        } catch (const MofError& error) {
+            log.add(file, error);
+            isComplete = false;
+            skipFeature();
+            if (tokens.atEnd() || startsDeclaration())
+                return false;
+        }
+    }
+    tokens.take();
+    parseEndOfDeclaration();
+    return isComplete;
+}
+
+/// A semicolon. Where it was forgotten at the end of a line, nothing needs to be skipped.
+void MofParser::parseEndOfDeclaration() {
+    if (tokens.accept(";"))
+        return;
+    if (!tokens.atNewLine() && !tokens.atMark("}") && !tokens.atEnd() && !startsDeclaration())
+        tokens.fail("';'");
+    log.add(file, tokens.current().position, tokens.shown(), "';'");
 }
 
 std::vector<MofQualifier> MofParser::parseQualifierList() {
-    std::vector<MofQualifier> qualifiers;
-    if (!accept("["))
-        return qualifiers;
-    qualifiers.push_back(parseQualifier());
-    while (accept(","))
-        qualifiers.push_back(parseQualifier());
-    if (!accept("]"))
-        fail("',' or ']'");
+    if (!tokens.accept("["))
+        return {};
+    try {
+        return parseQualifiers();
+    } catch (const MofError& error) {
+        if (!skipTo("]"))
+            throw;
+        log.add(file, error);
+        return {};
+    }
+}
+
+std::vector<MofQualifier> MofParser::parseQualifiers() {
+    std::vector<MofQualifier> qualifiers{parseQualifier()};
+    while (tokens.accept(",")) {
+        if (qualifiers.size() == kMaxQualifiers)
+            tokens.fail(fmt::format("at most {} qualifiers", kMaxQualifiers));
+        // Some write commas between flavors too.
+        if (!qualifiers.back().flavors.empty() && flavorNamed(tokens.current().text))
+            qualifiers.back().flavors.push_back(parseFlavor());
+        else
+            qualifiers.push_back(parseQualifier());
+    }
+    if (!tokens.accept("]"))
+        tokens.fail("',' or ']'");
     return qualifiers;
 }
 
 MofQualifier MofParser::parseQualifier() {
     MofQualifier qualifier;
     qualifier.name = parseName("a qualifier's name");
-    if (accept("(")) {
+    if (tokens.accept("(")) {
         MofLiteral literal;
-        literal.position = token.position;
+        literal.position = tokens.current().position;
         literal.elements.push_back(parseElement());
-        expect(")");
+        tokens.expect(")");
         qualifier.value = std::move(literal);
-    } else if (atPunctuation("{")) {
+    } else if (tokens.atMark("{")) {
         qualifier.value = parseLiteral();
     }
-    if (accept(":")) {
-        qualifier.flavors.push_back(parseFlavor());
-        while (token.kind == MofTokenKind::Identifier)
-            qualifier.flavors.push_back(parseFlavor());
-    }
+    if (tokens.accept(":"))
+        qualifier.flavors = parseQualifierFlavors();
     return qualifier;
 }
 
-MofFlavor MofParser::parseFlavor() {
-    const NamedFlavor* flavor = findNamed(kFlavors, token.text);
-    if (token.kind != MofTokenKind::Identifier || flavor == nullptr)
-        fail("a flavor such as ToSubclass");
-    return {flavor->word, take().position};
+std::vector<MofFlavor> MofParser::parseQualifierFlavors() {
+    std::vector<MofFlavor> flavors{parseFlavor()};
+    while (tokens.at(MofTokenKind::Identifier)) {
+        if (flavors.size() == kMaxQualifiers)
+            tokens.fail(fmt::format("at most {} flavors", kMaxQualifiers));
+        flavors.push_back(parseFlavor());
+    }
+    return flavors;
 }
 
-MofProperty MofParser::parseProperty() {
-    MofProperty property;
-    property.qualifiers = parseQualifierList();
-    property.type = parseType();
-    property.name = parseName("a property name");
-    if (property.type.type != Pegasus::CIMTYPE_REFERENCE)
-        parseArrayBounds(property.type);
-    if (accept("="))
-        property.defaultValue = parseLiteral();
-    expect(";");
-    return property;
+MofFlavor MofParser::parseFlavor() {
+    const std::optional<FlavorWord> flavor = flavorNamed(tokens.current().text);
+    if (!flavor)
+        tokens.fail("a flavor such as ToSubclass");
+    return {*flavor, tokens.take().position};
 }
 
 MofType MofParser::parseType() {
     MofType type;
-    if (token.kind != MofTokenKind::Identifier)
-        fail("a type");
-    const NamedType* known = findNamed(kTypes, token.text);
-    if (known != nullptr) {
-        type.type = known->type;
-        take();
+    if (!tokens.at(MofTokenKind::Identifier))
+        tokens.fail("a type");
+    if (const std::optional<Pegasus::CIMType> known = typeNamed(tokens.current().text)) {
+        type.type = *known;
+        tokens.take();
         return type;
     }
-    const MofToken className = take();
-    if (!atWord("ref"))
-        throw MofError(file, className.position, describe(className), "a type");
-    take();
+    const MofToken className = tokens.take();
+    if (!tokens.atWord("ref"))
+        throw MofError(file, className.position, shownText(className.text), "a type");
+    tokens.take();
     type.type = Pegasus::CIMTYPE_REFERENCE;
-    type.referenceClass = utf8::clean(className.text);
+    type.referenceClass = {utf8::clean(className.text), className.position};
     return type;
 }
 
 void MofParser::parseArrayBounds(MofType& type) {
-    if (!accept("["))
+    if (!tokens.accept("["))
         return;
     type.isArray = true;
-    if (token.kind == MofTokenKind::Integer) {
-        if (token.negative || token.magnitude == 0 || token.magnitude > UINT32_MAX)
-            fail("an array size from 1 to 4294967295");
-        type.arraySize = static_cast<std::uint32_t>(take().magnitude);
+    if (tokens.at(MofTokenKind::Integer)) {
+        const MofToken& size = tokens.current();
+        if (size.negative || size.magnitude == 0 || size.magnitude > UINT32_MAX)
+            tokens.fail("an array size from 1 to 4294967295");
+        type.arraySize = static_cast<std::uint32_t>(size.magnitude);
+        tokens.take();
     }
-    expect("]");
+    tokens.expect("]");
 }
 
 MofLiteral MofParser::parseLiteral() {
     MofLiteral literal;
-    literal.position = token.position;
-    if (!accept("{")) {
+    literal.position = tokens.current().position;
+    if (!tokens.accept("{")) {
         literal.elements.push_back(parseElement());
         return literal;
     }
     literal.isArray = true;
-    if (accept("}"))
-        return literal;
-    literal.elements.push_back(parseElement());
-    while (accept(","))
-        literal.elements.push_back(parseElement());
-    if (!accept("}"))
-        fail("',' or '}'");
+    try {
+        parseElements(literal);
+    } catch (const MofError& error) {
+        if (!skipTo("}"))
+            throw;
+        log.add(file, error);
+    }
     return literal;
 }
 
+void MofParser::parseElements(MofLiteral& literal) {
+    if (tokens.accept("}"))
+        return;
+    literal.elements.push_back(parseElement());
+    while (tokens.accept(",")) {
+        if (literal.elements.size() == kMaxArrayElements)
+            tokens.fail(fmt::format("at most {} elements", kMaxArrayElements));
+        literal.elements.push_back(parseElement());
+    }
+    if (!tokens.accept("}"))
+        tokens.fail("',' or '}'");
+}
+
 MofElement MofParser::parseElement() {
+    const MofToken& token = tokens.current();
     MofElement element;
     element.position = token.position;
-    element.text = describe(token);
+    element.text = token.text;
     if (token.kind == MofTokenKind::String) {
         parseString(element);
         return element;
@@ -299,54 +385,77 @@ MofElement MofParser::parseElement() {
         element.value = token.real;
     else if (token.kind == MofTokenKind::Char)
         element.value = MofChar{token.characters};
-    else if (atWord("true") || atWord("false"))
-        element.value = atWord("true");
-    else if (!atWord("null"))
-        fail("a value");
-    take();
+    else if (token.kind == MofTokenKind::Alias)
+        element.value = MofAlias{token.characters};
+    else if (tokens.atWord("true") || tokens.atWord("false"))
+        element.value = tokens.atWord("true");
+    else if (!tokens.atWord("null"))
+        tokens.fail("a value");
+    tokens.take();
     return element;
 }
 
 void MofParser::parseString(MofElement& element) {
-    std::string text;
-    while (token.kind == MofTokenKind::String)
-        text += take().characters;
+    std::string text = tokens.take().characters;
+    while (tokens.at(MofTokenKind::String))
+        text += tokens.take().characters;
     element.value = std::move(text);
 }
 
 MofName MofParser::parseName(std::string_view expected) {
-    if (token.kind != MofTokenKind::Identifier)
-        fail(expected);
-    const MofToken name = take();
+    if (!tokens.at(MofTokenKind::Identifier))
+        tokens.fail(expected);
+    const MofToken name = tokens.take();
     return {utf8::clean(name.text), name.position};
 }
 
-bool MofParser::atPunctuation(std::string_view mark) const {
-    return token.kind == MofTokenKind::Punctuation && token.text == mark;
+/// Whether a declaration begins here for certain, whatever braces are still open.
+bool MofParser::startsDeclaration() const {
+    return tokens.at(MofTokenKind::Pragma) ||
+           (tokens.current().position.column == 1 &&
+            (tokens.atWord("class") || tokens.atWord("instance") || tokens.atWord("qualifier")));
 }
 
-bool MofParser::atWord(std::string_view word) const {
-    return token.kind == MofTokenKind::Identifier && equalsIgnoringCase(token.text, word);
+/// After a mistake: to the end of the declaration.
+void MofParser::skipDeclaration() {
+    std::size_t depth = 0;
+    while (!tokens.atEnd() && !startsDeclaration()) {
+        if (tokens.atMark("{"))
+            ++depth;
+        else if (tokens.atMark("}") && depth > 0)
+            --depth;
+        const bool isLast = depth == 0 && tokens.atMark(";");
+        tokens.take();
+        if (isLast)
+            return;
+    }
 }
 
-bool MofParser::accept(std::string_view mark) {
-    if (!atPunctuation(mark))
-        return false;
-    take();
-    return true;
+/// After a mistake: to the end of the feature, or to the end of what it is in.
+void MofParser::skipFeature() {
+    std::size_t depth = 0;
+    while (!tokens.atEnd() && !startsDeclaration()) {
+        if (depth == 0 && tokens.atMark("}"))
+            return;
+        if (tokens.atMark("{"))
+            ++depth;
+        else if (tokens.atMark("}"))
+            --depth;
+        const bool isLast = depth == 0 && tokens.atMark(";");
+        tokens.take();
+        if (isLast)
+            return;
+    }
 }
 
-void MofParser::expect(std::string_view mark) {
-    if (!accept(mark))
-        fail(fmt::format("'{}'", mark));
-}
-
-MofToken MofParser::take() {
-    return std::exchange(token, lexer.next());
-}
-
-void MofParser::fail(std::string_view expected) const {
-    throw MofError(file, token.position, describe(token), expected);
+/// After a mistake in a list: past its closing mark. False when it seems to have none.
+bool MofParser::skipTo(std::string_view closing) {
+    while (!tokens.atEnd() && !startsDeclaration() && !tokens.atMark(";")) {
+        if (tokens.accept(closing))
+            return true;
+        tokens.take();
+    }
+    return false;
 }
 
 }  // namespace cimomd

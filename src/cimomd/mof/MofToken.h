@@ -10,7 +10,17 @@
 
 namespace cimomd {
 
-enum class MofTokenKind { Identifier, Integer, Real, String, Char, Punctuation, Pragma, End };
+enum class MofTokenKind {
+    Identifier,
+    Integer,
+    Real,
+    String,
+    Char,
+    Punctuation,
+    Pragma,
+    Alias,
+    End
+};
 
 /// One word. `text` looks into the lexed text and lives as long as that.
 struct MofToken {
@@ -22,8 +32,12 @@ struct MofToken {
     std::uint64_t magnitude = 0;
     /// Real: the value.
     double real = 0;
-    /// String and Char: the characters meant, in UTF-8, escapes resolved.
+    /// String and Char: the characters meant, in UTF-8, escapes resolved. Alias: its name without
+    /// the dollar sign.
     std::string characters;
 };
+
+/// A token's text as messages show it: cut when it is long, without bytes that are no UTF-8.
+std::string shownText(std::string_view text);
 
 }  // namespace cimomd

@@ -125,7 +125,7 @@ TEST_F(ClassRepositoryTest, boundsTheDepthOfInheritance) {
     MofCompiler compiler(repository, Pegasus::CIMNamespaceName(kNamespace));
     compiler.compileText(text, "deep.mof");
     EXPECT_NE(repository.findClass(kNamespace, "D64"), nullptr);
-    EXPECT_THROW(compiler.compileText("class D65 : D64 {};", "deeper.mof"), MofError);
+    EXPECT_THROW(compiler.compileText("class D65 : D64 {};", "deeper.mof"), MofErrors);
 }
 
 TEST_F(ClassRepositoryTest, copiesAreIndependent) {

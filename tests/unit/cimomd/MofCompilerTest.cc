@@ -31,16 +31,29 @@ class MofCompilerTest : public testing::Test {
         MofCompiler(repository, cimv2())
             .compileText(std::string(kQualifiers) + std::string(text), "t.mof");
     }
-    /// The message for `text`, whose first line is line 1.
-    std::string errorOf(std::string_view text) {
+    /// The messages for `text`, whose first line is line 1, without the name of the file.
+    std::vector<std::string> errorsOf(std::string_view text) {
+        std::vector<std::string> messages;
         try {
             compile(text);
-        } catch (const MofError& error) {
-            const std::string message = error.what();
-            const std::size_t rest = message.find(':', 6);
-            return std::to_string(error.position().line - kQualifierLines) + message.substr(rest);
+        } catch (const MofErrors& errors) {
+            for (const MofError& error : errors.errors()) {
+                const std::string message = error.what();
+                messages.push_back(std::to_string(error.position().line - kQualifierLines) +
+                                   message.substr(message.find(':', 6)));
+            }
         }
-        return "no error";
+        return messages;
+    }
+    /// The one message.
+    std::string errorOf(std::string_view text) {
+        const std::vector<std::string> messages = errorsOf(text);
+        if (messages.size() == 1)
+            return messages.front();
+        std::string all = std::to_string(messages.size()) + " messages";
+        for (const std::string& message : messages)
+            all += "\n" + message;
+        return all;
     }
     const CIMConstClass& compiledClass(const char* name) {
         const CIMConstClass* found = repository.findClass(cimv2(), name);
@@ -122,7 +135,7 @@ TEST_F(MofCompilerTest, saysWhatIsWrongAndWhere) {
         const char* message;
     };
     const std::vector<Case> cases{
-        {"klass X {};", "1:1: found klass, expected class, qualifier or #pragma"},
+        {"klass X {};", "1:1: found klass, expected class, instance, qualifier or #pragma"},
         {"class {};", "1:7: found {, expected a class name"},
         {"class X {}", "1:11: found the end of the file, expected ';'"},
         {"class X {\n string a\n};", "3:1: found }, expected ';'"},
@@ -178,7 +191,8 @@ TEST_F(MofCompilerTest, saysWhatIsWrongAndWhere) {
 }
 
 TEST_F(MofCompilerTest, loadsNothingOfAFileWithAMistake) {
-    EXPECT_NE(errorOf("class Good {}; class Bad { strin a; };"), "no error");
+    EXPECT_EQ(errorOf("class Good {}; class Bad { strin a; };"),
+              "1:28: found strin, expected a type");
     EXPECT_EQ(repository.findClass(cimv2(), "Good"), nullptr);
     EXPECT_EQ(repository.findQualifier(cimv2(), "Key"), nullptr);
     compile("class Good {};");
@@ -212,7 +226,7 @@ TEST_F(MofCompilerTest, namesTheIncludedFileInErrors) {
     try {
         MofCompiler(repository, cimv2()).compileFile(tree.root / "main.mof");
         FAIL() << "no error";
-    } catch (const MofError& error) {
+    } catch (const MofErrors& error) {
         EXPECT_EQ(std::string(error.what()),
                   (tree.root / "a.mof").string() +
                       ":2:11: found superclass None, expected a class that is declared");
@@ -222,7 +236,7 @@ TEST_F(MofCompilerTest, namesTheIncludedFileInErrors) {
 // Bytes that are no UTF-8 in the class name of a reference once left the compiler as an exception
 // that nobody caught.
 TEST_F(MofCompilerTest, takesBytesThatAreNotUtf8InTheClassOfAReference) {
-    compile("class T { B\xFF ref other; };");
+    compile("class B\xEF\xBF\xBD {}; class T { B\xFF ref other; };");
     const Pegasus::CIMConstProperty other = compiledClass("T").getProperty(0);
     EXPECT_EQ(utf8Of(other.getReferenceClassName().getString()), "B\xEF\xBF\xBD");
 }
@@ -230,14 +244,14 @@ TEST_F(MofCompilerTest, takesBytesThatAreNotUtf8InTheClassOfAReference) {
 TEST_F(MofCompilerTest, endsAnIncludeOfItself) {
     RecordedTree tree;
     tree.file("main.mof", "#pragma include (\"main.mof\")\n");
-    EXPECT_THROW(MofCompiler(repository, cimv2()).compileFile(tree.root / "main.mof"), MofError);
+    EXPECT_THROW(MofCompiler(repository, cimv2()).compileFile(tree.root / "main.mof"), MofErrors);
 }
 
 TEST_F(MofCompilerTest, refusesAFileThatIsNotThereOrADirectory) {
     RecordedTree tree;
     tree.directory("d.mof");
-    EXPECT_THROW(MofCompiler(repository, cimv2()).compileFile(tree.root / "d.mof"), MofError);
-    EXPECT_THROW(MofCompiler(repository, cimv2()).compileFile(tree.root / "none.mof"), MofError);
+    EXPECT_THROW(MofCompiler(repository, cimv2()).compileFile(tree.root / "d.mof"), MofErrors);
+    EXPECT_THROW(MofCompiler(repository, cimv2()).compileFile(tree.root / "none.mof"), MofErrors);
 }
 
 }  // namespace

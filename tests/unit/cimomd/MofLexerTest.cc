@@ -7,18 +7,25 @@
 namespace cimomd {
 namespace {
 
-std::vector<MofToken> tokensOf(std::string_view text) {
-    MofLexer lexer(text, "t.mof");
+std::vector<MofToken> tokensOf(std::string_view text, MofErrorLog& log) {
+    MofLexer lexer(text, "t.mof", log);
     std::vector<MofToken> tokens;
     for (MofToken token = lexer.next(); token.kind != MofTokenKind::End; token = lexer.next())
         tokens.push_back(token);
     return tokens;
 }
 
+std::vector<MofToken> tokensOf(std::string_view text) {
+    MofErrorLog log;
+    std::vector<MofToken> tokens = tokensOf(text, log);
+    log.raiseIfAny();
+    return tokens;
+}
+
 std::string errorOf(std::string_view text) {
     try {
         tokensOf(text);
-    } catch (const MofError& error) {
+    } catch (const MofErrors& error) {
         return error.what();
     }
     return "no error";
@@ -38,9 +45,45 @@ TEST(MofLexer, dropsCommentsAndBlanksAndCountsPlacesInCharacters) {
 }
 
 TEST(MofLexer, staysAtTheEnd) {
-    MofLexer lexer("", "t.mof");
+    MofErrorLog log;
+    MofLexer lexer("", "t.mof", log);
     EXPECT_EQ(lexer.next().kind, MofTokenKind::End);
     EXPECT_EQ(lexer.next().kind, MofTokenKind::End);
+}
+
+TEST(MofLexer, readsAliases) {
+    const auto tokens = tokensOf("as $Disk_1;");
+    ASSERT_EQ(tokens.size(), 3U);
+    EXPECT_EQ(tokens[1].kind, MofTokenKind::Alias);
+    EXPECT_EQ(tokens[1].characters, "Disk_1");
+    EXPECT_EQ(tokens[1].text, "$Disk_1");
+    EXPECT_EQ(errorOf("$1"), "t.mof:1:1: found '$', expected a declaration");
+}
+
+TEST(MofLexer, takesAnyBytesInComments) {
+    EXPECT_EQ(tokensOf("a // \xE9\x01 \"\n /* \xFF\xC3 ' // * / */ b").size(), 2U);
+}
+
+TEST(MofLexer, goesOnAfterAMistake) {
+    MofErrorLog log;
+    const auto tokens = tokensOf("a @ \"b\\q\" #if c\n 08 'd", log);
+    EXPECT_EQ(log.count(), 5U);
+    ASSERT_EQ(tokens.size(), 4U);
+    EXPECT_EQ(tokens[1].characters, "bq");
+    EXPECT_EQ(tokens[2].kind, MofTokenKind::Integer);
+    EXPECT_EQ(tokens[3].characters, "d");
+}
+
+TEST(MofLexer, takesTheMarksAfterAForgottenQuoteForMarks) {
+    MofErrorLog log;
+    const auto tokens = tokensOf("\"abc\xC3\xA9) ];\nd", log);
+    EXPECT_EQ(log.count(), 1U);
+    ASSERT_EQ(tokens.size(), 5U);
+    EXPECT_EQ(tokens[0].kind, MofTokenKind::String);
+    EXPECT_EQ(tokens[1].text, ")");
+    EXPECT_EQ(tokens[1].position.column, 6U);
+    EXPECT_EQ(tokens[3].text, ";");
+    EXPECT_EQ(tokens[4].position.line, 2U);
 }
 
 TEST(MofLexer, readsEveryKindOfInteger) {
@@ -95,7 +138,7 @@ TEST(MofLexer, replacesBytesThatAreNotUtf8InTexts) {
 TEST(MofLexer, saysWhereAWordIsWrong) {
     EXPECT_EQ(errorOf("a\n /* x"), "t.mof:2:2: found a comment without an end, expected */");
     EXPECT_EQ(errorOf("\"abc"), "t.mof:1:1: found a text without an end, expected a closing \"");
-    EXPECT_EQ(errorOf("\"abc\nd\""), "t.mof:1:5: found the end of the line, expected a closing \"");
+    EXPECT_EQ(errorOf("\"abc\nd"), "t.mof:1:5: found the end of the line, expected a closing \"");
     EXPECT_EQ(
         errorOf("\"a\\q\""),
         "t.mof:1:3: found a backslash, expected one of \\b \\t \\n \\f \\r \\\" \\' \\\\ \\x");
