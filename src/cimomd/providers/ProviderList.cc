@@ -1,7 +1,13 @@
 #include "providers/ProviderList.h"
 #include "providers/MissingValueProvider.h"
 
+#include "providers/computer/BiosElementProvider.h"
+#include "providers/computer/BoardProvider.h"
+#include "providers/computer/ChassisProvider.h"
 #include "providers/computer/ComputerSystemProvider.h"
+#include "providers/computer/MemoryProvider.h"
+#include "providers/computer/PhysicalMemoryProvider.h"
+#include "providers/computer/SlotProvider.h"
 #include "providers/network/EthernetPortProvider.h"
 #include "providers/processor/ProcessorProvider.h"
 #include "providers/software/OperatingSystemProvider.h"
@@ -12,6 +18,12 @@ namespace cimomd {
 ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     ProviderList providers;
     providers.push_back(std::make_unique<ComputerSystemProvider>(paths));
+    providers.push_back(std::make_unique<ChassisProvider>(paths));
+    providers.push_back(std::make_unique<BoardProvider>(paths));
+    providers.push_back(std::make_unique<BiosElementProvider>(paths));
+    providers.push_back(std::make_unique<PhysicalMemoryProvider>(paths));
+    providers.push_back(std::make_unique<MemoryProvider>(paths));
+    providers.push_back(std::make_unique<SlotProvider>(paths));
     providers.push_back(std::make_unique<OperatingSystemProvider>(paths, calls));
     providers.push_back(std::make_unique<ProcessorProvider>(paths));
     providers.push_back(std::make_unique<LocalFileSystemProvider>(paths, calls));

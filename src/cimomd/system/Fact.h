@@ -58,6 +58,12 @@ class Fact {
         return *converted;
     }
 
+    /// This, or the value of `other` when this has none. Without either the reason is this one's,
+    /// but a source that tells nothing leaves it to the other.
+    Fact orElse(const Fact& other) const {
+        return !found && (other.found || missingReason == Absence::Absent) ? other : *this;
+    }
+
     /// Two facts without a value are equal, whatever their reasons.
     friend bool operator==(const Fact& a, const Fact& b) { return a.found == b.found; }
     template <typename U>

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 
+#include "files/TextFile.h"
 #include "text/Utf8.h"
 
 namespace cimomd {
@@ -54,6 +55,10 @@ Fact<std::string> withoutPlaceholder(const Fact<std::string>& text) {
     return text.then([](const std::string& found) {
         return isPlaceholder(found) ? std::nullopt : std::optional<std::string>(trimmed(found));
     });
+}
+
+Fact<std::string> readFirmwareText(const std::filesystem::path& path) {
+    return withoutPlaceholder(readFact(path));
 }
 
 }  // namespace cimomd

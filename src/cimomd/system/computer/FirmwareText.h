@@ -2,6 +2,7 @@
 
 // Texts that a maker should have filled in, and often has not.
 
+#include <filesystem>
 #include <string>
 #include <string_view>
 
@@ -16,5 +17,8 @@ bool isPlaceholder(std::string_view text);
 
 /// The text without outer blanks; a placeholder is filtered.
 Fact<std::string> withoutPlaceholder(const Fact<std::string>& text);
+
+/// The text of a file in which the kernel hands on one text of the firmware.
+Fact<std::string> readFirmwareText(const std::filesystem::path& path);
 
 }  // namespace cimomd

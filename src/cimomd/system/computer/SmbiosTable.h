@@ -21,6 +21,19 @@ struct SmbiosVersion {
     }
 };
 
+/// The types of structures that say what the machine is made of.
+namespace smbios {
+inline constexpr std::uint8_t kFirmware = 0;
+inline constexpr std::uint8_t kSystem = 1;
+inline constexpr std::uint8_t kBoard = 2;
+inline constexpr std::uint8_t kChassis = 3;
+inline constexpr std::uint8_t kProcessor = 4;
+inline constexpr std::uint8_t kSlot = 9;
+inline constexpr std::uint8_t kMemoryArray = 16;
+inline constexpr std::uint8_t kMemoryDevice = 17;
+inline constexpr std::uint8_t kHardwareSecurity = 24;
+}  // namespace smbios
+
 struct SmbiosTable {
     SmbiosVersion version;
     /// In the order of the table, the one that ends it left out.

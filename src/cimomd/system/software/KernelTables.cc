@@ -5,6 +5,7 @@
 #include <cstring>
 
 #include "files/TextFields.h"
+#include "files/TextFile.h"
 
 namespace cimomd {
 namespace {
@@ -32,6 +33,12 @@ MemoryInfo parseMemoryInfo(std::string_view text) {
             out.swapTotalKB = kilobytes(entry->value);
     }
     return out;
+}
+
+Fact<std::uint64_t> readTotalMemoryKB(const SystemPaths& paths) {
+    return readText(paths.memory())
+        .then([](const std::string& text) { return parseMemoryInfo(text).totalKB; },
+              Absence::Unreadable);
 }
 
 std::optional<std::int64_t> parseBootTime(std::string_view text) {

@@ -6,6 +6,9 @@
 #include <optional>
 #include <string_view>
 
+#include "system/Fact.h"
+#include "system/SystemPaths.h"
+
 namespace cimomd {
 
 /// /proc/meminfo, in KB of 1024 bytes.
@@ -15,6 +18,9 @@ struct MemoryInfo {
     std::optional<std::uint64_t> swapTotalKB;
 };
 MemoryInfo parseMemoryInfo(std::string_view text);
+
+/// All memory that the kernel uses, in KB of 1024 bytes.
+Fact<std::uint64_t> readTotalMemoryKB(const SystemPaths& paths);
 
 /// The boot time of /proc/stat in seconds since 1970.
 std::optional<std::int64_t> parseBootTime(std::string_view text);
