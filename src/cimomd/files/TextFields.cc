@@ -63,7 +63,11 @@ std::optional<std::int64_t> parseSigned(std::string_view text) {
 std::optional<std::uint64_t> parseHexadecimal(std::string_view text) {
     if (text.substr(0, 2) != "0x")
         return std::nullopt;
-    return parseNumber<std::uint64_t>(text.substr(2), 16);
+    return parseHexDigits(text.substr(2));
+}
+
+std::optional<std::uint64_t> parseHexDigits(std::string_view text) {
+    return parseNumber<std::uint64_t>(text, 16);
 }
 
 std::string unescapeOctal(std::string_view text) {

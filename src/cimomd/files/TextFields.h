@@ -32,6 +32,9 @@ std::optional<std::int64_t> parseSigned(std::string_view text);
 /// Hexadecimal digits after "0x", within 64 bits.
 std::optional<std::uint64_t> parseHexadecimal(std::string_view text);
 
+/// The same without the "0x".
+std::optional<std::uint64_t> parseHexDigits(std::string_view text);
+
 /// Turns \ooo (three octal digits, as in mount tables) into the byte meant.
 std::string unescapeOctal(std::string_view text);
 
