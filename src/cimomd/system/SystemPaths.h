@@ -25,6 +25,15 @@ class SystemPaths {
     std::filesystem::path deviceTree() const { return below("proc/device-tree"); }
     std::filesystem::path logicalProcessors() const { return below("sys/devices/system/cpu"); }
     std::filesystem::path networkInterfaces() const { return below("sys/class/net"); }
+    std::filesystem::path pciDevices() const { return below("sys/bus/pci/devices"); }
+    std::filesystem::path usbDevices() const { return below("sys/bus/usb/devices"); }
+    std::filesystem::path graphics() const { return below("sys/class/drm"); }
+    std::filesystem::path powerSupplies() const { return below("sys/class/power_supply"); }
+    std::filesystem::path hardwareMonitors() const { return below("sys/class/hwmon"); }
+    /// pci.ids and usb.ids, on Debian.
+    std::filesystem::path miscellaneousLists() const { return below("usr/share/misc"); }
+    /// The same on other distributions.
+    std::filesystem::path hardwareLists() const { return below("usr/share/hwdata"); }
     std::filesystem::path firmwareIdentity() const { return below("sys/class/dmi/id"); }
     std::filesystem::path firmwareTables() const { return below("sys/firmware/dmi/tables"); }
     std::filesystem::path uefi() const { return below("sys/firmware/efi"); }
