@@ -28,8 +28,9 @@ inline constexpr std::uint16_t kNotDedicated = 0;
 // The class of the computer: a key of everything that belongs to it.
 inline constexpr const char* kComputerSystemClass = "Velmira_ComputerSystem";
 
-// MaxLen of CIM_ManagedElement.Caption and of names that are keys.
+// MaxLen of CIM_ManagedElement.Caption, of CIM_ManagedSystemElement.Name and of keys.
 inline constexpr std::size_t kCaptionLength = 64;
+inline constexpr std::size_t kNameLength = 1024;
 inline constexpr std::size_t kSystemNameLength = 256;
 inline constexpr std::size_t kDeviceIdLength = 64;
 

@@ -8,6 +8,13 @@
 #include "providers/computer/MemoryProvider.h"
 #include "providers/computer/PhysicalMemoryProvider.h"
 #include "providers/computer/SlotProvider.h"
+#include "providers/devices/BatteryProvider.h"
+#include "providers/devices/DesktopMonitorProvider.h"
+#include "providers/devices/FanProvider.h"
+#include "providers/devices/NumericSensorProvider.h"
+#include "providers/devices/PciDeviceProvider.h"
+#include "providers/devices/UsbDeviceProvider.h"
+#include "providers/devices/VideoControllerProvider.h"
 #include "providers/network/EthernetPortProvider.h"
 #include "providers/processor/ProcessorProvider.h"
 #include "providers/software/OperatingSystemProvider.h"
@@ -28,6 +35,13 @@ ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     providers.push_back(std::make_unique<ProcessorProvider>(paths));
     providers.push_back(std::make_unique<LocalFileSystemProvider>(paths, calls));
     providers.push_back(std::make_unique<EthernetPortProvider>(paths));
+    providers.push_back(std::make_unique<PciDeviceProvider>(paths));
+    providers.push_back(std::make_unique<UsbDeviceProvider>(paths));
+    providers.push_back(std::make_unique<VideoControllerProvider>(paths));
+    providers.push_back(std::make_unique<DesktopMonitorProvider>(paths));
+    providers.push_back(std::make_unique<BatteryProvider>(paths));
+    providers.push_back(std::make_unique<NumericSensorProvider>(paths));
+    providers.push_back(std::make_unique<FanProvider>(paths));
     providers.push_back(std::make_unique<MissingValueProvider>(providers));
     return providers;
 }
