@@ -30,5 +30,13 @@ TEST(Fact, isConvertedWithItsReason) {
     EXPECT_EQ(Fact<std::string>(Absence::TimedOut).then(length).reason(), Absence::TimedOut);
 }
 
+TEST(Fact, mayComeFromASecondSource) {
+    using Text = Fact<std::string>;
+    EXPECT_EQ(Text("first").orElse("second"), "first");
+    EXPECT_EQ(Text(Absence::Filtered).orElse("second"), "second");
+    EXPECT_EQ(Text(Absence::Filtered).orElse(Absence::NeedsRoot).reason(), Absence::Filtered);
+    EXPECT_EQ(Text(Absence::Absent).orElse(Absence::NeedsRoot).reason(), Absence::NeedsRoot);
+}
+
 }  // namespace
 }  // namespace cimomd

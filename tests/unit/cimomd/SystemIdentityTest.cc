@@ -5,6 +5,7 @@
 #include <stdexcept>
 
 #include "RecordedTree.h"
+#include "SmbiosBytes.h"
 #include "system/RecordedSystemCalls.h"
 #include "system/computer/FirmwareText.h"
 
@@ -36,6 +37,79 @@ TEST(SystemIdentity, readsTheFirmwaresTexts) {
     EXPECT_EQ(identity.serialNumber, "ABC1234");
     EXPECT_EQ(identity.uuid, "4c4c4544-0042-3510-8052-b4c04f4e3432");
     EXPECT_EQ(identity.machineId, "3d1219c7c4c5404aaa1f6d2a48adfda4");
+}
+
+SmbiosFields systemOf(std::uint8_t length) {
+    SmbiosFields fields(1, length);
+    fields.text(4, "Maker").text(5, "M-7").text(6, "None").text(7, "S-42");
+    for (std::uint8_t i = 0; i < 16 && 8U + i < length; ++i)
+        fields.byte(8U + i, i);
+    return fields;
+}
+
+TEST(SystemIdentity, prefersTheTables) {
+    RecordedTree tree;
+    recordSmbios(tree, {systemOf(0x1B).byte(0x18, 6).text(0x19, "SKU-1").text(0x1A, "Family"),
+                        SmbiosFields(24, 5).byte(4, 0xFD)});
+    tree.file("sys/class/dmi/id/sys_vendor", "Another\n")
+        .file("proc/device-tree/model", "Another model");
+    const SystemIdentity identity = readSystemIdentity(tree.paths());
+    EXPECT_EQ(identity.manufacturer, "Maker");
+    EXPECT_EQ(identity.model, "M-7");
+    EXPECT_EQ(identity.version.reason(), Absence::Filtered);
+    EXPECT_EQ(identity.serialNumber, "S-42");
+    EXPECT_EQ(identity.uuid, "03020100-0504-0706-0809-0a0b0c0d0e0f");
+    EXPECT_EQ(identity.wakeUpType, 6);
+    EXPECT_EQ(identity.sku, "SKU-1");
+    EXPECT_EQ(identity.family, "Family");
+    EXPECT_EQ(identity.resetButton, 1);
+}
+
+// Before version 2.6 the bytes of a UUID stood in the order in which they are written.
+TEST(SystemIdentity, readsUuidsOfOldTablesInTheirOrder) {
+    RecordedTree tree;
+    tree.file("sys/firmware/dmi/tables/smbios_entry_point", smbiosEntryPoint32(2, 5))
+        .file("sys/firmware/dmi/tables/DMI", smbiosTableOf({systemOf(0x19)}));
+    EXPECT_EQ(readSystemIdentity(tree.paths()).uuid, "00010203-0405-0607-0809-0a0b0c0d0e0f");
+    tree.file("sys/firmware/dmi/tables/smbios_entry_point", smbiosEntryPoint32(2, 6));
+    EXPECT_EQ(readSystemIdentity(tree.paths()).uuid, "03020100-0504-0706-0809-0a0b0c0d0e0f");
+}
+
+// Version 2.0 ends before the UUID, 2.1 before the number of the configuration.
+TEST(SystemIdentity, hasLessFromOldTables) {
+    RecordedTree tree;
+    recordSmbios(tree, {systemOf(0x08)});
+    SystemIdentity identity = readSystemIdentity(tree.paths());
+    EXPECT_EQ(identity.serialNumber, "S-42");
+    EXPECT_EQ(identity.uuid.reason(), Absence::Absent);
+    EXPECT_EQ(identity.wakeUpType, std::nullopt);
+    recordSmbios(tree, {systemOf(0x17)});
+    EXPECT_EQ(readSystemIdentity(tree.paths()).uuid, std::nullopt);
+    recordSmbios(tree, {systemOf(0x19)});
+    identity = readSystemIdentity(tree.paths());
+    EXPECT_TRUE(identity.uuid.has_value());
+    EXPECT_EQ(identity.sku, std::nullopt);
+}
+
+TEST(SystemIdentity, filtersUuidsThatNobodySet) {
+    RecordedTree tree;
+    SmbiosFields system(1, 0x19);
+    recordSmbios(tree, {system});
+    EXPECT_EQ(readSystemIdentity(tree.paths()).uuid.reason(), Absence::Filtered);
+    for (std::size_t i = 8; i < 24; ++i)
+        system.byte(i, 0xFF);
+    recordSmbios(tree, {system});
+    EXPECT_EQ(readSystemIdentity(tree.paths()).uuid.reason(), Absence::Filtered);
+}
+
+TEST(SystemIdentity, fillsGapsOfTheTablesFromTheDeviceTree) {
+    RecordedTree tree;
+    recordSmbios(tree, {SmbiosFields(1, 0x1B).text(4, "Maker").text(5, "Default string")});
+    tree.file("proc/device-tree/model", std::string_view("Board 7\0", 8));
+    const SystemIdentity identity = readSystemIdentity(tree.paths());
+    EXPECT_EQ(identity.manufacturer, "Maker");
+    EXPECT_EQ(identity.model, "Board 7");
+    EXPECT_EQ(identity.serialNumber.reason(), Absence::Absent);
 }
 
 TEST(SystemIdentity, fallsBackOnTheDeviceTree) {

@@ -45,7 +45,7 @@ std::unique_ptr<InstanceStream> BiosElementProvider::enumerate() const {
 ProvidedInstance BiosElementProvider::publish(const Firmware& firmware, bool uefi) {
     const char* const type = uefi ? "UEFI" : "BIOS";
     InstanceBuilder builder(kClassName);
-    builder.label(fmt::format("{} {}", type, firmware.version.value_or("")))
+    builder.label(firmware.version ? fmt::format("{} {}", type, *firmware.version) : type)
         .text("Name", "System firmware")
         .text("Version", firmware.version.value_or(""), kVersionLength)
         .value<Uint16>("SoftwareElementState", kRunning)
