@@ -19,7 +19,7 @@ TEST(ComputerSystemProvider, takesTheTextsThatTheKernelHandsOn) {
         .file("sys/class/dmi/id/product_uuid", "11111111-1111-1111-1111-111111111111\n")
         .file("sys/class/dmi/id/product_sku", "SKU 5\n")
         .file("sys/class/dmi/id/product_family", "Family 9\n")
-        .file("etc/machine-id", "3d1219c7c4c5404aaa1f6d2a48adfda4\n");
+        .file("etc/machine-id", "5e2b7c90d41f4a8f9c63b0e8a7d61f24\n");
     const ComputerSystemProvider provider(tree.paths());
     expectServesItsClass(provider);
     const auto instances = all(provider.enumerate());
@@ -35,7 +35,7 @@ TEST(ComputerSystemProvider, takesTheTextsThatTheKernelHandsOn) {
     EXPECT_EQ(textOf(system, "SerialNumber"), "null");
     EXPECT_EQ(textOf(system, "SKU"), "SKU 5");
     EXPECT_EQ(textOf(system, "Family"), "Family 9");
-    EXPECT_EQ(textOf(system, "OtherIdentifyingInfo"), "3d1219c7c4c5404aaa1f6d2a48adfda4 ");
+    EXPECT_EQ(textOf(system, "OtherIdentifyingInfo"), "5e2b7c90d41f4a8f9c63b0e8a7d61f24 ");
     EXPECT_EQ(textOf(system, "IdentifyingDescriptions"), "Machine id ");
 }
 

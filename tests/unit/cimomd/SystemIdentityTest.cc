@@ -29,14 +29,14 @@ TEST(SystemIdentity, readsTheFirmwaresTexts) {
         .file("sys/class/dmi/id/product_version", "Not Specified\n")
         .file("sys/class/dmi/id/product_serial", "ABC1234\n")
         .file("sys/class/dmi/id/product_uuid", "4c4c4544-0042-3510-8052-b4c04f4e3432\n")
-        .file("etc/machine-id", "3d1219c7c4c5404aaa1f6d2a48adfda4\n");
+        .file("etc/machine-id", "5e2b7c90d41f4a8f9c63b0e8a7d61f24\n");
     const SystemIdentity identity = readSystemIdentity(tree.paths());
     EXPECT_EQ(identity.manufacturer, "Dell Inc.");
     EXPECT_EQ(identity.model, "OptiPlex 7010");
     EXPECT_EQ(identity.version, std::nullopt);
     EXPECT_EQ(identity.serialNumber, "ABC1234");
     EXPECT_EQ(identity.uuid, "4c4c4544-0042-3510-8052-b4c04f4e3432");
-    EXPECT_EQ(identity.machineId, "3d1219c7c4c5404aaa1f6d2a48adfda4");
+    EXPECT_EQ(identity.machineId, "5e2b7c90d41f4a8f9c63b0e8a7d61f24");
 }
 
 SmbiosFields systemOf(std::uint8_t length) {

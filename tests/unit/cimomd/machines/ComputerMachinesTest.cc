@@ -106,7 +106,7 @@ TEST(ComputerMachines, armBoardAsComputer) {
                                     {"SerialNumber", "10000000abcdef01"},
                                     {"UUID", "null"},
                                     {"OtherIdentifyingInfo",
-                                     "10000000abcdef01 3d1219c7c4c5404aaa1f6d2a48adfda4 "},
+                                     "10000000abcdef01 5e2b7c90d41f4a8f9c63b0e8a7d61f24 "},
                                     {"IdentifyingDescriptions", "Serial number Machine id "}});
 }
 
