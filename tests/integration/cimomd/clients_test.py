@@ -5,18 +5,17 @@ badly."""
 import argparse
 import os
 import pathlib
-import re
 import shutil
 import signal
 import socket
 import subprocess
 import sys
 import tempfile
-import time
 import unittest
 
-PATIENCE_S = 10
-NAMESPACE = "root/cimv2"
+from cimomd_server import (NAMESPACE, PATIENCE_S, Server, body_of, call, class_name, exchange, post,
+                           waited)
+
 CIMOMD = None
 
 OWN_MOF = """
@@ -40,93 +39,17 @@ def machine(root):
     return root
 
 
-def waited(condition):
-    end = time.monotonic() + PATIENCE_S
-    while time.monotonic() < end:
-        if condition():
-            return True
-        time.sleep(0.02)
-    return False
-
-
-class Server:
-    """cimomd as a child; its standard error goes to a file that tests read."""
-
-    def __init__(self, place, *arguments, **options):
-        self.log_path = place / "log"
-        self.log_file = open(self.log_path, "ab")
-        own = place / "own"
-        own.mkdir(exist_ok=True)
-        (own / "places.mof").write_text(OWN_MOF)
-        self.process = subprocess.Popen(
-            [CIMOMD, *arguments, "--root", machine(place / "machine"), "--mof-dir", own],
-            stdout=subprocess.PIPE, stderr=self.log_file, **options)
-
-    def log(self):
-        return self.log_path.read_text()
-
-    def port(self):
-        line = self.process.stdout.readline().decode()
-        return int(re.fullmatch(r"listening on http://127\.0\.0\.1:(\d+)\n", line).group(1))
-
-    def descriptors(self):
-        return len(os.listdir(f"/proc/{self.process.pid}/fd"))
-
-    def end(self):
-        self.process.send_signal(signal.SIGTERM)
-        status = self.process.wait(PATIENCE_S)
-        self.process.stdout.close()
-        self.log_file.close()
-        return status
-
-
-def call(method, parameters="", namespace=NAMESPACE):
-    parts = "".join(f'<NAMESPACE NAME="{part}"/>' for part in namespace.split("/"))
-    return ('<?xml version="1.0" encoding="utf-8"?><CIM CIMVERSION="2.0" DTDVERSION="2.0">'
-            '<MESSAGE ID="1" PROTOCOLVERSION="1.0"><SIMPLEREQ>'
-            f'<IMETHODCALL NAME="{method}"><LOCALNAMESPACEPATH>{parts}</LOCALNAMESPACEPATH>'
-            f'{parameters}</IMETHODCALL></SIMPLEREQ></MESSAGE></CIM>').encode()
-
-
-def class_name(name):
-    return f'<IPARAMVALUE NAME="ClassName"><CLASSNAME NAME="{name}"/></IPARAMVALUE>'
-
-
-def post(body, headers=b"", host=b"localhost"):
-    return (b"POST /cimom HTTP/1.1\r\nHost: " + host + b"\r\nContent-Type: application/xml\r\n"
-            b"CIMOperation: MethodCall\r\nConnection: close\r\n" + headers +
-            b"Content-Length: %d\r\n\r\n" % len(body) + body)
-
-
-def exchange(connection, request):
-    """What comes back until the server closes the connection."""
-    connection.settimeout(PATIENCE_S)
-    connection.sendall(request)
-    answer = b""
-    while piece := connection.recv(65536):
-        answer += piece
-    return answer
-
-
-def body_of(answer):
-    """The content of a chunked answer."""
-    rest = answer.split(b"\r\n\r\n", 1)[1]
-    body = b""
-    while True:
-        size, rest = rest.split(b"\r\n", 1)
-        if int(size, 16) == 0:
-            return body
-        body += rest[:int(size, 16)]
-        rest = rest[int(size, 16) + 2:]
-
-
 class CimomdTest(unittest.TestCase):
     def setUp(self):
         self.place = pathlib.Path(tempfile.mkdtemp(prefix="cimomd-clients-"))
         self.addCleanup(shutil.rmtree, self.place)
 
     def started(self, *arguments, **options):
-        server = Server(self.place, *arguments, **options)
+        own = self.place / "own"
+        own.mkdir(exist_ok=True)
+        (own / "places.mof").write_text(OWN_MOF)
+        server = Server(self.place, CIMOMD, *arguments, "--root", machine(self.place / "machine"),
+                        "--mof-dir", own, **options)
         self.addCleanup(lambda: server.process.poll() is not None or server.end())
         return server
 
