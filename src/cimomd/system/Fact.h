@@ -29,7 +29,7 @@ class Fact {
   public:
     Fact() = default;
     template <typename U = T>
-    requires std::is_convertible_v<U, T> Fact(U&& known) : found(std::forward<U>(known)) {}
+    requires std::is_convertible_v<U, T> Fact(U known) : found(std::move(known)) {}
     Fact(std::optional<T> known) : found(std::move(known)) {}
     Fact(std::nullopt_t) {}
     Fact(Absence why) : missingReason(why) {}
