@@ -1,5 +1,6 @@
 // mif-rows [--allow TOLERANCE]... FILE: prints the tables of a file as JSON, one table a line:
-// name, attribute names, and rows of texts. Octets beyond ASCII are printed as ISO 8859-1.
+// name, attribute names, and rows of texts; then the groups that stand for themselves, each as a
+// table of one row. Octets beyond ASCII are printed as ISO 8859-1.
 // Status 1 when the file is refused, with the reason on standard error; 2 for a wrong call.
 
 #include <cstdio>
@@ -7,6 +8,7 @@
 #include <iostream>
 #include <iterator>
 #include <string>
+#include <vector>
 
 #include "support/mif/MifReader.h"
 
@@ -34,8 +36,8 @@ std::string text(const Mif::Value& value) {
     return value.kind == Mif::Value::Kind::Text ? json(value.text) : "null";
 }
 
-void print(const Mif::Group& group, const Mif::Table& table) {
-    std::string line = "{\"name\": " + json(table.name) + ", \"columns\": [";
+void print(const std::string& name, const Mif::Group& group, const std::vector<Mif::Row>& rows) {
+    std::string line = "{\"name\": " + json(name) + ", \"columns\": [";
     const char* separator = "";
     for (const Mif::Attribute& attribute : group.attributes) {
         line += separator + json(attribute.name);
@@ -43,7 +45,7 @@ void print(const Mif::Group& group, const Mif::Table& table) {
     }
     line += "], \"rows\": [";
     const char* rowSeparator = "[";
-    for (const Mif::Row& row : table.rows) {
+    for (const Mif::Row& row : rows) {
         line += rowSeparator;
         separator = "";
         for (std::size_t i = 0; i < group.attributes.size(); ++i) {
@@ -85,7 +87,12 @@ int main(int argc, char** argv) {
     try {
         const Mif::Component component = Mif::MifReader(tolerances).read(octets);
         for (const Mif::Table& table : component.tables) {
-            print(component.groups[table.group], table);
+            print(table.name, component.groups[table.group], table.rows);
+        }
+        for (const Mif::Group& group : component.groups) {
+            if (!group.isTemplate()) {
+                print(group.name, group, {Mif::Row()});
+            }
         }
     } catch (const Mif::Error& error) {
         std::cerr << argv[next] << ":" << error.what() << '\n';
