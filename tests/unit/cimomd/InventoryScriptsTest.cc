@@ -1,4 +1,5 @@
-// The shipped scripts and their resource texts against the shipped schema.
+// The shipped scripts and their resource texts against the shipped schema. What becomes of their
+// names in the files of each product is tried with the whole generator.
 
 #include <gtest/gtest.h>
 
@@ -17,6 +18,10 @@ namespace {
 
 // The narrowest product takes this many characters in a column's name.
 constexpr std::size_t kMaxColumnName = 18;
+// Longer ones are shortened.
+constexpr std::size_t kMaxTitle = 13;
+
+const Pegasus::CIMNamespaceName kNamespace("root/cimv2");
 
 struct Script {
     std::string title;
@@ -71,24 +76,90 @@ std::vector<std::string> scriptNames() {
     return names;
 }
 
-TEST(InventoryScripts, nameClassesAndPropertiesThatAreServed) {
-    ClassRepository repository;
-    const Pegasus::CIMNamespaceName nameSpace("root/cimv2");
-    MofCompiler(repository, nameSpace)
-        .compileFile(std::filesystem::path(SCHEMA_DIR) / "cimomd.mof");
-    ASSERT_EQ(scriptNames().size(), 5U);
+const ClassRepository& schema() {
+    static const ClassRepository repository = [] {
+        ClassRepository compiled;
+        MofCompiler(compiled, kNamespace)
+            .compileFile(std::filesystem::path(SCHEMA_DIR) / "cimomd.mof");
+        return compiled;
+    }();
+    return repository;
+}
+
+/// Calls `visit` with each property that a script lists and the key of its resource texts.
+template <typename Visitor>
+void forEachListedProperty(const Visitor& visit) {
     for (const std::string& name : scriptNames()) {
         const Script script = scriptOf(name);
         const auto* found =
-            repository.findClass(nameSpace, Pegasus::CIMName(cimString(script.className)));
+            schema().findClass(kNamespace, Pegasus::CIMName(cimString(script.className)));
+        ASSERT_NE(found, nullptr) << name;
+        for (const std::string& property : script.properties) {
+            const Pegasus::Uint32 index =
+                found->findProperty(Pegasus::CIMName(cimString(property)));
+            ASSERT_NE(index, Pegasus::PEG_NOT_FOUND) << script.className << "." << property;
+            visit(found->getProperty(index), script.className + "." + property);
+        }
+    }
+}
+
+Pegasus::Array<Pegasus::String> valuesOf(const Pegasus::CIMConstProperty& property) {
+    Pegasus::Array<Pegasus::String> texts;
+    const Pegasus::Uint32 index = property.findQualifier("Values");
+    if (index != Pegasus::PEG_NOT_FOUND)
+        property.getQualifier(index).getValue().get(texts);
+    return texts;
+}
+
+TEST(InventoryScripts, nameClassesAndPropertiesThatAreServed) {
+    ASSERT_FALSE(scriptNames().empty());
+    for (const std::string& name : scriptNames()) {
+        const Script script = scriptOf(name);
+        const auto* found =
+            schema().findClass(kNamespace, Pegasus::CIMName(cimString(script.className)));
         ASSERT_NE(found, nullptr) << name;
         EXPECT_EQ(utf8Of(found->getClassName().getString()), script.className);
         EXPECT_FALSE(script.properties.empty()) << name;
-        for (const std::string& property : script.properties)
-            EXPECT_NE(found->findProperty(Pegasus::CIMName(cimString(property))),
-                      Pegasus::PEG_NOT_FOUND)
-                << script.className << "." << property;
     }
+    forEachListedProperty([](const Pegasus::CIMConstProperty& property, const std::string& key) {
+        EXPECT_EQ(utf8Of(property.getName().getString()), key.substr(key.find('.') + 1));
+    });
+}
+
+// A class without instances would leave its place to the instances of the next one.
+TEST(InventoryScripts, haveOneClassEach) {
+    std::set<std::string> classes;
+    for (const std::string& name : scriptNames()) {
+        const std::string text = textOf(name);
+        EXPECT_EQ(text.find("G["), text.rfind("G[")) << name;
+        EXPECT_TRUE(classes.insert(scriptOf(name).className).second) << name;
+    }
+}
+
+// Of 64 bits only the lower 32 are written. No frame is that long.
+TEST(InventoryScripts, listNumbersThatSurviveTheOutput) {
+    forEachListedProperty([](const Pegasus::CIMConstProperty& property, const std::string& key) {
+        const bool is64Bit = property.getType() == Pegasus::CIMTYPE_UINT64 ||
+                             property.getType() == Pegasus::CIMTYPE_SINT64;
+        EXPECT_FALSE(is64Bit && !property.isArray() &&
+                     key.find(".ActiveMaximumTransmissionUnit") == std::string::npos)
+            << key;
+    });
+}
+
+TEST(InventoryScripts, haveColumnsThatTheirWordsFitInto) {
+    const auto texts = resources();
+    forEachListedProperty([&](const Pegasus::CIMConstProperty& property, const std::string& key) {
+        const auto size = texts.find(key + ".Size");
+        if (size == texts.end())
+            return;
+        EXPECT_FALSE(property.isArray()) << key << " is as wide as every array";
+        const unsigned long width = std::stoul(size->second);
+        EXPECT_TRUE(width > 0 && width <= 255) << key;
+        const Pegasus::Array<Pegasus::String> values = valuesOf(property);
+        for (Pegasus::Uint32 i = 0; i < values.size(); ++i)
+            EXPECT_LE(utf8Of(values[i]).size(), width) << key << ": " << utf8Of(values[i]);
+    });
 }
 
 TEST(InventoryScripts, haveReadableNamesThatEveryProductTakes) {
@@ -97,7 +168,8 @@ TEST(InventoryScripts, haveReadableNamesThatEveryProductTakes) {
         const Script script = scriptOf(name);
         std::string title = script.title;
         std::replace(title.begin(), title.end(), ' ', '_');
-        EXPECT_TRUE(texts.count("title." + title)) << title;
+        ASSERT_TRUE(texts.count("title." + title)) << title;
+        EXPECT_LE(texts.at("title." + title).size(), kMaxTitle) << title;
         std::set<std::string> columns;
         for (const std::string& property : script.properties) {
             const auto text = texts.find(script.className + "." + property);
