@@ -12,6 +12,7 @@ inline constexpr std::uint16_t kOperationalUnknown = 0;
 inline constexpr std::uint16_t kOperationalOk = 2;
 inline constexpr std::uint16_t kOperationalDegraded = 3;
 inline constexpr std::uint16_t kOperationalError = 6;
+inline constexpr std::uint16_t kOperationalStarting = 8;
 inline constexpr std::uint16_t kOperationalStopped = 10;
 inline constexpr std::uint16_t kOperationalInService = 11;
 inline constexpr std::uint16_t kOperationalDormant = 15;

@@ -15,7 +15,12 @@
 #include "providers/devices/PciDeviceProvider.h"
 #include "providers/devices/UsbDeviceProvider.h"
 #include "providers/devices/VideoControllerProvider.h"
+#include "providers/network/DnsSettingDataProvider.h"
 #include "providers/network/EthernetPortProvider.h"
+#include "providers/network/IpProtocolEndpointProvider.h"
+#include "providers/network/LanEndpointProvider.h"
+#include "providers/network/NextHopIpRouteProvider.h"
+#include "providers/network/WiFiPortProvider.h"
 #include "providers/processor/ProcessorProvider.h"
 #include "providers/software/OperatingSystemProvider.h"
 #include "providers/storage/LocalFileSystemProvider.h"
@@ -34,7 +39,6 @@ ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     providers.push_back(std::make_unique<OperatingSystemProvider>(paths, calls));
     providers.push_back(std::make_unique<ProcessorProvider>(paths));
     providers.push_back(std::make_unique<LocalFileSystemProvider>(paths, calls));
-    providers.push_back(std::make_unique<EthernetPortProvider>(paths));
     providers.push_back(std::make_unique<PciDeviceProvider>(paths));
     providers.push_back(std::make_unique<UsbDeviceProvider>(paths));
     providers.push_back(std::make_unique<VideoControllerProvider>(paths));
@@ -42,6 +46,12 @@ ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     providers.push_back(std::make_unique<BatteryProvider>(paths));
     providers.push_back(std::make_unique<NumericSensorProvider>(paths));
     providers.push_back(std::make_unique<FanProvider>(paths));
+    providers.push_back(std::make_unique<EthernetPortProvider>(paths, calls));
+    providers.push_back(std::make_unique<WiFiPortProvider>(paths, calls));
+    providers.push_back(std::make_unique<LanEndpointProvider>(paths));
+    providers.push_back(std::make_unique<IpProtocolEndpointProvider>(paths, calls));
+    providers.push_back(std::make_unique<NextHopIpRouteProvider>(paths));
+    providers.push_back(std::make_unique<DnsSettingDataProvider>(paths));
     providers.push_back(std::make_unique<MissingValueProvider>(providers));
     return providers;
 }

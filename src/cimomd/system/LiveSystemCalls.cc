@@ -4,6 +4,8 @@
 
 #include <ctime>
 
+#include "system/network/AddressDump.h"
+
 namespace cimomd {
 
 std::int64_t LiveSystemCalls::now() const {
@@ -34,6 +36,14 @@ std::optional<std::string> LiveSystemCalls::machine() const {
     if (::uname(&names) != 0)
         return std::nullopt;
     return names.machine;
+}
+
+Fact<std::vector<InterfaceAddress>> LiveSystemCalls::interfaceAddresses() const {
+    return dumpAddresses();
+}
+
+LinkSettings LiveSystemCalls::linkSettings(const std::string& interfaceName) const {
+    return askLinkSettings(interfaceName);
 }
 
 }  // namespace cimomd

@@ -15,6 +15,8 @@ class LiveSystemCalls : public SystemCalls {
     Fact<FileSystemSize> fileSystemSizeInTime(const std::string& mountPoint,
                                               const std::string& device) const override;
     std::optional<std::string> machine() const override;
+    Fact<std::vector<InterfaceAddress>> interfaceAddresses() const override;
+    LinkSettings linkSettings(const std::string& interfaceName) const override;
 
   private:
     mutable FileSystemSizeGuard guard;

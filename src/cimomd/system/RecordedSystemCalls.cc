@@ -40,7 +40,9 @@ std::map<std::string, Fact<FileSystemSize>> parseRecordedSizes(std::string_view 
 }
 
 RecordedSystemCalls::RecordedSystemCalls(const SystemPaths& paths)
-    : sizes(parseRecordedSizes(readText(paths.recordedFileSystemSizes()).value_or(""))) {}
+    : sizes(parseRecordedSizes(readText(paths.recordedFileSystemSizes()).value_or(""))),
+      addresses(readText(paths.recordedAddresses()).then(parseRecordedAddresses)),
+      links(parseRecordedLinks(readText(paths.recordedLinks()).value_or(""))) {}
 
 Fact<FileSystemSize> RecordedSystemCalls::fileSystemSize(const std::string& mountPoint) const {
     const auto place = sizes.find(mountPoint);
@@ -56,6 +58,15 @@ Fact<FileSystemSize> RecordedSystemCalls::fileSystemSizeInTime(const std::string
 
 std::optional<std::string> RecordedSystemCalls::machine() const {
     return std::nullopt;
+}
+
+Fact<std::vector<InterfaceAddress>> RecordedSystemCalls::interfaceAddresses() const {
+    return addresses;
+}
+
+LinkSettings RecordedSystemCalls::linkSettings(const std::string& interfaceName) const {
+    const auto place = links.find(interfaceName);
+    return place == links.end() ? LinkSettings() : place->second;
 }
 
 }  // namespace cimomd

@@ -1,7 +1,8 @@
 #pragma once
 
-// Stands in for the system calls when a recorded tree is read: the sizes of its file systems come
-// from a file of the tree, never from the machine this runs on.
+// Stands in for the system calls when a recorded tree is read: the sizes of its file systems, its
+// addresses and what its network drivers tell come from files of the tree, never from the machine
+// this runs on.
 
 #include <map>
 #include <string_view>
@@ -25,9 +26,13 @@ class RecordedSystemCalls : public LiveSystemCalls {
                                               const std::string& device) const override;
     /// Always nothing: a tree says it in proc/sys/kernel/arch or not at all.
     std::optional<std::string> machine() const override;
+    Fact<std::vector<InterfaceAddress>> interfaceAddresses() const override;
+    LinkSettings linkSettings(const std::string& interfaceName) const override;
 
   private:
     std::map<std::string, Fact<FileSystemSize>> sizes;
+    Fact<std::vector<InterfaceAddress>> addresses;
+    std::map<std::string, LinkSettings> links;
 };
 
 }  // namespace cimomd

@@ -5,6 +5,11 @@
 #include <cstdint>
 #include <optional>
 #include <string>
+#include <vector>
+
+#include "system/Fact.h"
+#include "system/network/InterfaceAddress.h"
+#include "system/network/LinkSettings.h"
 
 #include "system/Fact.h"
 
@@ -42,6 +47,12 @@ class SystemCalls {
     }
     /// The machine's name as uname has it, for example "x86_64".
     virtual std::optional<std::string> machine() const = 0;
+    /// The internet addresses of all network interfaces, in any order.
+    virtual Fact<std::vector<InterfaceAddress>> interfaceAddresses() const {
+        return Absence::Absent;
+    }
+    /// What the driver of a network interface tells.
+    virtual LinkSettings linkSettings(const std::string& /*interfaceName*/) const { return {}; }
 
   protected:
     SystemCalls() = default;

@@ -37,12 +37,23 @@ class SystemPaths {
     std::filesystem::path firmwareIdentity() const { return below("sys/class/dmi/id"); }
     std::filesystem::path firmwareTables() const { return below("sys/firmware/dmi/tables"); }
     std::filesystem::path uefi() const { return below("sys/firmware/efi"); }
+    std::filesystem::path ipv4Routes() const { return below("proc/net/route"); }
+    std::filesystem::path ipv6Routes() const { return below("proc/net/ipv6_route"); }
+    std::filesystem::path resolver() const { return below("etc/resolv.conf"); }
+    /// The servers that the local stub of systemd-resolved asks.
+    std::filesystem::path resolverBehindStub() const {
+        return below("run/systemd/resolve/resolv.conf");
+    }
     std::filesystem::path osRelease() const { return below("etc/os-release"); }
     std::filesystem::path vendorOsRelease() const { return below("usr/lib/os-release"); }
     std::filesystem::path machineId() const { return below("etc/machine-id"); }
     std::filesystem::path sessions() const { return below("run/utmp"); }
     /// Only in recorded trees: what statvfs said when the tree was recorded.
     std::filesystem::path recordedFileSystemSizes() const { return below("statvfs"); }
+    /// Only in recorded trees: the addresses of the interfaces, as netlink told them.
+    std::filesystem::path recordedAddresses() const { return below("netlink-addresses"); }
+    /// Only in recorded trees: what the drivers of the network ports told.
+    std::filesystem::path recordedLinks() const { return below("ethtool"); }
 
     /// `path`, relative to the root.
     std::filesystem::path below(std::string_view path) const;

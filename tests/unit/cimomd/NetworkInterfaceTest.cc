@@ -17,7 +17,10 @@ TEST(NetworkInterface, readsAPort) {
         .file("net/enp1s0/flags", "0x1003\n")
         .file("net/enp1s0/speed", "10000\n")
         .file("net/enp1s0/duplex", "full\n")
-        .directory("net/enp1s0/device");
+        .file("net/enp1s0/carrier", "1\n")
+        .file("net/enp1s0/uevent", "INTERFACE=enp1s0\nIFINDEX=2\n")
+        .file("net/enp1s0/device/uevent",
+              "DRIVER=ixgbe\nPCI_CLASS=20000\nPCI_SLOT_NAME=0000:01:00.0\n");
     const auto interfaces = readNetworkInterfaces(tree.root / "net");
     ASSERT_TRUE(interfaces);
     ASSERT_EQ(interfaces->size(), 1U);
@@ -30,7 +33,52 @@ TEST(NetworkInterface, readsAPort) {
     EXPECT_EQ(port.flags, 0x1003U);
     EXPECT_EQ(port.speedMbps, 10000U);
     EXPECT_EQ(port.fullDuplex, true);
+    EXPECT_EQ(port.hasCarrier, true);
+    EXPECT_EQ(port.kind, std::nullopt);
+    EXPECT_EQ(port.driver, "ixgbe");
+    EXPECT_EQ(port.busAddress, "0000:01:00.0");
     EXPECT_TRUE(port.isEthernetPort());
+    EXPECT_FALSE(port.isWifiPort());
+}
+
+TEST(NetworkInterface, readsOddTexts) {
+    RecordedTree tree;
+    tree.file("net/eth0/address", "\n")
+        .file("net/eth0/addr_assign_type", "-3\n")
+        .file("net/eth0/type", "99999999999999999999\n")
+        .file("net/eth0/mtu", "a lot\n")
+        .file("net/eth0/flags", "1003\n")
+        .file("net/eth0/carrier", "\xFF\n")
+        .file("net/eth0/speed", "99999999999999999999\n")
+        .file("net/eth0/duplex", "both\n")
+        .file("net/eth0/uevent", std::string(100000, 'x'))
+        .file("net/eth0/device/uevent", "DRIVER\n=x\nDRIVER=\n");
+    const auto interfaces = readNetworkInterfaces(tree.root / "net");
+    ASSERT_EQ(interfaces->size(), 1U);
+    const NetworkInterface& port = interfaces->front();
+    EXPECT_EQ(port.address, std::nullopt);
+    EXPECT_EQ(port.addressIsPermanent, std::nullopt);
+    EXPECT_EQ(port.linkType, std::nullopt);
+    EXPECT_EQ(port.mtuBytes, std::nullopt);
+    EXPECT_EQ(port.flags, std::nullopt);
+    EXPECT_EQ(port.hasCarrier, std::nullopt);
+    EXPECT_EQ(port.speedMbps, std::nullopt);
+    EXPECT_EQ(port.fullDuplex, std::nullopt);
+    EXPECT_EQ(port.kind.reason(), Absence::Unreadable);
+    EXPECT_EQ(port.driver, std::nullopt);
+    EXPECT_FALSE(port.isEthernetPort());
+}
+
+TEST(NetworkInterface, ordersByTheNumbersInNames) {
+    RecordedTree tree;
+    for (const char* name : {"eth10", "eth2", "bond0", "eth1"})
+        tree.directory(std::string("net/") + name);
+    const auto interfaces = readNetworkInterfaces(tree.root / "net");
+    ASSERT_EQ(interfaces->size(), 4U);
+    EXPECT_EQ((*interfaces)[0].name, "bond0");
+    EXPECT_EQ((*interfaces)[1].name, "eth1");
+    EXPECT_EQ((*interfaces)[2].name, "eth2");
+    EXPECT_EQ((*interfaces)[3].name, "eth10");
 }
 
 TEST(NetworkInterface, takesAnUnknownSpeedAsNothing) {
@@ -53,12 +101,16 @@ TEST(NetworkInterface, takesOnlyWiredHardwareAsEthernetPorts) {
         .directory("net/wlan0/device")
         .directory("net/wlan0/phy80211");
     tree.file("net/ib0/type", "32\n").directory("net/ib0/device");
+    tree.file("net/bnep0/type", "1\n")
+        .file("net/bnep0/uevent", "DEVTYPE=bluetooth\n")
+        .directory("net/bnep0/device");
     tree.file("net/bonding_masters", "bond0\n");
     const auto interfaces = readNetworkInterfaces(tree.root / "net");
-    ASSERT_EQ(interfaces->size(), 3U);
+    ASSERT_EQ(interfaces->size(), 4U);
     for (const NetworkInterface& interface : *interfaces)
         EXPECT_FALSE(interface.isEthernetPort()) << interface.name;
-    EXPECT_FALSE(readNetworkInterfaces(tree.root / "none").has_value());
+    EXPECT_TRUE((*interfaces)[3].isWifiPort());
+    EXPECT_EQ(readNetworkInterfaces(tree.root / "none").reason(), Absence::Absent);
 }
 
 }  // namespace

@@ -9,7 +9,6 @@
 #include "SchemaConformance.h"
 #include "providers/CimTime.h"
 #include "providers/ProviderList.h"
-#include "providers/network/EthernetPortProvider.h"
 #include "providers/processor/ProcessorProvider.h"
 #include "providers/software/OperatingSystemProvider.h"
 #include "providers/storage/LocalFileSystemProvider.h"
@@ -184,54 +183,6 @@ TEST_F(ProvidersTest, localFileSystems) {
 
 TEST_F(ProvidersTest, fileSystemsOfAMachineWithoutAMountTable) {
     EXPECT_THROW(LocalFileSystemProvider(tree.paths(), calls).enumerate(), ProviderError);
-}
-
-TEST_F(ProvidersTest, ethernetPorts) {
-    const auto port = [this](const std::string& name, const char* state, const char* flags) {
-        const std::string base = "sys/class/net/" + name;
-        tree.file(base + "/type", "1\n")
-            .file(base + "/operstate", state)
-            .file(base + "/flags", flags)
-            .directory(base + "/device");
-    };
-    port("enp1s0", "up\n", "0x1003\n");
-    tree.file("sys/class/net/enp1s0/address", "52:54:00:ab:cd:ef\n")
-        .file("sys/class/net/enp1s0/addr_assign_type", "0\n")
-        .file("sys/class/net/enp1s0/mtu", "1500\n")
-        .file("sys/class/net/enp1s0/speed", "10000\n")
-        .file("sys/class/net/enp1s0/duplex", "full\n");
-    port("enp2s0", "down\n", "0x1003\n");
-    tree.file("sys/class/net/enp2s0/address", "52:54:00:ab:cd:f0\n")
-        .file("sys/class/net/enp2s0/addr_assign_type", "3\n")
-        .file("sys/class/net/enp2s0/speed", "-1\n");
-    port("enp3s0", "down\n", "0x1002\n");
-    tree.file("sys/class/net/lo/type", "772\n");
-    const auto instances = all(EthernetPortProvider(tree.paths()).enumerate());
-    ASSERT_EQ(instances.size(), 3U);
-    EXPECT_EQ(textOf(instances[0], "DeviceID"), "enp1s0");
-    EXPECT_EQ(textOf(instances[0], "PermanentAddress"), "525400ABCDEF");
-    EXPECT_EQ(textOf(instances[0], "NetworkAddresses"), "525400ABCDEF ");
-    EXPECT_EQ(textOf(instances[0], "Speed"), "10000000000");
-    EXPECT_EQ(textOf(instances[0], "SpeedMbps"), "10000");
-    EXPECT_EQ(textOf(instances[0], "FullDuplex"), "TRUE");
-    EXPECT_EQ(textOf(instances[0], "LinkTechnology"), "2");
-    EXPECT_EQ(textOf(instances[0], "ActiveMaximumTransmissionUnit"), "1500");
-    EXPECT_EQ(textOf(instances[0], "OperationalStatus"), "2 ");
-    EXPECT_EQ(textOf(instances[0], "EnabledState"), "2");
-    EXPECT_EQ(textOf(instances[1], "PermanentAddress"), "null");
-    EXPECT_EQ(textOf(instances[1], "NetworkAddresses"), "525400ABCDF0 ");
-    EXPECT_EQ(textOf(instances[1], "Speed"), "null");
-    EXPECT_EQ(textOf(instances[1], "SpeedMbps"), "null");
-    EXPECT_EQ(textOf(instances[1], "FullDuplex"), "null");
-    EXPECT_EQ(textOf(instances[1], "OperationalStatus"), "10 ");
-    EXPECT_EQ(textOf(instances[1], "EnabledState"), "6");
-    EXPECT_EQ(textOf(instances[2], "EnabledState"), "3");
-}
-
-TEST_F(ProvidersTest, portsOfAMachineWithoutNetwork) {
-    EXPECT_THROW(EthernetPortProvider(tree.paths()).enumerate(), ProviderError);
-    tree.directory("sys/class/net");
-    EXPECT_TRUE(all(EthernetPortProvider(tree.paths()).enumerate()).empty());
 }
 
 TEST(CimTime, writesLocalTimeWithItsOffset) {

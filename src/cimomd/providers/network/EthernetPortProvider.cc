@@ -1,104 +1,88 @@
 #include "providers/network/EthernetPortProvider.h"
 
-#include <algorithm>
-#include <limits>
-
-#include "providers/EnumeratedValues.h"
 #include "providers/InstanceBuilder.h"
-#include "providers/RecordStream.h"
-#include "system/computer/SystemIdentity.h"
+#include "providers/network/NetworkPort.h"
 
 namespace cimomd {
 namespace {
 
 using Pegasus::Uint16;
-using Pegasus::Uint32;
-using Pegasus::Uint64;
 
-constexpr Uint64 kBitsPerMbit = 1000000;
-constexpr std::uint64_t kInterfaceUp = 1;
 constexpr Uint16 kLinkTechnologyEthernet = 2;
 
-/// CIM writes hardware addresses as hexadecimal digits only, in upper case.
-std::optional<std::string> digitsOf(const std::optional<std::string>& address) {
-    if (!address)
-        return std::nullopt;
-    std::string digits;
-    for (const char c : *address) {
-        if (c != ':')
-            digits += c >= 'a' && c <= 'f' ? static_cast<char>(c - 'a' + 'A') : c;
+// CIM_EthernetPort.PortType
+constexpr Uint16 kPortTypeOther = 1;
+
+/// The standard has numbers for speeds on twisted pair; for fibre it tells wave lengths apart,
+/// which no driver names.
+Fact<Uint16> portTypeOf(const Fact<PortConnector>& connector, const Fact<std::uint64_t>& speed) {
+    if (!connector)
+        return connector.reason();
+    if (connector != PortConnector::TwistedPair)
+        return kPortTypeOther;
+    return speed.then([](std::uint64_t mbps) -> Uint16 {
+        switch (mbps) {
+            case 10:
+                return 50;
+            case 100:
+                return 52;
+            case 1000:
+                return 53;
+            case 2500:
+                return 54;
+            case 10000:
+                return 55;
+            default:
+                return kPortTypeOther;
+        }
+    });
+}
+
+const char* textOf(PortConnector connector) {
+    switch (connector) {
+        case PortConnector::TwistedPair:
+            return "Twisted Pair";
+        case PortConnector::Aui:
+            return "AUI";
+        case PortConnector::Mii:
+            return "MII";
+        case PortConnector::Fibre:
+            return "Fibre";
+        case PortConnector::Bnc:
+            return "BNC";
+        case PortConnector::DirectAttach:
+            return "Direct Attach Copper";
     }
-    return digits;
+    return "";
 }
 
-Uint16 operationalStatusOf(const std::optional<std::string>& state) {
-    if (state == "up")
-        return kOperationalOk;
-    if (state == "down" || state == "lowerlayerdown" || state == "notpresent")
-        return kOperationalStopped;
-    if (state == "dormant")
-        return kOperationalDormant;
-    if (state == "testing")
-        return kOperationalInService;
-    return kOperationalUnknown;
-}
-
-std::optional<Uint16> enabledStateOf(const NetworkInterface& interface) {
-    if (!interface.flags)
-        return std::nullopt;
-    if ((*interface.flags & kInterfaceUp) == 0)
-        return kDisabled;
-    const bool isWorking = operationalStatusOf(interface.operationalState) != kOperationalStopped;
-    return isWorking ? kEnabled : kEnabledButOffline;
-}
-
-std::optional<Uint64> bitsPerSecond(const std::optional<std::uint64_t>& speedMbps) {
-    if (!speedMbps || *speedMbps > std::numeric_limits<Uint64>::max() / kBitsPerMbit)
-        return std::nullopt;
-    return *speedMbps * kBitsPerMbit;
-}
-
-std::optional<Uint32> narrowed(const std::optional<std::uint64_t>& value) {
-    if (!value || *value > std::numeric_limits<Uint32>::max())
-        return std::nullopt;
-    return static_cast<Uint32>(*value);
-}
-
-std::vector<NetworkInterface> ethernetPorts(std::vector<NetworkInterface> interfaces) {
-    interfaces.erase(std::remove_if(interfaces.begin(), interfaces.end(),
-                                    [](const auto& entry) { return !entry.isEthernetPort(); }),
-                     interfaces.end());
-    return interfaces;
+Fact<std::string> otherPortTypeOf(const Fact<Uint16>& type, const Fact<PortConnector>& connector) {
+    if (type != kPortTypeOther)
+        return Absence::Absent;
+    return connector.then([](PortConnector known) { return std::string(textOf(known)); });
 }
 
 }  // namespace
 
 std::unique_ptr<InstanceStream> EthernetPortProvider::enumerate() const {
-    auto interfaces = readNetworkInterfaces(paths.networkInterfaces());
-    if (!interfaces)
-        throw ProviderError("the network interfaces in /sys/class/net cannot be read");
-    const std::string hostName = readHostName(paths);
-    return std::make_unique<RecordStream<NetworkInterface>>(
-        ethernetPorts(std::move(*interfaces)),
-        [hostName](const NetworkInterface& interface) { return publish(hostName, interface); });
+    const auto isWanted = [](const NetworkInterface& interface) {
+        return interface.isEthernetPort();
+    };
+    return streamInterfaces(
+        paths, isWanted, [&systemCalls = calls](const auto& hostName, const auto& interface) {
+            return publish(hostName, interface, systemCalls.linkSettings(interface.name));
+        });
 }
 
 ProvidedInstance EthernetPortProvider::publish(const std::string& hostName,
-                                               const NetworkInterface& interface) {
-    const std::optional<std::string> address = digitsOf(interface.address);
+                                               const NetworkInterface& interface,
+                                               const LinkSettings& link) {
+    const Fact<Uint16> type = portTypeOf(link.connector, interface.speedMbps);
     InstanceBuilder builder(kClassName);
-    builder.label(interface.name)
-        .text("Name", interface.name)
-        .values<Uint16>("OperationalStatus", {operationalStatusOf(interface.operationalState)})
-        .value<Uint16>("EnabledState", enabledStateOf(interface))
-        .deviceKeys(hostName, interface.name)
-        .value<Uint64>("Speed", bitsPerSecond(interface.speedMbps))
-        .text("PermanentAddress", interface.addressIsPermanent == true ? address : std::nullopt)
-        .texts("NetworkAddresses", address ? std::vector{*address} : std::vector<std::string>())
-        .value<Uint16>("LinkTechnology", kLinkTechnologyEthernet)
-        .value<Pegasus::Boolean>("FullDuplex", interface.fullDuplex)
-        .value<Uint64>("ActiveMaximumTransmissionUnit", interface.mtuBytes)
-        .value<Uint32>("SpeedMbps", narrowed(interface.speedMbps));
+    describePort(builder, hostName, interface, link);
+    builder.value<Uint16>("LinkTechnology", kLinkTechnologyEthernet)
+        .value<Uint16>("PortType", type)
+        .text("OtherPortType", otherPortTypeOf(type, link.connector));
     return builder.take();
 }
 

@@ -1,8 +1,10 @@
 #pragma once
 
-// The Ethernet ports that are hardware, a hypervisor's included. Reads /sys/class/net.
+// The Ethernet ports that are hardware, a hypervisor's included. Reads /sys/class/net and asks the
+// drivers for the address burnt in and the connector.
 
 #include "providers/Provider.h"
+#include "system/SystemCalls.h"
 #include "system/SystemPaths.h"
 #include "system/network/NetworkInterface.h"
 
@@ -12,15 +14,19 @@ class EthernetPortProvider : public Provider {
   public:
     static constexpr const char* kClassName = "Velmira_EthernetPort";
 
-    explicit EthernetPortProvider(SystemPaths systemPaths) : paths(std::move(systemPaths)) {}
+    /// `systemCalls` must outlive the provider and its streams.
+    EthernetPortProvider(SystemPaths systemPaths, const SystemCalls& systemCalls)
+        : paths(std::move(systemPaths)), calls(systemCalls) {}
 
     const char* className() const override { return kClassName; }
     std::unique_ptr<InstanceStream> enumerate() const override;
 
-    static ProvidedInstance publish(const std::string& hostName, const NetworkInterface& interface);
+    static ProvidedInstance publish(const std::string& hostName, const NetworkInterface& interface,
+                                    const LinkSettings& link);
 
   private:
     SystemPaths paths;
+    const SystemCalls& calls;
 };
 
 }  // namespace cimomd

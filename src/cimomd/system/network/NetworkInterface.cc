@@ -1,40 +1,83 @@
 #include "system/network/NetworkInterface.h"
 
+#include <algorithm>
+#include <limits>
+
 #include "files/TextFields.h"
 #include "files/TextFile.h"
+#include "text/NaturalOrder.h"
 
 namespace cimomd {
 namespace {
+
+constexpr std::uint64_t kEthernet = 1;
 
 bool isThere(const std::filesystem::path& path) {
     std::error_code error;
     return std::filesystem::exists(std::filesystem::symlink_status(path, error));
 }
 
-std::optional<bool> duplexOf(const std::optional<std::string>& text) {
-    if (text == "full")
-        return true;
-    if (text == "half")
-        return false;
-    return std::nullopt;
+Fact<bool> duplexOf(const Fact<std::string>& text) {
+    return text.then(
+        [](const std::string& word) {
+            const bool isKnown = word == "full" || word == "half";
+            return isKnown ? std::optional(word == "full") : std::nullopt;
+        },
+        Absence::Absent);
+}
+
+/// The kernel refuses to read link properties while an interface is down: there are none then.
+template <typename T>
+Fact<T> ofLink(const Fact<T>& fact) {
+    return !fact && fact.reason() == Absence::Unreadable ? Fact<T>(Absence::Absent) : fact;
+}
+
+/// An unknown speed is -1, which some drivers show as the largest unsigned number.
+Fact<std::uint64_t> readSpeed(const std::filesystem::path& path) {
+    return ofLink(readSignedNumber(path))
+        .then(
+            [](std::int64_t speed) {
+                const bool isKnown = speed > 0 && speed < std::numeric_limits<std::uint32_t>::max();
+                return isKnown ? std::optional(static_cast<std::uint64_t>(speed)) : std::nullopt;
+            },
+            Absence::Absent);
+}
+
+/// The value of a line `key=value` of a uevent file.
+Fact<std::string> eventValue(const Fact<std::string>& event, std::string_view key) {
+    return event.then(
+        [key](const std::string& text) -> std::optional<std::string> {
+            for (const std::string_view line : linesOf(text)) {
+                const auto entry = keyValueOf(line, '=');
+                if (entry && entry->key == key && !entry->value.empty())
+                    return std::string(entry->value);
+            }
+            return std::nullopt;
+        },
+        Absence::Absent);
 }
 
 NetworkInterface readInterface(const std::filesystem::path& directory, const std::string& name) {
     NetworkInterface out;
     out.name = name;
     out.address = readFact(directory / "address");
-    if (const auto assignment = readNumber(directory / "addr_assign_type"))
-        out.addressIsPermanent = *assignment == 0;
+    out.addressIsPermanent =
+        readNumber(directory / "addr_assign_type").then([](std::uint64_t how) { return how == 0; });
     out.linkType = readNumber(directory / "type");
     out.mtuBytes = readNumber(directory / "mtu");
     out.operationalState = readFact(directory / "operstate");
-    if (const auto flags = readFact(directory / "flags"))
-        out.flags = parseHexadecimal(*flags);
-    const auto speed = readNumber(directory / "speed");
-    // An unknown speed is -1, which some drivers show as the largest unsigned number.
-    if (speed && *speed > 0 && *speed < UINT32_MAX)
-        out.speedMbps = speed;
-    out.fullDuplex = duplexOf(readFact(directory / "duplex"));
+    out.flags = readFact(directory / "flags").then([](const std::string& text) {
+        return parseHexadecimal(text);
+    });
+    out.hasCarrier = ofLink(readNumber(directory / "carrier")).then([](std::uint64_t carrier) {
+        return carrier != 0;
+    });
+    out.speedMbps = readSpeed(directory / "speed");
+    out.fullDuplex = duplexOf(ofLink(readFact(directory / "duplex")));
+    out.kind = eventValue(readFact(directory / "uevent"), "DEVTYPE");
+    const Fact<std::string> deviceEvent = readFact(directory / "device" / "uevent");
+    out.driver = eventValue(deviceEvent, "DRIVER");
+    out.busAddress = eventValue(deviceEvent, "PCI_SLOT_NAME");
     out.hasDevice = isThere(directory / "device");
     out.isWireless = isThere(directory / "phy80211") || isThere(directory / "wireless");
     return out;
@@ -42,17 +85,27 @@ NetworkInterface readInterface(const std::filesystem::path& directory, const std
 
 }  // namespace
 
-std::optional<std::vector<NetworkInterface>> readNetworkInterfaces(
-    const std::filesystem::path& directory) {
+bool NetworkInterface::isEthernetPort() const {
+    const bool isOtherKind = kind == "wlan" || kind == "wwan" || kind == "bluetooth";
+    return hasDevice && !isWireless && !isOtherKind && linkType == kEthernet;
+}
+
+bool NetworkInterface::isWifiPort() const {
+    return hasDevice && (isWireless || kind == "wlan") && linkType == kEthernet;
+}
+
+Fact<std::vector<NetworkInterface>> readNetworkInterfaces(const std::filesystem::path& directory) {
     const auto names = listDirectory(directory);
     if (!names)
-        return std::nullopt;
+        return names.reason();
     std::vector<NetworkInterface> out;
     for (const std::string& name : *names) {
         std::error_code error;
         if (std::filesystem::is_directory(directory / name, error))
             out.push_back(readInterface(directory / name, name));
     }
+    std::sort(out.begin(), out.end(),
+              [](const auto& a, const auto& b) { return naturallyBefore(a.name, b.name); });
     return out;
 }
 

@@ -1,0 +1,35 @@
+#include "providers/network/WiFiPortProvider.h"
+
+#include "providers/InstanceBuilder.h"
+#include "providers/network/NetworkPort.h"
+
+namespace cimomd {
+namespace {
+
+using Pegasus::Uint16;
+
+constexpr Uint16 kLinkTechnologyWirelessLan = 11;
+
+}  // namespace
+
+std::unique_ptr<InstanceStream> WiFiPortProvider::enumerate() const {
+    const auto isWanted = [](const NetworkInterface& interface) { return interface.isWifiPort(); };
+    return streamInterfaces(
+        paths, isWanted, [&systemCalls = calls](const auto& hostName, const auto& interface) {
+            return publish(hostName, interface, systemCalls.linkSettings(interface.name));
+        });
+}
+
+ProvidedInstance WiFiPortProvider::publish(const std::string& hostName,
+                                           const NetworkInterface& interface,
+                                           const LinkSettings& link) {
+    InstanceBuilder builder(kClassName);
+    describePort(builder, hostName, interface, link);
+    // Which of the 802.11 standards is in use is not told where this looks.
+    builder.value<Uint16>("LinkTechnology", kLinkTechnologyWirelessLan)
+        .value<Uint16>("PortType", Absence::Absent)
+        .text("OtherPortType", Absence::Absent);
+    return builder.take();
+}
+
+}  // namespace cimomd
