@@ -76,9 +76,13 @@ def chassis(length, maker, kind, version, serial, asset, height, cords, sku=None
     return out.text(0x15, sku) if sku else out
 
 
-def processor(handle, socket, family, maker, version, maximum, current, status, upgrade, cores, threads):
+def processor(handle, socket, family, maker, version, maximum, current, status, upgrade, cores, threads,
+              external=0, serial=None, part=None):
     out = Structure(4, 0x2A, handle).text(4, socket).byte(5, 3).byte(6, family)
-    out.text(7, maker).text(0x10, version).word(0x14, maximum).word(0x16, current)
+    out.text(7, maker).text(0x10, version).word(0x12, external).word(0x14, maximum).word(0x16, current)
+    for offset, value in ((0x20, serial), (0x22, part)):
+        if value:
+            out.text(offset, value)
     out.byte(0x18, status).byte(0x19, upgrade).byte(0x23, cores).byte(0x24, cores)
     return out.byte(0x25, threads).word(0x26, 0x00FC).word(0x28, family)
 
@@ -159,7 +163,7 @@ write("laptop", True, (3, 2), [
     chassis(0x16, "Nordwind Systems", 10, "None", "PF2A7K3Q", "IT-00417", 0, 1, "NX14_CH_01")
     .byte(0x14, 0),
     processor(0x0004, "U3E1", 0xCD, "Intel(R) Corporation", "11th Gen Intel(R) Core(TM) i5-1135G7 @ 2.40GHz",
-              4200, 2400, 0x41, 0x3C, 4, 8),
+              4200, 2400, 0x41, 0x3C, 4, 8, 100, "To Be Filled By O.E.M.", "To Be Filled By O.E.M."),
     slot(0x18, 0x0009, "Media Card Slot", 0x01, 0x01, 3, 1, 0x04),
     slot(0x18, 0x000A, "M.2 SSD", 0x17, 0x0A, 4, 2, 0x04, (0, 4, 0x00)),
     memory_array(0x0010, 3, 2, 32 << 20),
@@ -194,10 +198,10 @@ write("server", False, (2, 8), [
     board(0x0200, "Granit Computer", "0YWR7D", "A06", "CNFCP0000123AB", "", 0x09, "", 10),
     board(0x0201, "Granit Computer", "0RSR2B", "A01", "CNFCP0000456CD", "", 0x0C, "Riser 2", 13),
     chassis(0x15, "Granit Computer", 0x80 | 23, "Default string", "7XK2LM3", "DC2-R12-U07", 2, 2),
-    processor(0x0400, "CPU1", 0xB3, "Intel", "Intel(R) Xeon(R) Gold 6226R CPU @ 2.90GHz", 4000, 2900, 0x41, 0x36,
-              16, 32),
-    processor(0x0401, "CPU2", 0xB3, "Intel", "Intel(R) Xeon(R) Gold 6226R CPU @ 2.90GHz", 4000, 2900, 0x41, 0x36,
-              16, 32),
+    processor(0x0400, "CPU1", 0xB3, "Intel", "Intel(R) Xeon(R) Gold 5222 CPU @ 3.80GHz", 4000, 3800, 0x41, 0x36,
+              4, 4, 10400, "5F3A81C7", "Not Specified"),
+    processor(0x0401, "CPU2", 0xB3, "Intel", "Intel(R) Xeon(R) Gold 5222 CPU @ 3.80GHz", 4000, 3800, 0x41, 0x36,
+              4, 4, 10400, "5F3A81D2", "Not Specified"),
     slot(0x11, 0x0900, "PCIe Slot 1", 0xB5, 0x0B, 4, 1, 0x04, (0, 0x3B, 0x00)),
     slot(0x11, 0x0901, "PCIe Slot 2", 0xB6, 0x0D, 3, 2, 0x06),
     slot(0x11, 0x0902, "PCIe Slot 3", 0xB6, 0x0B, 2, 3, 0x04),

@@ -21,6 +21,7 @@
 #include "providers/network/LanEndpointProvider.h"
 #include "providers/network/NextHopIpRouteProvider.h"
 #include "providers/network/WiFiPortProvider.h"
+#include "providers/processor/CacheMemoryProvider.h"
 #include "providers/processor/ProcessorProvider.h"
 #include "providers/software/OperatingSystemProvider.h"
 #include "providers/storage/LocalFileSystemProvider.h"
@@ -38,6 +39,7 @@ ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     providers.push_back(std::make_unique<SlotProvider>(paths));
     providers.push_back(std::make_unique<OperatingSystemProvider>(paths, calls));
     providers.push_back(std::make_unique<ProcessorProvider>(paths));
+    providers.push_back(std::make_unique<CacheMemoryProvider>(paths));
     providers.push_back(std::make_unique<LocalFileSystemProvider>(paths, calls));
     providers.push_back(std::make_unique<PciDeviceProvider>(paths));
     providers.push_back(std::make_unique<UsbDeviceProvider>(paths));

@@ -44,8 +44,8 @@ TEST(CpuInfo, readsX86) {
 TEST(CpuInfo, describesArmWithoutAModelName) {
     const auto infos = parseCpuInfo(kArm);
     ASSERT_EQ(infos.size(), 1U);
-    EXPECT_EQ(infos[0].model, "ARM implementer 0x41 part 0xd08");
-    EXPECT_EQ(infos[0].vendor, std::nullopt);
+    EXPECT_EQ(infos[0].vendor, "ARM");
+    EXPECT_EQ(infos[0].model, "Cortex-A72");
     EXPECT_EQ(infos[0].stepping, "3");
     EXPECT_EQ(infos[0].width, 64);
     EXPECT_EQ(infos[0].packageId, std::nullopt);
@@ -59,6 +59,19 @@ TEST(CpuInfo, leavesOutWhatItCannotRead) {
     EXPECT_EQ(infos[0].currentMHz, std::nullopt);
     EXPECT_EQ(infos[0].model, std::nullopt);
     EXPECT_EQ(infos[0].width, 32);
+}
+
+TEST(CpuInfo, keepsTheNumbersOfUnknownArmProcessors) {
+    const auto infos = parseCpuInfo(
+        "processor: 0\nCPU implementer: 0x61\nCPU part: 0xd08\n\n"
+        "processor: 1\nCPU implementer: 0xee\nCPU part: 0x1\n\n"
+        "processor: 2\nCPU implementer: me\nCPU part: 0xd08\n");
+    ASSERT_EQ(infos.size(), 3U);
+    EXPECT_EQ(infos[0].vendor, "Apple");
+    EXPECT_EQ(infos[0].model, "ARM implementer 0x61 part 0xd08");
+    EXPECT_EQ(infos[1].vendor, std::nullopt);
+    EXPECT_EQ(infos[1].model, "ARM implementer 0xee part 0x1");
+    EXPECT_EQ(infos[2].vendor, std::nullopt);
 }
 
 TEST(LogicalProcessor, readsTopologyInNumericOrder) {

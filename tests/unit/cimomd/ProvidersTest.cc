@@ -9,7 +9,6 @@
 #include "SchemaConformance.h"
 #include "providers/CimTime.h"
 #include "providers/ProviderList.h"
-#include "providers/processor/ProcessorProvider.h"
 #include "providers/software/OperatingSystemProvider.h"
 #include "providers/storage/LocalFileSystemProvider.h"
 
@@ -110,44 +109,6 @@ TEST(OperatingSystemProvider, knowsTheTypesOfDistributions) {
     }
     EXPECT_EQ(OperatingSystemProvider::osTypeOf(std::nullopt, "x86_64"), 101);
     EXPECT_EQ(OperatingSystemProvider::osTypeOf("debian", std::nullopt), std::nullopt);
-}
-
-TEST_F(ProvidersTest, processors) {
-    for (const char* cpu : {"cpu0", "cpu1"}) {
-        const std::string base = std::string("sys/devices/system/cpu/") + cpu;
-        tree.file(base + "/topology/physical_package_id", cpu[3] == '0' ? "0\n" : "3\n")
-            .file(base + "/topology/core_id", "0\n")
-            .file(base + "/cpufreq/cpuinfo_max_freq", "3600000\n");
-    }
-    const std::string longName(80, 'x');
-    tree.file("proc/cpuinfo",
-              "processor: 0\nvendor_id: AuthenticAMD\nmodel name: AMD EPYC\n"
-              "stepping: 1\ncpu MHz: 2596.142\nflags: lm\n\nprocessor: 1\n"
-              "model name: " +
-                  longName + "\n");
-    const auto instances = all(ProcessorProvider(tree.paths()).enumerate());
-    ASSERT_EQ(instances.size(), 2U);
-    EXPECT_EQ(textOf(instances[0], "DeviceID"), "CPU0");
-    EXPECT_EQ(textOf(instances[0], "SystemName"), "node7");
-    EXPECT_EQ(textOf(instances[0], "Family"), "1");
-    EXPECT_EQ(textOf(instances[0], "OtherFamilyDescription"), "AMD EPYC");
-    EXPECT_EQ(textOf(instances[0], "MaxClockSpeed"), "3600");
-    EXPECT_EQ(textOf(instances[0], "CurrentClockSpeed"), "2596");
-    EXPECT_EQ(textOf(instances[0], "DataWidth"), "64");
-    EXPECT_EQ(textOf(instances[0], "Stepping"), "1");
-    EXPECT_EQ(textOf(instances[0], "CPUStatus"), "1");
-    EXPECT_EQ(textOf(instances[0], "NumberOfEnabledCores"), "1");
-    EXPECT_EQ(textOf(instances[0], "NumberOfEnabledThreads"), "1");
-    EXPECT_EQ(textOf(instances[0], "Manufacturer"), "AuthenticAMD");
-    EXPECT_EQ(textOf(instances[1], "DeviceID"), "CPU3");
-    EXPECT_EQ(textOf(instances[1], "Model"), longName);
-    EXPECT_EQ(textOf(instances[1], "OtherFamilyDescription"), longName.substr(0, 64));
-    EXPECT_EQ(textOf(instances[1], "CurrentClockSpeed"), "null");
-    EXPECT_EQ(textOf(instances[1], "Manufacturer"), "null");
-}
-
-TEST_F(ProvidersTest, processorsOfAMachineThatTellsNothing) {
-    EXPECT_THROW(ProcessorProvider(tree.paths()).enumerate(), ProviderError);
 }
 
 TEST_F(ProvidersTest, localFileSystems) {

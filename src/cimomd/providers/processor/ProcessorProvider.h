@@ -1,11 +1,11 @@
 #pragma once
 
-// The processors, one for each socket in use. Reads the processor topology in sysfs and
-// /proc/cpuinfo.
+// The processors, one for each socket in use. Reads the processor topology in sysfs, /proc/cpuinfo
+// and the firmware's tables.
 
 #include "providers/Provider.h"
 #include "system/SystemPaths.h"
-#include "system/processor/ProcessorPackage.h"
+#include "system/processor/InstalledProcessor.h"
 
 namespace cimomd {
 
@@ -18,7 +18,8 @@ class ProcessorProvider : public Provider {
     const char* className() const override { return kClassName; }
     std::unique_ptr<InstanceStream> enumerate() const override;
 
-    static ProvidedInstance publish(const std::string& hostName, const ProcessorPackage& package);
+    static ProvidedInstance publish(const std::string& hostName,
+                                    const InstalledProcessor& processor);
 
   private:
     SystemPaths paths;

@@ -7,6 +7,7 @@
 #include <map>
 
 #include "files/TextFields.h"
+#include "system/processor/ArmProcessorNames.h"
 
 namespace cimomd {
 namespace {
@@ -52,7 +53,15 @@ std::optional<std::string> modelOf(const Block& block) {
     const auto part = find(block, "CPU part");
     if (!implementer || !part)
         return std::nullopt;
+    if (const auto name = armPartName(*implementer, *part))
+        return std::string(*name);
     return fmt::format("ARM implementer {} part {}", *implementer, *part);
+}
+
+std::optional<std::string> vendorOf(const Block& block) {
+    const auto implementer = find(block, "CPU implementer");
+    const auto name = implementer ? armImplementerName(*implementer) : std::nullopt;
+    return name ? std::optional<std::string>(*name) : textOf(block, {"vendor_id"});
 }
 
 std::optional<std::uint16_t> widthOf(const Block& block) {
@@ -69,7 +78,7 @@ std::optional<std::uint16_t> widthOf(const Block& block) {
 CpuInfo infoOf(const Block& block, std::uint64_t processor) {
     CpuInfo info;
     info.processor = processor;
-    info.vendor = textOf(block, {"vendor_id"});
+    info.vendor = vendorOf(block);
     info.model = modelOf(block);
     info.stepping = textOf(block, {"stepping", "CPU revision", "revision"});
     info.currentMHz = megahertzOf(block);

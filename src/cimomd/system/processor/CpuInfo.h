@@ -24,7 +24,7 @@ struct CpuInfo {
 };
 
 /// The blocks that name a processor number, in the order of the text. A processor without a model
-/// name (ARM) is described by its implementer and part numbers.
+/// name (ARM) is named after its implementer and part numbers.
 std::vector<CpuInfo> parseCpuInfo(std::string_view text);
 
 }  // namespace cimomd
