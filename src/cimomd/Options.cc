@@ -77,6 +77,14 @@ void addPlaces(CLI::App& app, Options& options) {
            "cimomd may read")
         ->excludes(descriptor)
         ->check([&options](const std::string& text) { return parseHttp(text, options); });
+    app.add_option("--check", options.checkedFiles,
+                   "compile these MOF files together, as if they were added to the schema, tell "
+                   "all mistakes and end; files that declare the schema's qualifiers anew may be "
+                   "a schema of their own")
+        ->option_text("FILE...")
+        ->excludes("--fd")
+        ->excludes("--socket")
+        ->excludes("--http");
 }
 
 void addSources(CLI::App& app, Options& options) {

@@ -5,6 +5,7 @@
 #include <filesystem>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "protocol/HttpServer.h"
 #include "protocol/LoopbackAddress.h"
@@ -25,6 +26,8 @@ struct Options {
     std::optional<std::filesystem::path> mofDirectory;
     std::filesystem::path rootDirectory = "/";
     HttpLimits limits;
+    /// The MOF files to check instead of serving; empty for none.
+    std::vector<std::filesystem::path> checkedFiles;
 };
 
 /// The options, or the exit status when there is nothing to serve: 0 after --help and --version, 1

@@ -11,6 +11,8 @@
 #include <stdexcept>
 
 #include "Options.h"
+#include "mof/MofCheck.h"
+#include "mof/MofCompiler.h"
 #include "protocol/CimService.h"
 #include "providers/ProviderList.h"
 #include "repository/CurrentRepository.h"
@@ -123,6 +125,20 @@ void serve(const Options& options) {
         runDaemon(options, loop, loader, repository);
 }
 
+/// The exit status.
+int check(const Options& options) {
+    const Pegasus::CIMNamespaceName nameSpace(kNamespace);
+    ClassRepository shipped;
+    try {
+        MofCompiler(shipped, nameSpace).compileFile(options.schemaDirectory / kSchemaFile);
+        checkMofFiles(options.checkedFiles, shipped, nameSpace);
+        return 0;
+    } catch (const MofErrors& errors) {
+        std::fputs(fmt::format("{}\n", errors.what()).c_str(), stderr);
+        return 1;
+    }
+}
+
 }  // namespace
 }  // namespace cimomd
 
@@ -132,6 +148,8 @@ int main(int argc, char** argv) {
         return *parsed.exitStatus;
     try {
         std::signal(SIGPIPE, SIG_IGN);
+        if (!parsed.options.checkedFiles.empty())
+            return cimomd::check(parsed.options);
         cimomd::serve(parsed.options);
         return 0;
     } catch (const std::exception& error) {

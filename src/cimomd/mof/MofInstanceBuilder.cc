@@ -53,10 +53,10 @@ CIMValue absolute(const CIMValue& value, const CIMProperty& property, MofPositio
 }
 
 /// Fills in the values of one instance.
-class InstanceBuilder {
+class ValueFiller {
   public:
-    InstanceBuilder(const MofInstanceClass& instanceClass, bool isClassFaulty,
-                    const MofContext& context)
+    ValueFiller(const MofInstanceClass& instanceClass, bool isClassFaulty,
+                const MofContext& context)
         : instanceClass(instanceClass),
           isClassFaulty(isClassFaulty),
           context(context),
@@ -124,10 +124,10 @@ BuiltInstance buildInstance(const MofInstance& declaration, const MofInstanceCla
                             bool isClassFaulty, const MofContext& context) {
     qualifiersOf(declaration.qualifiers, kScopeClass | kScopeAssociation | kScopeIndication,
                  "an instance", context);
-    InstanceBuilder builder(instanceClass, isClassFaulty, context);
+    ValueFiller filler(instanceClass, isClassFaulty, context);
     for (const MofPropertyValue& value : declaration.values)
-        builder.set(value);
-    BuiltInstance out = builder.take(nameOf(declaration.className));
+        filler.set(value);
+    BuiltInstance out = filler.take(nameOf(declaration.className));
     out.isComplete = out.isComplete && declaration.isComplete;
     return out;
 }
