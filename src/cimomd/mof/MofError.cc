@@ -9,8 +9,11 @@ namespace {
 
 std::string linesOf(const std::vector<MofError>& errors, bool isCut) {
     std::string lines;
-    for (const MofError& error : errors)
-        lines += (lines.empty() ? "" : "\n") + std::string(error.what());
+    for (const MofError& error : errors) {
+        if (!lines.empty())
+            lines += '\n';
+        lines += error.what();
+    }
     if (isCut)
         lines += fmt::format("\nmore than {} mistakes, the rest is not told", errors.size());
     return lines;
