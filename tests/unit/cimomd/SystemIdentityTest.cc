@@ -16,7 +16,7 @@ TEST(FirmwareText, knowsPlaceholders) {
     for (const char* text :
          {"To be filled by O.E.M.", " default STRING ", "0000", "XXXXXX", "........", "", "  ",
           "00000000-0000-0000-0000-000000000000", "FFFFFFFF-FFFF-FFFF-ffff-ffffffffffff", "N/A",
-          "None", "0123456789", "INVALID"})
+          "None", "0123456789", "INVALID", "No Asset Information", "not available"})
         EXPECT_TRUE(isPlaceholder(text)) << text;
     for (const char* text : {"Dell Inc.", "5", "00001", "None of these", "4C4C4544-0042"})
         EXPECT_FALSE(isPlaceholder(text)) << text;

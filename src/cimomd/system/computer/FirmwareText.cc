@@ -9,7 +9,7 @@
 namespace cimomd {
 namespace {
 
-constexpr std::array<std::string_view, 17> kPlaceholders{"To be filled by O.E.M.",
+constexpr std::array<std::string_view, 19> kPlaceholders{"To be filled by O.E.M.",
                                                          "Default string",
                                                          "System Serial Number",
                                                          "System Product Name",
@@ -22,6 +22,8 @@ constexpr std::array<std::string_view, 17> kPlaceholders{"To be filled by O.E.M.
                                                          "Unknown",
                                                          "N/A",
                                                          "No Asset Tag",
+                                                         "No Asset Information",
+                                                         "Not Available",
                                                          "INVALID",
                                                          "0123456789",
                                                          "123456789",
