@@ -1,25 +1,23 @@
 """What the shipped scripts are to show of the recorded machines, read off the machines' files."""
 
+# On every machine.
+COMMON = [
+    "cachememory", "computersystem", "desktopmonitor", "dnssettingdata", "ethernetport", "ipprotocolendpoint",
+    "lanendpoint", "memory", "nexthopiproute", "operatingsystem",
+    "physicalmemory", "processor", "usbdevice", "videocontroller",
+]
 # The scripts with data: what a machine lacks has no file.
 SCRIPTS = {
-    "laptop": [
-        "battery", "bioselement", "card", "chassis", "computersystem", "desktopmonitor", "fan",
-        "memory", "numericsensor", "operatingsystem", "pcidevice", "physicalmemory", "slot",
-        "usbdevice", "videocontroller",
-    ],
-    "server": [
-        "bioselement", "card", "chassis", "computersystem", "desktopmonitor", "fan", "memory",
-        "numericsensor", "operatingsystem", "pcidevice", "physicalmemory", "slot", "usbdevice",
-        "videocontroller",
-    ],
-    "virtual": [
-        "bioselement", "chassis", "computersystem", "desktopmonitor", "memory", "operatingsystem",
-        "pcidevice", "physicalmemory", "usbdevice", "videocontroller",
-    ],
-    "arm": [
-        "computersystem", "desktopmonitor", "memory", "numericsensor", "operatingsystem",
-        "physicalmemory", "usbdevice", "videocontroller",
-    ],
+    "laptop": sorted(COMMON + [
+        "battery", "bioselement", "card", "chassis", "fan", "numericsensor", "pcidevice",
+        "slot", "wifiport",
+    ]),
+    "server": sorted(COMMON + [
+        "bioselement", "card", "chassis", "fan", "numericsensor",
+        "pcidevice", "slot", ]),
+    "virtual": sorted(COMMON + [
+        "bioselement", "chassis", "pcidevice", ]),
+    "arm": sorted(COMMON + ["numericsensor", "wifiport"]),
 }
 
 # Scripts of which some number with words has no value on that machine.
@@ -33,10 +31,6 @@ NAMELESS_NUMBERS = {
 # Some cells by machine, script and number of the row.
 ROWS = {
     "laptop": {
-        "computersystem": {1: {
-            "Host Name": "birch", "Manufacturer": "Nordwind Systems", "Model": "NX-14 Gen 2",
-            "Serial Number": "PF2A7K3Q", "UUID": "4b3c5acc-215e-11b2-a85c-e8d0fc1be7a1",
-        }},
         "battery": {1: {
             "Battery": "BAT0", "Manufacturer": "LGC", "Chemistry": "Lithium Polymer",
             "Capacity New mWh": "57020", "Capacity Now mWh": "51350", "Charge Percent": "87",
@@ -46,36 +40,62 @@ ROWS = {
             "Version": "N2HET47W (1.30 )", "Type": "UEFI",
             "Released": "20220814000000.000000+000", "ROM KB": "32768",
         }},
+        "cachememory": {
+            1: {"Cache Level": "1", "Holds": "Data", "Capacity KB": "48", "Ways": "12",
+                "Logical CPUs": "0,4"},
+            4: {"Cache Level": "3", "Holds": "Unified", "Capacity KB": "8192",
+                "Logical CPUs": "0-7"},
+        },
         "chassis": {1: {"Type": "Notebook", "Asset Tag": "IT-00417", "Has Lock": "false"}},
+        "computersystem": {1: {
+            "Host Name": "birch", "Manufacturer": "Nordwind Systems", "Model": "NX-14 Gen 2",
+            "Serial Number": "PF2A7K3Q", "UUID": "4b3c5acc-215e-11b2-a85c-e8d0fc1be7a1",
+        }},
         "desktopmonitor": {
             1: {"Connector": "card0-DP-2", "Model": "DELL U2719D", "Pixels Wide": "2560",
                 "Pixels High": "1440", "Diagonal Inches": "27.0", "Year Made": "2019",
                 "Week Made": "33"},
             2: {"Connector": "card0-eDP-1", "Diagonal Inches": "14.0"},
         },
+        "dnssettingdata": {1: {
+            "Name Servers": "192.168.178.1,fe80::cece:1eff:fe4b:1%wlp0s20f3",
+            "Domain": "home.example",
+        }},
         "memory": {1: {"Usable MB": "15738", "Installed MB": "16384", "Modules": "2",
                        "Modules Missing": "false"}},
+        "nexthopiproute": {1: {"IP Kind": "IPv4", "Destination": "0.0.0.0", "Prefix Length": "0",
+                               "Gateway": "192.168.178.1", "Interface": "wlp0s20f3",
+                               "Metric": "600"}},
         "physicalmemory": {
             1: {"Module": "ChannelA-DIMM0", "Capacity MB": "8192", "Type": "DDR4",
                 "Form Factor": "SODIMM", "Speed MHz": "3200", "Bits": "64"},
             2: {"Module": "ChannelB-DIMM0", "Serial Number": "18C7A4F2"},
         },
+        "processor": {1: {"Model": "11th Gen Intel(R) Core(TM) i5-1135G7 @ 2.40GHz",
+                          "Cores": "4", "Threads": "8", "Max Clock MHz": "4200"}},
         "usbdevice": {4: {"Port": "4-1", "Kind": "Mass Storage", "Product": "Ultra Flair",
                           "Speed Mbps": "5000"}},
         "videocontroller": {1: {"Manufacturer": "Intel Corporation", "Driver": "i915"}},
+        "wifiport": {1: {"Interface": "wlp0s20f3", "Factory Address": "A46BB64012C8",
+                         "Driver": "iwlwifi"}},
     },
     "server": {
-        "computersystem": {1: {"Host Name": "rack12-db1", "Model": "GR-740 Rack Server"}},
         "card": {
             1: {"Model": "0YWR7D", "Main Board": "true"},
             2: {"Model": "0RSR2B", "Location": "Riser 2", "Main Board": "false"},
         },
         "chassis": {1: {"Type": "Rack Mount Chassis", "Height Units": "2", "Power Cords": "2"}},
+        "computersystem": {1: {"Host Name": "rack12-db1", "Model": "GR-740 Rack Server"}},
+        "ethernetport": {3: {"Interface": "ens1f0np0", "MAC Addresses": "0C42A15E90D2",
+                             "Speed Mbps": "25000", "Full Duplex": "true", "MTU": "9000"}},
         "fan": {
             1: {"Fan": "nct6779 fan1", "Speed RPM": "5273", "Status": "OK"},
             2: {"Speed RPM": "210", "Status": "Degraded"},
             3: {"Fan": "nct6779 fan10", "Speed RPM": "0", "Status": "Stopped"},
         },
+        "ipprotocolendpoint": {2: {"Interface": "bond0.100", "IP Kind": "IPv4",
+                                   "Address": "10.20.0.11/22", "Subnet Mask": "255.255.252.0"}},
+        "lanendpoint": {1: {"Interface": "bond0", "Kind": "IEEE 802.3ad Link Aggregation"}},
         "memory": {1: {"Usable MB": "257676", "Installed MB": "262144", "Modules": "8"}},
         "numericsensor": {
             4: {"Sensor": "nct6779 CPUTIN", "Reading": "-62.0 C", "Status": "Error"},
@@ -87,8 +107,8 @@ ROWS = {
                      "In Use": "true", "Bus Address": "0000:3b:00.0"}},
     },
     "virtual": {
-        "computersystem": {1: {"Manufacturer": "", "Serial Number": ""}},
         "bioselement": {1: {"Manufacturer": "SeaBIOS", "Type": "BIOS"}},
+        "computersystem": {1: {"Manufacturer": "", "Serial Number": ""}},
         "physicalmemory": {1: {"Capacity MB": "4096", "Speed MHz": "0",
                                "Described By": "SMBIOS"}},
     },
@@ -96,7 +116,7 @@ ROWS = {
         "computersystem": {1: {"Model": "Raspberry Pi 4 Model B Rev 1.4",
                                "Serial Number": "10000000abcdef01"}},
         "memory": {1: {"Usable MB": "3793", "Installed MB": "0"}},
-        "physicalmemory": {1: {"Capacity MB": "3793", "Described By": "Kernel"}},
         "numericsensor": {1: {"Sensor": "cpu_thermal temp1", "Reading": "48.2 C"}},
+        "physicalmemory": {1: {"Capacity MB": "3793", "Described By": "Kernel"}},
     },
 }
