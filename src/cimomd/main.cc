@@ -78,9 +78,9 @@ void reload(const SchemaLoader& loader, CurrentRepository& repository) {
     ServiceManager::notifyReloading();
     try {
         repository.replace(loader.loadAll());
-        logLine(LogLevel::Info, "the classes have been loaded again");
+        logText(LogLevel::Info, "the classes have been loaded again");
     } catch (const std::exception& error) {
-        logLine(LogLevel::Error, fmt::format("the old classes stay: {}", error.what()));
+        logText(LogLevel::Error, fmt::format("the old classes stay: {}", error.what()));
     }
     ServiceManager::notify("READY=1");
 }
@@ -153,7 +153,7 @@ int main(int argc, char** argv) {
         cimomd::serve(parsed.options);
         return 0;
     } catch (const std::exception& error) {
-        cimomd::logLine(cimomd::LogLevel::Error, error.what());
+        cimomd::logText(cimomd::LogLevel::Error, error.what());
         return 1;
     }
 }

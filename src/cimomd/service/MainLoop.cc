@@ -26,9 +26,9 @@ void logPeer(int connection, const sockaddr_storage& address) {
     ucred peer{};
     socklen_t length = sizeof peer;
     if (address.ss_family != AF_UNIX) {
-        logLine(LogLevel::Info, "connection over HTTP from the loopback");
+        logText(LogLevel::Info, "connection over HTTP from the loopback");
     } else if (::getsockopt(connection, SOL_SOCKET, SO_PEERCRED, &peer, &length) == 0) {
-        logLine(LogLevel::Info,
+        logText(LogLevel::Info,
                 fmt::format("connection from pid {} uid {} gid {}", peer.pid, peer.uid, peer.gid));
     }
 }
@@ -88,7 +88,7 @@ void MainLoop::acceptFrom(int listeningSocket) {
                                          &length, SOCK_CLOEXEC | SOCK_NONBLOCK);
         if (connection < 0) {
             if (errno != EAGAIN && errno != ECONNABORTED && errno != EINTR) {
-                logLine(LogLevel::Warning, fmt::format("no connection: {}", std::strerror(errno)));
+                logText(LogLevel::Warning, fmt::format("no connection: {}", std::strerror(errno)));
                 acceptAgain = Clock::now() + kPauseAfterFailure;
             }
             return;

@@ -30,7 +30,7 @@ std::shared_ptr<const ClassRepository> SchemaLoader::loadWhatIsRight() const {
         for (const auto& file : ownFiles())
             compileOrLeaveOut(file, *classes);
     } catch (const std::filesystem::filesystem_error& error) {
-        logLine(LogLevel::Error, error.what());
+        logText(LogLevel::Error, error.what());
     }
     return classes;
 }
@@ -47,7 +47,7 @@ void SchemaLoader::compileOrLeaveOut(const std::filesystem::path& file,
     try {
         MofCompiler(classes, sources.nameSpace).compileFile(file);
     } catch (const std::exception& error) {
-        logLine(LogLevel::Error, fmt::format("left out: {}", error.what()));
+        logText(LogLevel::Error, fmt::format("left out: {}", error.what()));
     }
 }
 
