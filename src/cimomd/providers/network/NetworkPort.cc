@@ -19,7 +19,7 @@ constexpr std::uint64_t kInterfaceUp = 1;
 
 /// The driver knows best; sysfs tells whether the address in use is that one.
 Fact<std::string> permanentAddress(const NetworkInterface& interface, const LinkSettings& link) {
-    const Fact<std::string> known = addressDigits(link.permanentAddress);
+    Fact<std::string> known = addressDigits(link.permanentAddress);
     if (known || interface.addressIsPermanent != true)
         return known;
     return addressDigits(interface.address);

@@ -3,11 +3,11 @@
 // Internet addresses, of version 4 (RFC 791) and 6 (RFC 4291).
 
 #include <array>
-#include <compare>
 #include <cstdint>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <tuple>
 
 namespace cimomd {
 
@@ -35,7 +35,10 @@ class IpAddress {
     bool isLinkLocal() const;
     bool isMulticast() const;
 
-    auto operator<=>(const IpAddress&) const = default;
+    bool operator==(const IpAddress&) const = default;
+    bool operator<(const IpAddress& other) const {
+        return std::tie(family, bytes) < std::tie(other.family, other.bytes);
+    }
 
   private:
     IpAddress() = default;
