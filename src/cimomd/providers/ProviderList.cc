@@ -24,7 +24,14 @@
 #include "providers/processor/CacheMemoryProvider.h"
 #include "providers/processor/ProcessorProvider.h"
 #include "providers/software/OperatingSystemProvider.h"
+#include "providers/storage/CDROMDriveProvider.h"
+#include "providers/storage/DiskDriveProvider.h"
+#include "providers/storage/DiskPackageProvider.h"
+#include "providers/storage/DiskPartitionProvider.h"
 #include "providers/storage/LocalFileSystemProvider.h"
+#include "providers/storage/NFSProvider.h"
+#include "providers/storage/RemoteFileSystemProvider.h"
+#include "providers/storage/StorageVolumeProvider.h"
 
 namespace cimomd {
 
@@ -40,7 +47,14 @@ ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     providers.push_back(std::make_unique<OperatingSystemProvider>(paths, calls));
     providers.push_back(std::make_unique<ProcessorProvider>(paths));
     providers.push_back(std::make_unique<CacheMemoryProvider>(paths));
+    providers.push_back(std::make_unique<DiskDriveProvider>(paths));
+    providers.push_back(std::make_unique<DiskPackageProvider>(paths));
+    providers.push_back(std::make_unique<DiskPartitionProvider>(paths));
+    providers.push_back(std::make_unique<StorageVolumeProvider>(paths));
+    providers.push_back(std::make_unique<CDROMDriveProvider>(paths));
     providers.push_back(std::make_unique<LocalFileSystemProvider>(paths, calls));
+    providers.push_back(std::make_unique<NFSProvider>(paths, calls));
+    providers.push_back(std::make_unique<RemoteFileSystemProvider>(paths, calls));
     providers.push_back(std::make_unique<PciDeviceProvider>(paths));
     providers.push_back(std::make_unique<UsbDeviceProvider>(paths));
     providers.push_back(std::make_unique<VideoControllerProvider>(paths));

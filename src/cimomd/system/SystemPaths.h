@@ -44,6 +44,10 @@ class SystemPaths {
     std::filesystem::path resolverBehindStub() const {
         return below("run/systemd/resolve/resolv.conf");
     }
+    std::filesystem::path blockDevices() const { return below("sys/block"); }
+    std::filesystem::path blockDevicesAndPartitions() const { return below("sys/class/block"); }
+    std::filesystem::path udevRecords() const { return below("run/udev/data"); }
+    std::filesystem::path opticalDrives() const { return below("proc/sys/dev/cdrom/info"); }
     std::filesystem::path osRelease() const { return below("etc/os-release"); }
     std::filesystem::path vendorOsRelease() const { return below("usr/lib/os-release"); }
     std::filesystem::path machineId() const { return below("etc/machine-id"); }

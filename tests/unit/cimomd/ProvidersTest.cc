@@ -10,7 +10,6 @@
 #include "providers/CimTime.h"
 #include "providers/ProviderList.h"
 #include "providers/software/OperatingSystemProvider.h"
-#include "providers/storage/LocalFileSystemProvider.h"
 
 namespace cimomd {
 namespace {
@@ -21,13 +20,7 @@ class FixedSystemCalls : public SystemCalls {
   public:
     std::int64_t now() const override { return 1700000000; }
     int utcOffsetMinutes(std::int64_t time) const override { return time < 1690000000 ? 120 : 60; }
-    Fact<FileSystemSize> fileSystemSize(const std::string& mountPoint) const override {
-        if (mountPoint == "/")
-            return FileSystemSize{4096, 2621440, 1310720, 655360, 600000};
-        if (mountPoint == "/huge")
-            return FileSystemSize{std::uint64_t{1} << 32, std::uint64_t{1} << 40, 1, 0, 0};
-        return std::nullopt;
-    }
+    Fact<FileSystemSize> fileSystemSize(const std::string&) const override { return std::nullopt; }
     std::optional<std::string> machine() const override { return "aarch64"; }
 };
 
@@ -111,41 +104,6 @@ TEST(OperatingSystemProvider, knowsTheTypesOfDistributions) {
     EXPECT_EQ(OperatingSystemProvider::osTypeOf("debian", std::nullopt), std::nullopt);
 }
 
-TEST_F(ProvidersTest, localFileSystems) {
-    tree.file("proc/self/mountinfo",
-              "1 0 8:1 / / rw - ext4 /dev/sda1 rw\n"
-              "2 1 8:2 / /huge rw - btrfs /dev/sdb rw\n"
-              "3 1 11:0 / /media/my\\040cd ro - iso9660 /dev/sr0 ro\n"
-              "4 1 0:40 / /tmp rw - tmpfs tmpfs rw\n"
-              "5 1 0:41 / /home rw - nfs4 server:/home rw\n");
-    const auto instances = all(LocalFileSystemProvider(tree.paths(), calls).enumerate());
-    ASSERT_EQ(instances.size(), 4U);
-    EXPECT_EQ(textOf(instances[0], "Name"), "/");
-    EXPECT_EQ(textOf(instances[0], "Device"), "/dev/sda1");
-    EXPECT_EQ(textOf(instances[0], "BlockSize"), "4096");
-    EXPECT_EQ(textOf(instances[0], "FileSystemSize"), "10737418240");
-    EXPECT_EQ(textOf(instances[0], "FileSystemSizeMB"), "10240");
-    EXPECT_EQ(textOf(instances[0], "AvailableSpaceMB"), "5120");
-    EXPECT_EQ(textOf(instances[0], "TotalInodes"), "655360");
-    EXPECT_EQ(textOf(instances[0], "FreeInodes"), "600000");
-    EXPECT_EQ(textOf(instances[0], "ReadOnly"), "FALSE");
-    EXPECT_EQ(textOf(instances[0], "PersistenceType"), "2");
-    // 2^72 bytes do not fit 64 bits, 4 GiB do.
-    EXPECT_EQ(textOf(instances[1], "FileSystemSize"), "null");
-    EXPECT_EQ(textOf(instances[1], "FileSystemSizeMB"), "null");
-    EXPECT_EQ(textOf(instances[1], "AvailableSpaceMB"), "4096");
-    EXPECT_EQ(textOf(instances[1], "TotalInodes"), "null");
-    EXPECT_EQ(textOf(instances[2], "Name"), "/media/my cd");
-    EXPECT_EQ(textOf(instances[2], "ReadOnly"), "TRUE");
-    EXPECT_EQ(textOf(instances[2], "PersistenceType"), "4");
-    EXPECT_EQ(textOf(instances[2], "FileSystemSize"), "null");
-    EXPECT_EQ(textOf(instances[3], "PersistenceType"), "3");
-}
-
-TEST_F(ProvidersTest, fileSystemsOfAMachineWithoutAMountTable) {
-    EXPECT_THROW(LocalFileSystemProvider(tree.paths(), calls).enumerate(), ProviderError);
-}
-
 TEST(CimTime, writesLocalTimeWithItsOffset) {
     EXPECT_EQ(utf8Of(cimTimeOf(0, 0)->toString()), "19700101000000.000000+000");
     EXPECT_EQ(utf8Of(cimTimeOf(0, -90)->toString()), "19691231223000.000000-090");
@@ -158,7 +116,14 @@ TEST(CimTime, writesLocalTimeWithItsOffset) {
 
 TEST_F(ProvidersTest, serveWhatTheSchemaDeclares) {
     tree.file("proc/cpuinfo", "processor: 0\n")
-        .file("proc/self/mountinfo", "1 0 8:1 / / rw - ext4 /dev/sda1 rw\n")
+        .file("proc/self/mountinfo",
+              "1 0 8:1 / / rw - ext4 /dev/sda1 rw\n"
+              "2 1 0:41 / /home rw - nfs4 nas:/home rw\n"
+              "3 1 0:42 / /win rw - cifs //files/win rw\n")
+        .directory("sys/block/sda")
+        .directory("sys/block/sr0")
+        .directory("sys/block/dm-0/dm")
+        .file("sys/class/block/sda1/partition", "1\n")
         .file("sys/class/net/eth0/type", "1\n")
         .directory("sys/class/net/eth0/device");
     for (const auto& provider : makeProviders(tree.paths(), calls)) {

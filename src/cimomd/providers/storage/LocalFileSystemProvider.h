@@ -1,9 +1,6 @@
 #pragma once
 
-// The mounted file systems on devices of this machine, each once. Reads the mount table; sizes come
-// from statvfs, which local file systems answer at once.
-
-#include <optional>
+// The mounted file systems on devices of this machine, each once.
 
 #include "providers/Provider.h"
 #include "system/SystemCalls.h"
@@ -24,7 +21,7 @@ class LocalFileSystemProvider : public Provider {
     std::unique_ptr<InstanceStream> enumerate() const override;
 
     static ProvidedInstance publish(const std::string& hostName, const Mount& mount,
-                                    const std::optional<FileSystemSize>& size);
+                                    const Fact<FileSystemSize>& size);
 
   private:
     SystemPaths paths;

@@ -6,9 +6,14 @@
 #include <string_view>
 #include <vector>
 
+#include "system/storage/MountOptions.h"
+
 namespace cimomd {
 
 struct Mount {
+    /// What tells the mount from others, and the one whose directory it is mounted on.
+    std::string id;
+    std::string parentId;
     /// major:minor of the file system; the same for all mounts of one file system.
     std::string device;
     /// The directory of the file system that is mounted; "/" unless this is a bind mount.
@@ -17,14 +22,11 @@ struct Mount {
     std::string type;
     std::string source;
     bool readOnly = false;
+    /// Those of the file system, as opposed to those of this mount.
+    MountOptions fileSystemOptions;
 };
 
 /// All lines that are complete, in their order; paths with their escapes resolved.
 std::vector<Mount> parseMountInfo(std::string_view text);
-
-/// The mounts of local file systems, one for each file system: the first that is no bind mount,
-/// else the first. What another mount hides, kernel file systems, layers, network and FUSE file
-/// systems are left out, so are the temporary ones in the system's own directories.
-std::vector<Mount> localFileSystems(const std::vector<Mount>& mounts);
 
 }  // namespace cimomd
