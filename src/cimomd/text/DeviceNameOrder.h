@@ -6,9 +6,8 @@
 
 namespace cimomd {
 
-/// Whether the device called `a` comes before the one called `b`: names are compared piece by
-/// piece, runs of digits as numbers, other runs with the shorter one first. Names that differ are
-/// never equal.
+/// Whether the device called `a` comes before the one called `b`: the one with fewer characters
+/// before its first digit, else by the numbers in the names. The order is total.
 bool deviceNameLess(std::string_view a, std::string_view b);
 
 }  // namespace cimomd
