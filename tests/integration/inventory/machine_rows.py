@@ -2,21 +2,23 @@
 
 # On every machine.
 COMMON = [
-    "cachememory", "computersystem", "desktopmonitor", "dnssettingdata", "ethernetport", "ipprotocolendpoint",
-    "lanendpoint", "memory", "nexthopiproute", "operatingsystem",
+    "cachememory", "computersystem", "desktopmonitor", "diskdrive", "diskpackage",
+    "diskpartition", "dnssettingdata", "ethernetport", "ipprotocolendpoint",
+    "lanendpoint", "localfilesystem", "memory", "nexthopiproute", "operatingsystem",
     "physicalmemory", "processor", "usbdevice", "videocontroller",
 ]
 # The scripts with data: what a machine lacks has no file.
 SCRIPTS = {
     "laptop": sorted(COMMON + [
         "battery", "bioselement", "card", "chassis", "fan", "numericsensor", "pcidevice",
-        "slot", "wifiport",
+        "remotefilesystem", "slot", "storagevolume", "wifiport",
     ]),
     "server": sorted(COMMON + [
-        "bioselement", "card", "chassis", "fan", "numericsensor",
-        "pcidevice", "slot", ]),
+        "bioselement", "card", "cdromdrive", "chassis", "fan", "nfs", "numericsensor",
+        "pcidevice", "remotefilesystem", "slot", "storagevolume", ]),
     "virtual": sorted(COMMON + [
-        "bioselement", "chassis", "pcidevice", ]),
+        "bioselement", "cdromdrive", "chassis", "pcidevice", "remotefilesystem",
+        ]),
     "arm": sorted(COMMON + ["numericsensor", "wifiport"]),
 }
 
@@ -24,7 +26,7 @@ SCRIPTS = {
 NAMELESS_NUMBERS = {
     "laptop": ["operatingsystem"],
     "server": ["operatingsystem"],
-    "virtual": ["operatingsystem"],
+    "virtual": ["diskdrive", "operatingsystem"],
     "arm": ["operatingsystem", "physicalmemory"],
 }
 
@@ -57,10 +59,21 @@ ROWS = {
                 "Week Made": "33"},
             2: {"Connector": "card0-eDP-1", "Diagonal Inches": "14.0"},
         },
+        "diskdrive": {
+            1: {"Device": "/dev/sda", "Abilities":
+                "Random Access,Supports Writing,Supports Removeable Media"},
+            2: {"Device": "/dev/nvme0n1", "Model": "Samsung SSD 980 PRO 1TB",
+                "Serial Number": "S5P2NG0R704512X", "Type": "Solid State Drive",
+                "Capacity MB": "1024209"},
+        },
         "dnssettingdata": {1: {
             "Name Servers": "192.168.178.1,fe80::cece:1eff:fe4b:1%wlp0s20f3",
             "Domain": "home.example",
         }},
+        "localfilesystem": {
+            1: {"Mount Point": "/", "Type": "ext4", "Total MB": "939488", "Free MB": "703125"},
+            5: {"Mount Point": "/media/mia/USB STICK", "Device": "/dev/sda1"},
+        },
         "memory": {1: {"Usable MB": "15738", "Installed MB": "16384", "Modules": "2",
                        "Modules Missing": "false"}},
         "nexthopiproute": {1: {"IP Kind": "IPv4", "Destination": "0.0.0.0", "Prefix Length": "0",
@@ -73,6 +86,8 @@ ROWS = {
         },
         "processor": {1: {"Model": "11th Gen Intel(R) Core(TM) i5-1135G7 @ 2.40GHz",
                           "Cores": "4", "Threads": "8", "Max Clock MHz": "4200"}},
+        "storagevolume": {2: {"Device": "/dev/mapper/birch--vg-root", "Type": "LVM",
+                              "Capacity MB": "958464", "Made Of": "dm-0"}},
         "usbdevice": {4: {"Port": "4-1", "Kind": "Mass Storage", "Product": "Ultra Flair",
                           "Speed Mbps": "5000"}},
         "videocontroller": {1: {"Manufacturer": "Intel Corporation", "Driver": "i915"}},
@@ -84,8 +99,12 @@ ROWS = {
             1: {"Model": "0YWR7D", "Main Board": "true"},
             2: {"Model": "0RSR2B", "Location": "Riser 2", "Main Board": "false"},
         },
+        "cdromdrive": {1: {"Device": "/dev/sr0", "Model": "DVDRAM GUD1N", "CD Speed": "24",
+                           "Writes DVD R": "true"}},
         "chassis": {1: {"Type": "Rack Mount Chassis", "Height Units": "2", "Power Cords": "2"}},
         "computersystem": {1: {"Host Name": "rack12-db1", "Model": "GR-740 Rack Server"}},
+        "diskdrive": {1: {"Device": "/dev/sda", "Serial Number": "ZC1A2B30",
+                          "Type": "Hard Disk Drive", "Capacity MB": "4000787"}},
         "ethernetport": {3: {"Interface": "ens1f0np0", "MAC Addresses": "0C42A15E90D2",
                              "Speed Mbps": "25000", "Full Duplex": "true", "MTU": "9000"}},
         "fan": {
@@ -97,18 +116,26 @@ ROWS = {
                                    "Address": "10.20.0.11/22", "Subnet Mask": "255.255.252.0"}},
         "lanendpoint": {1: {"Interface": "bond0", "Kind": "IEEE 802.3ad Link Aggregation"}},
         "memory": {1: {"Usable MB": "257676", "Installed MB": "262144", "Modules": "8"}},
+        "nfs": {1: {"Mount Point": "/home", "Mounted From": "nas.example.org:/export/home",
+                    "Total MB": "8388608", "Free MB": "4194304"}},
         "numericsensor": {
             4: {"Sensor": "nct6779 CPUTIN", "Reading": "-62.0 C", "Status": "Error"},
             10: {"Sensor": "pfe1100 vin", "Measures": "Voltage", "Reading": "230.250 V"},
         },
         "physicalmemory": {1: {"Capacity MB": "32768", "Speed MHz": "2666",
                                "Max Speed MHz": "2933", "Bits With ECC": "72", "Bits": "64"}},
+        "remotefilesystem": {1: {"Mounted From": "//files.example.org/public", "Type": "cifs",
+                                 "Total MB": "10240"}},
         "slot": {1: {"Slot": "PCIe Slot 1", "Type": "PCI Express 3 x8", "Lanes": "8",
                      "In Use": "true", "Bus Address": "0000:3b:00.0"}},
+        "storagevolume": {2: {"Device": "/dev/md1", "Capacity MB": "7628842",
+                              "RAID Kind": "raid10", "Missing Disks": "1",
+                              "Made Of": "sda2,sdb2,sdc2,sdd2"}},
     },
     "virtual": {
         "bioselement": {1: {"Manufacturer": "SeaBIOS", "Type": "BIOS"}},
         "computersystem": {1: {"Manufacturer": "", "Serial Number": ""}},
+        "diskpartition": {3: {"Device": "/dev/vda5", "Type": "Logical", "Capacity MB": "2047"}},
         "physicalmemory": {1: {"Capacity MB": "4096", "Speed MHz": "0",
                                "Described By": "SMBIOS"}},
     },
