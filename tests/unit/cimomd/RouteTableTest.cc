@@ -42,6 +42,14 @@ TEST(RouteTable, namesNoInterfaceForRoutesThatRefuse) {
     EXPECT_FALSE(routes[0].interfaceName.has_value());
 }
 
+TEST(RouteTable, namesNoInterfaceForBlackHoles) {
+    const auto routes =
+        parseIpv4Routes(v4("*\t00001FAC\t00000000\t0001\t0\t0\t0\t0000FFFF\t0\t0\t0"));
+    ASSERT_EQ(routes.size(), 1U);
+    EXPECT_EQ(routes[0].destination.text(), "172.31.0.0");
+    EXPECT_FALSE(routes[0].interfaceName.has_value());
+}
+
 TEST(RouteTable, dropsIpv4LinesThatMakeNoSense) {
     for (const char* row : {
              "", "eth0",
@@ -81,6 +89,13 @@ TEST(RouteTable, readsIpv6) {
     EXPECT_EQ(routes[1].metric, 1024U);
     EXPECT_EQ(routes[2].prefixLength, 48);
     EXPECT_FALSE(routes[2].interfaceName.has_value());
+}
+
+TEST(RouteTable, listsIpv6RoutesThatRefuseThoughTheyAreNeverUp) {
+    const auto routes = parseIpv6Routes(v6(kNetwork, "30", kNothing, "00000400", "00200200", "lo"));
+    ASSERT_EQ(routes.size(), 1U);
+    EXPECT_EQ(routes[0].destination.text(), "2001:db8:1::");
+    EXPECT_FALSE(routes[0].interfaceName.has_value());
 }
 
 TEST(RouteTable, leavesOutWhatTheKernelKeepsForItself) {

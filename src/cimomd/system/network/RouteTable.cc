@@ -54,8 +54,13 @@ std::optional<IpAddress> gatewayOf(const std::optional<IpAddress>& written, std:
     return (flags & RTF_GATEWAY) != 0 ? written : std::nullopt;
 }
 
+/// An IPv4 route that drops packets silently has no flag of its own, only this name.
+constexpr std::string_view kNoInterface = "*";
+
 std::optional<std::string> interfaceOf(std::string_view name, std::uint32_t flags) {
-    return (flags & RTF_REJECT) != 0 ? std::nullopt : std::optional<std::string>(name);
+    if ((flags & RTF_REJECT) != 0 || name == kNoInterface)
+        return std::nullopt;
+    return std::string(name);
 }
 
 std::optional<Route> ipv4Route(std::string_view line) {
@@ -97,7 +102,8 @@ std::optional<Route> ipv6Route(std::string_view line) {
         return std::nullopt;
     Route route{*destination, static_cast<std::uint8_t>(*prefixLength), gatewayOf(gateway, *flags),
                 interfaceOf(fields[9], *flags), *metric};
-    if ((*flags & RTF_UP) == 0 || isKernelsOwn(route, *flags))
+    // Routes that refuse packets are never marked as being up.
+    if ((*flags & (RTF_UP | RTF_REJECT)) == 0 || isKernelsOwn(route, *flags))
         return std::nullopt;
     return route;
 }
