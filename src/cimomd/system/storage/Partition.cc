@@ -109,6 +109,7 @@ Fact<std::vector<Partition>> readPartitions(const SystemPaths& paths) {
         std::vector<Found> all = readAll(paths, entries);
         tellKinds(paths, all);
         std::vector<Partition> out;
+        out.reserve(all.size());
         for (Found& found : all)
             out.push_back(std::move(found.partition));
         return std::optional(std::move(out));
