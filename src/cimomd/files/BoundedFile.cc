@@ -6,6 +6,8 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <functional>
+#include <limits>
 
 namespace cimomd {
 namespace {
@@ -66,9 +68,21 @@ FileStatus readAll(int descriptor, std::size_t maxBytes, std::string& bytes) {
     }
 }
 
-}  // namespace
+FileStatus readPart(int descriptor, std::uint64_t offset, std::size_t maxBytes,
+                    std::string& bytes) {
+    if (offset > static_cast<std::uint64_t>(std::numeric_limits<off_t>::max()))
+        return FileStatus::Read;
+    // Not pread: kernel files need not know places, and are only read from their beginning.
+    if (offset > 0 && ::lseek(descriptor, static_cast<off_t>(offset), SEEK_SET) < 0)
+        return failureOf(errno);
+    const FileStatus status = readAll(descriptor, maxBytes, bytes);
+    bytes.resize(std::min(bytes.size(), maxBytes));
+    return status == FileStatus::TooLong ? FileStatus::Read : status;
+}
 
-FileContent readBoundedFile(const std::filesystem::path& path, std::size_t maxBytes) {
+using ReadDescriptor = std::function<FileStatus(int descriptor, std::string& bytes)>;
+
+FileContent readWith(const std::filesystem::path& path, const ReadDescriptor& readDescriptor) {
     FileContent content;
     const Descriptor descriptor(path);
     if (descriptor.get() < 0) {
@@ -79,10 +93,25 @@ FileContent readBoundedFile(const std::filesystem::path& path, std::size_t maxBy
         content.status = FileStatus::Unreadable;
         return content;
     }
-    content.status = readAll(descriptor.get(), maxBytes, content.bytes);
+    content.status = readDescriptor(descriptor.get(), content.bytes);
     if (content.status != FileStatus::Read)
         content.bytes.clear();
     return content;
+}
+
+}  // namespace
+
+FileContent readBoundedFile(const std::filesystem::path& path, std::size_t maxBytes) {
+    return readWith(path, [maxBytes](int descriptor, std::string& bytes) {
+        return readAll(descriptor, maxBytes, bytes);
+    });
+}
+
+FileContent readFilePart(const std::filesystem::path& path, std::uint64_t offset,
+                         std::size_t maxBytes) {
+    return readWith(path, [=](int descriptor, std::string& bytes) {
+        return readPart(descriptor, offset, maxBytes, bytes);
+    });
 }
 
 }  // namespace cimomd

@@ -4,6 +4,7 @@
 // directory that others may write could lead anywhere.
 
 #include <cstddef>
+#include <cstdint>
 #include <filesystem>
 #include <string>
 
@@ -21,5 +22,10 @@ struct FileContent {
 /// regular file, or an error while reading. Absent: nothing has this name, also when it vanished
 /// meanwhile.
 FileContent readBoundedFile(const std::filesystem::path& path, std::size_t maxBytes);
+
+/// The bytes of a regular file from `offset` on, at most `maxBytes` of them and none behind its
+/// end; `status` is never TooLong.
+FileContent readFilePart(const std::filesystem::path& path, std::uint64_t offset,
+                         std::size_t maxBytes);
 
 }  // namespace cimomd

@@ -45,6 +45,18 @@ std::vector<std::string_view> fieldsOf(std::string_view line) {
     return fields;
 }
 
+std::vector<std::string_view> partsOf(std::string_view text, char separator) {
+    std::vector<std::string_view> parts;
+    std::size_t start = 0;
+    for (std::size_t end = text.find(separator); end != std::string_view::npos;
+         end = text.find(separator, start)) {
+        parts.push_back(text.substr(start, end - start));
+        start = end + 1;
+    }
+    parts.push_back(text.substr(start));
+    return parts;
+}
+
 std::optional<KeyValue> keyValueOf(std::string_view line, char separator) {
     const std::size_t place = line.find(separator);
     if (place == std::string_view::npos)

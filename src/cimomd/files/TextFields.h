@@ -16,6 +16,9 @@ std::vector<std::string_view> linesOf(std::string_view text);
 /// The parts between runs of blanks and tabs.
 std::vector<std::string_view> fieldsOf(std::string_view line);
 
+/// Everything between separators, empty parts too; one part when there is no separator.
+std::vector<std::string_view> partsOf(std::string_view text, char separator);
+
 /// A line `key<separator>value`, blanks around both dropped.
 struct KeyValue {
     std::string_view key;

@@ -2,13 +2,10 @@
 
 #include <algorithm>
 
-#include "files/BoundedFile.h"
 #include "files/TextFields.h"
 #include "text/Utf8.h"
 
 namespace cimomd {
-
-namespace {
 
 Absence absenceOf(FileStatus status) {
     switch (status) {
@@ -24,10 +21,10 @@ Absence absenceOf(FileStatus status) {
 Absence absenceOf(const std::error_code& error) {
     if (error == std::errc::permission_denied || error == std::errc::operation_not_permitted)
         return Absence::NeedsRoot;
-    return error == std::errc::no_such_file_or_directory ? Absence::Absent : Absence::Unreadable;
+    const bool isNowhere =
+        error == std::errc::no_such_file_or_directory || error == std::errc::not_a_directory;
+    return isNowhere ? Absence::Absent : Absence::Unreadable;
 }
-
-}  // namespace
 
 Fact<std::string> readText(const std::filesystem::path& path, std::size_t maxBytes) {
     FileContent content = readBoundedFile(path, maxBytes);

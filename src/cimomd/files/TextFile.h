@@ -6,14 +6,20 @@
 #include <filesystem>
 #include <optional>
 #include <string>
+#include <system_error>
 #include <vector>
 
+#include "files/BoundedFile.h"
 #include "system/Fact.h"
 
 namespace cimomd {
 
 inline constexpr std::size_t kMaxSmallFileBytes = std::size_t{64} << 10;
 inline constexpr std::size_t kMaxListedEntries = 100000;
+
+/// Why there is no value when a file could not be read, or a system call failed.
+Absence absenceOf(FileStatus status);
+Absence absenceOf(const std::error_code& error);
 
 /// The file's text, at most `maxBytes` long; nothing when it cannot be read whole.
 Fact<std::string> readText(const std::filesystem::path& path,

@@ -37,6 +37,7 @@ class Fact {
     bool has_value() const { return found.has_value(); }
     explicit operator bool() const { return found.has_value(); }
     const T& operator*() const { return *found; }
+    T& operator*() { return *found; }
     const T* operator->() const { return &*found; }
     /// Raises std::bad_optional_access when there is none.
     const T& value() const { return found.value(); }

@@ -28,6 +28,19 @@ TEST(BoundedFile, readsAFileOfSeveralPiecesWhole) {
     EXPECT_EQ(readBoundedFile(tree.root / "long", text.size()).bytes, text);
 }
 
+TEST(BoundedFile, readsAPart) {
+    RecordedTree tree;
+    tree.file("five", "12345");
+    EXPECT_EQ(readFilePart(tree.root / "five", 0, 3).bytes, "123");
+    EXPECT_EQ(readFilePart(tree.root / "five", 1, 2).bytes, "23");
+    EXPECT_EQ(readFilePart(tree.root / "five", 3, 9).bytes, "45");
+    EXPECT_EQ(readFilePart(tree.root / "five", 5, 9).bytes, "");
+    EXPECT_EQ(readFilePart(tree.root / "five", 900, 9).bytes, "");
+    EXPECT_EQ(readFilePart(tree.root / "five", UINT64_MAX, 9).bytes, "");
+    EXPECT_EQ(readFilePart(tree.root / "five", UINT64_MAX, 9).status, FileStatus::Read);
+    EXPECT_EQ(readFilePart(tree.root / "none", 0, 9).status, FileStatus::Absent);
+}
+
 TEST(BoundedFile, tellsAbsentFromUnreadable) {
     RecordedTree tree;
     tree.directory("directory").file("file", "");

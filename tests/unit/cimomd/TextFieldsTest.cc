@@ -18,5 +18,14 @@ TEST(TextFields, readsHexadecimalNumbersBehindTheirMark) {
         EXPECT_FALSE(parseHexadecimal(text).has_value()) << text;
 }
 
+using Parts = std::vector<std::string_view>;
+
+TEST(TextFields, keepsEmptyParts) {
+    EXPECT_EQ(partsOf("a::b", ':'), (Parts{"a", "", "b"}));
+    EXPECT_EQ(partsOf(":a:", ':'), (Parts{"", "a", ""}));
+    EXPECT_EQ(partsOf("a", ':'), Parts{"a"});
+    EXPECT_EQ(partsOf("", ':'), Parts{""});
+}
+
 }  // namespace
 }  // namespace cimomd
