@@ -41,7 +41,7 @@ need_packages() {
 BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev libcli11-dev
     libfmt-dev libmnl-dev)
 # shellcheck disable=SC2034
-TEST_PACKAGES=(libgtest-dev libgmock-dev python3 mariadb-server postgresql-15 shellcheck
+TEST_PACKAGES=(libgtest-dev libgmock-dev rpm python3 mariadb-server postgresql-15 shellcheck
     sblim-wbemcli libxml2-utils systemd)
 
 # Configures a preset unless that is done, and builds it. What a quiet build prints is shown when

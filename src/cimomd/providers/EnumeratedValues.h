@@ -14,17 +14,21 @@ inline constexpr std::uint16_t kOperationalOk = 2;
 inline constexpr std::uint16_t kOperationalDegraded = 3;
 inline constexpr std::uint16_t kOperationalError = 6;
 inline constexpr std::uint16_t kOperationalStarting = 8;
+inline constexpr std::uint16_t kOperationalStopping = 9;
 inline constexpr std::uint16_t kOperationalStopped = 10;
 inline constexpr std::uint16_t kOperationalInService = 11;
 inline constexpr std::uint16_t kOperationalNoContact = 12;
 inline constexpr std::uint16_t kOperationalDormant = 15;
+inline constexpr std::uint16_t kOperationalCompleted = 17;
 
 // CIM_EnabledLogicalElement.EnabledState
 inline constexpr std::uint16_t kEnabled = 2;
 inline constexpr std::uint16_t kDisabled = 3;
+inline constexpr std::uint16_t kShuttingDown = 4;
 inline constexpr std::uint16_t kStateNotApplicable = 5;
 inline constexpr std::uint16_t kEnabledButOffline = 6;
 inline constexpr std::uint16_t kQuiesce = 9;
+inline constexpr std::uint16_t kStarting = 10;
 
 // CIM_ComputerSystem.Dedicated
 inline constexpr std::uint16_t kNotDedicated = 0;

@@ -23,11 +23,15 @@
 #include "providers/network/WiFiPortProvider.h"
 #include "providers/processor/CacheMemoryProvider.h"
 #include "providers/processor/ProcessorProvider.h"
+#include "providers/software/AccountProvider.h"
+#include "providers/software/GroupProvider.h"
 #include "providers/software/OperatingSystemProvider.h"
 #include "providers/storage/CDROMDriveProvider.h"
 #include "providers/storage/DiskDriveProvider.h"
 #include "providers/storage/DiskPackageProvider.h"
 #include "providers/storage/DiskPartitionProvider.h"
+#include "providers/software/SoftwareIdentityProvider.h"
+#include "providers/software/UnixProcessProvider.h"
 #include "providers/storage/LocalFileSystemProvider.h"
 #include "providers/storage/NFSProvider.h"
 #include "providers/storage/RemoteFileSystemProvider.h"
@@ -68,6 +72,10 @@ ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     providers.push_back(std::make_unique<IpProtocolEndpointProvider>(paths, calls));
     providers.push_back(std::make_unique<NextHopIpRouteProvider>(paths));
     providers.push_back(std::make_unique<DnsSettingDataProvider>(paths));
+    providers.push_back(std::make_unique<SoftwareIdentityProvider>(paths, calls));
+    providers.push_back(std::make_unique<UnixProcessProvider>(paths, calls));
+    providers.push_back(std::make_unique<AccountProvider>(paths, calls));
+    providers.push_back(std::make_unique<GroupProvider>(paths));
     providers.push_back(std::make_unique<MissingValueProvider>(providers));
     return providers;
 }

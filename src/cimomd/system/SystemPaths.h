@@ -52,6 +52,15 @@ class SystemPaths {
     std::filesystem::path vendorOsRelease() const { return below("usr/lib/os-release"); }
     std::filesystem::path machineId() const { return below("etc/machine-id"); }
     std::filesystem::path sessions() const { return below("run/utmp"); }
+    std::filesystem::path systemBus() const { return below("run/dbus/system_bus_socket"); }
+    std::filesystem::path accounts() const { return below("etc/passwd"); }
+    std::filesystem::path groups() const { return below("etc/group"); }
+    std::filesystem::path lastLogins() const { return below("var/log/lastlog"); }
+    std::filesystem::path localTime() const { return below("etc/localtime"); }
+    std::filesystem::path timeZoneName() const { return below("etc/timezone"); }
+    std::filesystem::path debianPackages() const { return below("var/lib/dpkg"); }
+    std::filesystem::path rpmPackages() const { return below("var/lib/rpm"); }
+    std::filesystem::path vendorRpmPackages() const { return below("usr/lib/sysimage/rpm"); }
     /// Only in recorded trees: what statvfs said when the tree was recorded.
     std::filesystem::path recordedFileSystemSizes() const { return below("statvfs"); }
     /// Only in recorded trees: the addresses of the interfaces, as netlink told them.

@@ -2,19 +2,19 @@
 
 #include <algorithm>
 #include <array>
+#include <limits>
 
-#include "files/TextFields.h"
 #include "files/TextFile.h"
 #include "providers/CimTime.h"
 #include "providers/EnumeratedValues.h"
 #include "providers/InstanceBuilder.h"
 #include "providers/RecordStream.h"
 #include "system/computer/SystemIdentity.h"
+#include "system/software/ProcessTable.h"
 
 namespace cimomd {
 namespace {
 
-constexpr std::size_t kMaxTableBytes = std::size_t{4} << 20;
 constexpr std::size_t kVersionLength = 64;
 
 struct Distribution {
@@ -45,26 +45,53 @@ bool is64Bit(std::string_view machine) {
     return std::find(kMachines64.begin(), kMachines64.end(), machine) != kMachines64.end();
 }
 
-bool isProcessDirectory(const std::string& name) {
-    return parseUnsigned(name).has_value();
-}
-
-std::optional<std::uint32_t> countProcesses(const std::filesystem::path& directory) {
-    const auto names = listDirectory(directory);
-    if (!names)
-        return std::nullopt;
-    return static_cast<std::uint32_t>(
-        std::count_if(names->begin(), names->end(), isProcessDirectory));
-}
-
-std::optional<Pegasus::CIMDateTime> bootTimeOf(const OperatingSystemFacts& facts) {
-    return facts.bootTime ? cimTimeOf(*facts.bootTime, facts.utcOffsetAtBootMinutes) : std::nullopt;
+Fact<Pegasus::CIMDateTime> bootTimeOf(const OperatingSystemFacts& facts) {
+    return facts.bootTime.then(
+        [&](std::int64_t time) { return cimTimeOf(time, facts.utcOffsetAtBootMinutes); });
 }
 
 /// The readers' numbers have fixed widths, the client library's types others of the same size.
 template <typename To, typename From>
-std::optional<To> as(const std::optional<From>& value) {
-    return value ? std::optional<To>(static_cast<To>(*value)) : std::nullopt;
+Fact<To> as(const Fact<From>& value) {
+    return value.then([](From number) { return std::optional(static_cast<To>(number)); });
+}
+
+Fact<std::uint64_t> sumOf(const Fact<std::uint64_t>& a, const Fact<std::uint64_t>& b) {
+    if (!b)
+        return b.reason();
+    return a.then([&](std::uint64_t size) {
+        return size > std::numeric_limits<std::uint64_t>::max() - *b ? std::nullopt
+                                                                     : std::optional(size + *b);
+    });
+}
+
+Fact<Pegasus::Uint32> inMB(const Fact<std::uint64_t>& sizeKB) {
+    constexpr std::uint64_t kKBPerMB = 1024;
+    return sizeKB.then([](std::uint64_t size) {
+        return size / kKBPerMB > std::numeric_limits<std::int32_t>::max()
+                   ? std::nullopt
+                   : std::optional(static_cast<Pegasus::Uint32>(size / kKBPerMB));
+    });
+}
+
+Fact<std::uint32_t> readProcessCount(const SystemPaths& paths) {
+    return listProcesses(paths.processes()).then([](const std::vector<std::uint64_t>& ids) {
+        return std::optional(static_cast<std::uint32_t>(ids.size()));
+    });
+}
+
+void addMemory(InstanceBuilder& builder, const MemoryInfo& memory) {
+    using Pegasus::Uint32;
+    using Pegasus::Uint64;
+    builder.value<Uint64>("TotalSwapSpaceSize", as<Uint64>(memory.swapTotalKB))
+        .value<Uint64>("TotalVirtualMemorySize",
+                       as<Uint64>(sumOf(memory.totalKB, memory.swapTotalKB)))
+        .value<Uint64>("FreeVirtualMemory", as<Uint64>(sumOf(memory.freeKB, memory.swapFreeKB)))
+        .value<Uint64>("TotalVisibleMemorySize", as<Uint64>(memory.totalKB))
+        .value<Uint64>("FreePhysicalMemory", as<Uint64>(memory.freeKB))
+        .value<Uint32>("TotalSwapSpaceSizeMB", inMB(memory.swapTotalKB))
+        .value<Uint32>("TotalVisibleMemorySizeMB", inMB(memory.totalKB))
+        .value<Uint32>("FreePhysicalMemoryMB", inMB(memory.freeKB));
 }
 
 }  // namespace
@@ -77,22 +104,18 @@ std::unique_ptr<InstanceStream> OperatingSystemProvider::enumerate() const {
 OperatingSystemFacts OperatingSystemProvider::read() const {
     OperatingSystemFacts facts;
     facts.hostName = readHostName(paths);
-    auto release = readText(paths.osRelease());
-    if (!release)
-        release = readText(paths.vendorOsRelease());
-    facts.release = parseOsRelease(release.value_or(""));
+    facts.release = readOsRelease(paths);
     facts.kernelRelease = readFact(paths.kernelRelease());
     facts.machine = readFact(paths.architecture());
     if (!facts.machine)
         facts.machine = calls.machine();
-    facts.memory = parseMemoryInfo(readText(paths.memory()).value_or(""));
-    facts.bootTime = parseBootTime(readText(paths.kernelStatistics(), kMaxTableBytes).value_or(""));
+    facts.memory = readMemoryInfo(paths);
+    facts.bootTime = readBootTime(paths);
     facts.now = calls.now();
     facts.utcOffsetMinutes = calls.utcOffsetMinutes(facts.now);
     facts.utcOffsetAtBootMinutes = calls.utcOffsetMinutes(facts.bootTime.value_or(facts.now));
-    facts.processes = countProcesses(paths.processes());
-    if (const auto sessions = readText(paths.sessions(), kMaxTableBytes))
-        facts.sessions = countSessions(*sessions);
+    facts.processes = readProcessCount(paths);
+    facts.sessions = readSessionCount(paths);
     return facts;
 }
 
@@ -107,7 +130,7 @@ std::optional<std::uint16_t> OperatingSystemProvider::osTypeOf(
 }
 
 ProvidedInstance OperatingSystemProvider::publish(const OperatingSystemFacts& facts) {
-    const std::string name = facts.release.name.value_or("Linux");
+    const std::string name = nameOf(facts.release);
     const std::string title = facts.release.prettyName.value_or(name);
     InstanceBuilder builder(kClassName);
     builder.label(title)
@@ -125,12 +148,10 @@ ProvidedInstance OperatingSystemProvider::publish(const OperatingSystemFacts& fa
                                 static_cast<Pegasus::Sint16>(facts.utcOffsetMinutes))
         .value<Pegasus::Uint32>("NumberOfUsers", as<Pegasus::Uint32>(facts.sessions))
         .value<Pegasus::Uint32>("NumberOfProcesses", as<Pegasus::Uint32>(facts.processes))
-        .value<Pegasus::Uint64>("TotalSwapSpaceSize", as<Pegasus::Uint64>(facts.memory.swapTotalKB))
-        .value<Pegasus::Uint64>("TotalVisibleMemorySize", as<Pegasus::Uint64>(facts.memory.totalKB))
-        .value<Pegasus::Uint64>("FreePhysicalMemory", as<Pegasus::Uint64>(facts.memory.freeKB))
         .text("DistributionId", facts.release.id, kVersionLength)
         .text("KernelRelease", facts.kernelRelease, kVersionLength)
         .text("Architecture", facts.machine, kVersionLength);
+    addMemory(builder, facts.memory);
     return builder.take();
 }
 

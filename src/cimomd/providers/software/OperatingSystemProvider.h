@@ -18,16 +18,16 @@ namespace cimomd {
 struct OperatingSystemFacts {
     std::string hostName;
     OsRelease release;
-    std::optional<std::string> kernelRelease;
+    Fact<std::string> kernelRelease;
     /// As uname names it.
-    std::optional<std::string> machine;
+    Fact<std::string> machine;
     MemoryInfo memory;
-    std::optional<std::int64_t> bootTime;
+    Fact<std::int64_t> bootTime;
     std::int64_t now = 0;
     int utcOffsetMinutes = 0;
     int utcOffsetAtBootMinutes = 0;
-    std::optional<std::uint32_t> processes;
-    std::optional<std::uint32_t> sessions;
+    Fact<std::uint32_t> processes;
+    Fact<std::uint32_t> sessions;
 };
 
 class OperatingSystemProvider : public Provider {

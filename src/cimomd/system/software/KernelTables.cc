@@ -10,6 +10,8 @@
 namespace cimomd {
 namespace {
 
+constexpr std::size_t kMaxTableBytes = std::size_t{4} << 20;
+
 std::optional<std::uint64_t> kilobytes(std::string_view value) {
     const std::vector<std::string_view> fields = fieldsOf(value);
     if (fields.size() != 2 || fields[1] != "kB")
@@ -31,14 +33,26 @@ MemoryInfo parseMemoryInfo(std::string_view text) {
             out.freeKB = kilobytes(entry->value);
         else if (entry->key == "SwapTotal")
             out.swapTotalKB = kilobytes(entry->value);
+        else if (entry->key == "SwapFree")
+            out.swapFreeKB = kilobytes(entry->value);
     }
     return out;
 }
 
 Fact<std::uint64_t> readTotalMemoryKB(const SystemPaths& paths) {
     return readText(paths.memory())
-        .then([](const std::string& text) { return parseMemoryInfo(text).totalKB; },
-              Absence::Unreadable);
+        .then(
+            [](const std::string& text) -> std::optional<std::uint64_t> {
+                return parseMemoryInfo(text).totalKB;
+            },
+            Absence::Unreadable);
+}
+
+MemoryInfo readMemoryInfo(const SystemPaths& paths) {
+    const Fact<std::string> text = readText(paths.memory());
+    if (text)
+        return parseMemoryInfo(*text);
+    return {text.reason(), text.reason(), text.reason(), text.reason()};
 }
 
 std::optional<std::int64_t> parseBootTime(std::string_view text) {
@@ -50,6 +64,10 @@ std::optional<std::int64_t> parseBootTime(std::string_view text) {
     return std::nullopt;
 }
 
+Fact<std::int64_t> readBootTime(const SystemPaths& paths) {
+    return readText(paths.kernelStatistics(), kMaxTableBytes).then(parseBootTime, Absence::Absent);
+}
+
 std::uint32_t countSessions(std::string_view bytes) {
     std::uint32_t count = 0;
     while (bytes.size() >= sizeof(utmpx)) {
@@ -59,6 +77,12 @@ std::uint32_t countSessions(std::string_view bytes) {
         bytes.remove_prefix(sizeof record);
     }
     return count;
+}
+
+Fact<std::uint32_t> readSessionCount(const SystemPaths& paths) {
+    return readText(paths.sessions(), kMaxTableBytes).then([](const std::string& bytes) {
+        return std::optional(countSessions(bytes));
+    });
 }
 
 }  // namespace cimomd

@@ -1,6 +1,7 @@
 #include "system/software/OsRelease.h"
 
 #include "files/TextFields.h"
+#include "files/TextFile.h"
 
 namespace cimomd {
 namespace {
@@ -45,6 +46,17 @@ OsRelease parseOsRelease(std::string_view text) {
             out.versionId = known;
     }
     return out;
+}
+
+OsRelease readOsRelease(const SystemPaths& paths) {
+    auto text = readText(paths.osRelease());
+    if (!text)
+        text = readText(paths.vendorOsRelease());
+    return parseOsRelease(text.value_or(""));
+}
+
+std::string nameOf(const OsRelease& release) {
+    return release.name.value_or("Linux");
 }
 
 }  // namespace cimomd
