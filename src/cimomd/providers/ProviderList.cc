@@ -26,12 +26,14 @@
 #include "providers/software/AccountProvider.h"
 #include "providers/software/GroupProvider.h"
 #include "providers/software/OperatingSystemProvider.h"
+#include "providers/software/ServiceProvider.h"
+#include "providers/software/SoftwareIdentityProvider.h"
+#include "providers/software/TimeZoneProvider.h"
+#include "providers/software/UnixProcessProvider.h"
 #include "providers/storage/CDROMDriveProvider.h"
 #include "providers/storage/DiskDriveProvider.h"
 #include "providers/storage/DiskPackageProvider.h"
 #include "providers/storage/DiskPartitionProvider.h"
-#include "providers/software/SoftwareIdentityProvider.h"
-#include "providers/software/UnixProcessProvider.h"
 #include "providers/storage/LocalFileSystemProvider.h"
 #include "providers/storage/NFSProvider.h"
 #include "providers/storage/RemoteFileSystemProvider.h"
@@ -74,8 +76,10 @@ ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     providers.push_back(std::make_unique<DnsSettingDataProvider>(paths));
     providers.push_back(std::make_unique<SoftwareIdentityProvider>(paths, calls));
     providers.push_back(std::make_unique<UnixProcessProvider>(paths, calls));
+    providers.push_back(std::make_unique<ServiceProvider>(paths));
     providers.push_back(std::make_unique<AccountProvider>(paths, calls));
     providers.push_back(std::make_unique<GroupProvider>(paths));
+    providers.push_back(std::make_unique<TimeZoneProvider>(paths, calls));
     providers.push_back(std::make_unique<MissingValueProvider>(providers));
     return providers;
 }

@@ -1,12 +1,12 @@
 #include "providers/software/GroupProvider.h"
 
+#include "providers/EnumeratedValues.h"
 #include "providers/InstanceBuilder.h"
 #include "providers/RecordStream.h"
 
 namespace cimomd {
 namespace {
 
-constexpr std::size_t kNameLength = 1024;
 constexpr std::size_t kNumberLength = 256;
 
 }  // namespace
