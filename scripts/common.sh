@@ -42,7 +42,7 @@ BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev lib
     libfmt-dev libmnl-dev libsystemd-dev)
 # shellcheck disable=SC2034
 TEST_PACKAGES=(libgtest-dev libgmock-dev rpm python3 mariadb-server postgresql-15 shellcheck
-    sblim-wbemcli libxml2-utils systemd)
+    sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode)
 
 # Configures a preset unless that is done, and builds it. What a quiet build prints is shown when
 # it fails.
