@@ -2,37 +2,37 @@
 
 # On every machine.
 COMMON = [
-    "cachememory", "computersystem", "desktopmonitor", "diskdrive", "diskpackage",
-    "diskpartition", "dnssettingdata", "ethernetport", "ipprotocolendpoint",
+    "account", "cachememory", "computersystem", "desktopmonitor", "diskdrive", "diskpackage",
+    "diskpartition", "dnssettingdata", "ethernetport", "group", "ipprotocolendpoint",
     "lanendpoint", "localfilesystem", "memory", "nexthopiproute", "operatingsystem",
-    "physicalmemory", "processor", "usbdevice", "videocontroller",
+    "physicalmemory", "processor", "unixprocess", "usbdevice", "videocontroller",
 ]
 # The scripts with data: what a machine lacks has no file.
 SCRIPTS = {
     "laptop": sorted(COMMON + [
         "battery", "bioselement", "card", "chassis", "fan", "numericsensor", "pcidevice",
-        "remotefilesystem", "slot", "storagevolume", "wifiport",
+        "remotefilesystem", "slot", "softwareidentity", "storagevolume", "timezone", "wifiport",
     ]),
     "server": sorted(COMMON + [
         "bioselement", "card", "cdromdrive", "chassis", "fan", "nfs", "numericsensor",
-        "pcidevice", "remotefilesystem", "slot", "storagevolume", ]),
+        "pcidevice", "remotefilesystem", "slot", "storagevolume", "timezone",
+    ]),
     "virtual": sorted(COMMON + [
         "bioselement", "cdromdrive", "chassis", "pcidevice", "remotefilesystem",
-        ]),
+        "softwareidentity", "timezone",
+    ]),
     "arm": sorted(COMMON + ["numericsensor", "wifiport"]),
 }
 
-# Scripts of which some number with words has no value on that machine.
-NAMELESS_NUMBERS = {
-    "laptop": ["operatingsystem"],
-    "server": ["operatingsystem"],
-    "virtual": ["diskdrive", "operatingsystem"],
-    "arm": ["operatingsystem", "physicalmemory"],
-}
+# Scripts of which some number with words has no value on that machine: what a disk of a hypervisor
+# is, and what shape memory has that the kernel alone tells of.
+NAMELESS_NUMBERS = {"virtual": ["diskdrive"], "arm": ["physicalmemory"]}
 
 # Some cells by machine, script and number of the row.
 ROWS = {
     "laptop": {
+        "account": {3: {"Login Name": "ada", "Remarks": "Ada Lund", "User Id": "1000",
+                        "Home": "/home/ada", "Login Shell": "/bin/bash"}},
         "battery": {1: {
             "Battery": "BAT0", "Manufacturer": "LGC", "Chemistry": "Lithium Polymer",
             "Capacity New mWh": "57020", "Capacity Now mWh": "51350", "Charge Percent": "87",
@@ -70,6 +70,7 @@ ROWS = {
             "Name Servers": "192.168.178.1,fe80::cece:1eff:fe4b:1%wlp0s20f3",
             "Domain": "home.example",
         }},
+        "group": {3: {"Group Name": "sudo", "Group Id": "27", "Members": "ada"}},
         "localfilesystem": {
             1: {"Mount Point": "/", "Type": "ext4", "Total MB": "939488", "Free MB": "703125"},
             5: {"Mount Point": "/media/mia/USB STICK", "Device": "/dev/sda1"},
@@ -79,6 +80,7 @@ ROWS = {
         "nexthopiproute": {1: {"IP Kind": "IPv4", "Destination": "0.0.0.0", "Prefix Length": "0",
                                "Gateway": "192.168.178.1", "Interface": "wlp0s20f3",
                                "Metric": "600"}},
+        "operatingsystem": {1: {"Name": "Ubuntu", "Version": "22.04", "Type": "Ubuntu 64-Bit"}},
         "physicalmemory": {
             1: {"Module": "ChannelA-DIMM0", "Capacity MB": "8192", "Type": "DDR4",
                 "Form Factor": "SODIMM", "Speed MHz": "3200", "Bits": "64"},
@@ -86,8 +88,14 @@ ROWS = {
         },
         "processor": {1: {"Model": "11th Gen Intel(R) Core(TM) i5-1135G7 @ 2.40GHz",
                           "Cores": "4", "Threads": "8", "Max Clock MHz": "4200"}},
+        "softwareidentity": {2: {"Package Name": "libc6", "Version": "2.35-0ubuntu3.6",
+                                 "Machine": "amd64"}},
         "storagevolume": {2: {"Device": "/dev/mapper/birch--vg-root", "Type": "LVM",
                               "Capacity MB": "958464", "Made Of": "dm-0"}},
+        "timezone": {1: {"Time Zone": "Europe/Berlin", "Offset Minutes": "60",
+                         "Daylight Name": "CEST", "Daylight Minutes": "120"}},
+        "unixprocess": {2: {"Process Id": "2350", "Name": "Web Content (2)", "User Name": "ada",
+                            "State": "Running", "RAM KB": "524288"}},
         "usbdevice": {4: {"Port": "4-1", "Kind": "Mass Storage", "Product": "Ultra Flair",
                           "Speed Mbps": "5000"}},
         "videocontroller": {1: {"Manufacturer": "Intel Corporation", "Driver": "i915"}},

@@ -17,32 +17,32 @@ PROGRAMS = None
 # name stands.
 RESERVED = set("""
     access accessible add all alter analyze and any as asc asensitive audit authorization backup
-    before begin between bigint binary blob both break browse bulk by call cascade case change
+    before begin between bigint binary blob body both break browse bulk by call cascade case change
     char character check checkpoint close cluster clustered coalesce collate column comment commit
-    compress compute condition confirm connect constraint contains containstable continue
-    controlrow convert create cross current cursor database databases date dbcc deallocate dec
-    decimal declare default delayed delete deny desc describe deterministic disk distinct
-    distinctrow distributed div double drop dual dummy dump each else elseif enclosed end errlvl
-    errordata errorexit escape escaped except exclusive exec execute exists exit explain external
-    false fetch file fillfactor float for force foreign freetext from full fulltext function
-    general get goto grant group groups having high_priority holdlock identified identity if
-    ignore immediate in increment index infile initial inner inout insensitive insert int integer
-    intersect interval into is iterate join key keys kill leading leave left level like limit
-    linear lineno lines load localtime lock long loop low_priority match maxextents maxvalue
-    merge minus mirror mirrorexit mlslabel mod mode modifies modify national natural noaudit
-    nocheck nocompress nonclustered not nowait null nullif number numeric of off offline offsets
-    on once online open optimize option optionally or order out outer outfile over partition
-    pctfree percent permanent pivot plan precision prepare primary print prior privileges proc
-    procedure processexit proxy public purge raiserror range rank raw read reads readtext real
-    reconfigure references regexp release rename repeat replace replication require resignal
-    resource restore restrict return revert revoke right rlike rollback row rowcount rowguidcol
-    rowid rownum rows rule save schema schemas select sensitive separator session set setuser
-    share show shutdown signal size smallint some spatial specific sql ssl start starting
-    statistics stored straight_join stripe successful synonym sysdate system table tablesample
-    temp temporary terminated textsize then tinyblob tinyint to top trailing tran transaction
-    trigger true truncate tsequal uid undo union unique unlock unpivot unsigned update
-    updatetext usage use user using validate values varbinary varchar varchar2 varying view
-    virtual waitfor when whenever where while window with work write writetext xor
+    compress compute condition confirm connect constraint contains containstable continue controlrow
+    convert create cross current cursor database databases date dbcc deallocate dec decimal declare
+    default delayed delete deny desc describe deterministic disk distinct distinctrow distributed
+    div double drop dual dummy dump each else elseif elsif enclosed end errlvl errordata errorexit
+    escape escaped except exclusive exec execute exists exit explain external false fetch file
+    fillfactor float for force foreign freetext from full fulltext function general get goto grant
+    group groups having high_priority holdlock identified identity if ignore immediate in increment
+    index infile initial inner inout insensitive insert int integer intersect interval into is
+    iterate join key keys kill leading leave left level like limit linear lineno lines load
+    localtime lock long loop low_priority match maxextents maxvalue merge minus mirror mirrorexit
+    mlslabel mod mode modifies modify national natural noaudit nocheck nocompress nonclustered not
+    nowait null nullif number numeric of off offline offsets on once online open optimize option
+    optionally or order others out outer outfile over package partition pctfree percent permanent
+    pivot plan precision prepare primary print prior privileges proc procedure processexit proxy
+    public purge raise raiserror range rank raw read reads readtext real reconfigure references
+    regexp release rename repeat replace replication require resignal resource restore restrict
+    return revert revoke right rlike rollback row rowcount rowguidcol rowid rownum rows rowtype rule
+    save schema schemas select sensitive separator session set setuser share show shutdown signal
+    size smallint some spatial specific sql ssl start starting statistics stored straight_join
+    stripe successful synonym sysdate system table tablesample temp temporary terminated textsize
+    then tinyblob tinyint to top trailing tran transaction trigger true truncate tsequal uid undo
+    union unique unlock unpivot unsigned update updatetext usage use user using validate values
+    varbinary varchar varchar2 varying view virtual waitfor when whenever where while window with
+    work write writetext xor
 """.split())
 
 

@@ -10,6 +10,8 @@
 #include "files/TextFields.h"
 #include "files/TextFile.h"
 #include "mof/MofCompiler.h"
+#include "providers/ProviderList.h"
+#include "system/RecordedSystemCalls.h"
 #include "text/CimText.h"
 #include "text/Utf8.h"
 
@@ -134,6 +136,20 @@ TEST(InventoryScripts, haveOneClassEach) {
         EXPECT_EQ(text.find("G["), text.rfind("G[")) << name;
         EXPECT_TRUE(classes.insert(scriptOf(name).className).second) << name;
     }
+}
+
+// Velmira_MissingValue is for those who wonder what the tables lack.
+TEST(InventoryScripts, listEveryClassThatIsServed) {
+    const SystemPaths paths("/nonexistent");
+    const RecordedSystemCalls calls(paths);
+    std::set<std::string> served;
+    for (const auto& provider : makeProviders(paths, calls))
+        served.insert(provider->className());
+    EXPECT_EQ(served.erase("Velmira_MissingValue"), 1U);
+    std::set<std::string> listed;
+    for (const std::string& name : scriptNames())
+        listed.insert(scriptOf(name).className);
+    EXPECT_EQ(listed, served);
 }
 
 // Of 64 bits only the lower 32 are written. No frame is that long.
