@@ -16,13 +16,13 @@ TEST(MountInfo, readsALine) {
     EXPECT_EQ(mounts[0].mountPoint, "/mnt 2\\x");
     EXPECT_EQ(mounts[0].type, "ext3");
     EXPECT_EQ(mounts[0].source, "/dev/root");
-    EXPECT_TRUE(mounts[0].readOnly);
+    EXPECT_FALSE(mounts[0].readOnly);
     EXPECT_TRUE(mounts[0].fileSystemOptions.has("rw"));
 }
 
-TEST(MountInfo, findsReadOnlyInEitherOptions) {
+TEST(MountInfo, takesReadOnlyFromTheFileSystem) {
     const auto mounts = parseMountInfo(
-        "1 0 8:1 / /a rw,errors=ro - ext4 /dev/a rw\n"
+        "1 0 8:1 / /a ro - ext4 /dev/a rw,errors=ro\n"
         "2 0 8:2 / /b rw - iso9660 /dev/b ro,relatime\n");
     ASSERT_EQ(mounts.size(), 2U);
     EXPECT_FALSE(mounts[0].readOnly);

@@ -28,7 +28,9 @@ std::optional<Mount> parseLine(std::string_view line) {
     mount.type = dash[1];
     mount.source = unescapeOctal(dash[2]);
     mount.fileSystemOptions = MountOptions(dash[3]);
-    mount.readOnly = MountOptions(fields[5]).has("ro") || mount.fileSystemOptions.has("ro");
+    // A single mount may be read-only for this process alone, as in a service's own view of the
+    // tree.
+    mount.readOnly = mount.fileSystemOptions.has("ro");
     return mount;
 }
 

@@ -21,6 +21,7 @@ struct Mount {
     std::string mountPoint;
     std::string type;
     std::string source;
+    /// Whether the file system is, not only this mount of it.
     bool readOnly = false;
     /// Those of the file system, as opposed to those of this mount.
     MountOptions fileSystemOptions;
