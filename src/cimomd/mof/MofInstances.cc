@@ -142,6 +142,7 @@ bool MofInstances::hasKeys(const Entry& entry) const {
 void MofInstances::setPath(Entry& entry) {
     Pegasus::CIMInstance& instance = entry.built.instance;
     Pegasus::Array<CIMKeyBinding> keys;
+    std::size_t characters = 0;
     for (const std::size_t key : entry.instanceClass->keys()) {
         const CIMConstProperty property = instance.getProperty(static_cast<Uint32>(key));
         try {
@@ -153,6 +154,12 @@ void MofInstances::setPath(Entry& entry) {
                             Pegasus::cimTypeToString(property.getType()),
                             property.isArray() ? "[]" : "", utf8Of(property.getName().getString())),
                 "keys that are neither arrays nor reals");
+            return;
+        }
+        characters += keys[keys.size() - 1].getValue().size();
+        if (characters > kMaxKeyCharacters) {
+            entry.context->report(entry.position, "an instance with too long keys",
+                                  fmt::format("at most {} characters", kMaxKeyCharacters));
             return;
         }
     }

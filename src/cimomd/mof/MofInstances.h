@@ -21,6 +21,10 @@ class MofInstances {
     /// How long a chain of instances may be that have each other as keys.
     static constexpr std::size_t kMaxKeyDepth = 64;
 
+    /// In all keys of an instance. A key that is a reference holds the keys of another instance
+    /// with their quotes escaped, and so on: without a bound that doubles from one to the next.
+    static constexpr std::size_t kMaxKeyCharacters = 65'536;
+
     /// `classes` must stay alive.
     explicit MofInstances(const MofClasses& classes) : classes(classes) {}
 

@@ -28,6 +28,38 @@ RepositoryError errorOf(std::string found, std::string expected) {
     return error;
 }
 
+/// What the class costs in a subclass, which shares what is propagated already.
+std::size_t elementsOf(const Pegasus::CIMConstClass& cimClass) {
+    std::size_t count = 1 + cimClass.getQualifierCount() + cimClass.getPropertyCount();
+    for (Pegasus::Uint32 i = 0; i < cimClass.getPropertyCount(); ++i) {
+        const Pegasus::CIMConstProperty property = cimClass.getProperty(i);
+        if (!property.getPropagated())
+            count += property.getQualifierCount();
+    }
+    return count;
+}
+
+std::size_t elementsOf(const MethodDeclaration& method) {
+    std::size_t count = 1 + method.qualifiers.size();
+    for (const ParameterDeclaration& parameter : method.parameters)
+        count += 1 + parameter.qualifiers.size();
+    return count;
+}
+
+std::size_t elementsOf(const std::vector<MethodDeclaration>& methods) {
+    std::size_t count = 0;
+    for (const MethodDeclaration& method : methods)
+        count += elementsOf(method);
+    return count;
+}
+
+std::size_t elementsOf(const MethodList& methods) {
+    std::size_t count = 0;
+    for (const auto& method : methods)
+        count += method->isPropagated ? 1 : elementsOf(*method);
+    return count;
+}
+
 std::shared_ptr<const MethodList> shared(MethodList methods) {
     return methods.empty() ? nullptr : std::make_shared<const MethodList>(std::move(methods));
 }
@@ -94,7 +126,8 @@ RepositoryErrors ClassRepository::addClass(const CIMNamespaceName& nameSpace, CI
 RepositoryErrors ClassRepository::addTopClass(Namespace& space, CIMClass declared,
                                               std::vector<MethodDeclaration> methods) {
     const CIMName name = declared.getClassName();
-    RepositoryErrors errors = reserveFeatures(declared.getPropertyCount() + methods.size());
+    RepositoryErrors errors = reserve(declared.getPropertyCount() + methods.size(),
+                                      elementsOf(declared) + elementsOf(methods));
     if (!errors.empty())
         return errors;
     ClassEntry entry;
@@ -116,11 +149,14 @@ RepositoryErrors ClassRepository::addSubclass(Namespace& space, ClassEntry& supe
     if (entry.depth > kMaxInheritanceDepth)
         return {errorOf(fmt::format("a class {} levels deep", entry.depth),
                         fmt::format("at most {}", kMaxInheritanceDepth))};
-    RepositoryErrors errors = checkOverrides(super.effective, declared);
+    RepositoryErrors errors = reserve(super.effective.getPropertyCount() + inherited.size() +
+                                          declared.getPropertyCount() + methods.size(),
+                                      elementsOf(super.effective) + elementsOf(declared) +
+                                          elementsOf(inherited) + elementsOf(methods));
+    if (!errors.empty())
+        return errors;
+    errors = checkOverrides(super.effective, declared);
     checkMethodOverrides(inherited, methods, errors);
-    if (errors.empty())
-        errors = reserveFeatures(super.effective.getPropertyCount() + inherited.size() +
-                                 declared.getPropertyCount() + methods.size());
     if (!errors.empty())
         return errors;
     entry.methods = shared(inheritMethods(inherited, std::move(methods), name));
@@ -130,16 +166,14 @@ RepositoryErrors ClassRepository::addSubclass(Namespace& space, ClassEntry& supe
     return {};
 }
 
-RepositoryErrors ClassRepository::reserveFeatures(std::size_t count) {
-    // A class costs memory without features too.
-    const std::size_t cost = count + 1;
-    if (cost > kMaxFeatures)
+RepositoryErrors ClassRepository::reserve(std::size_t features, std::size_t elements) {
+    if (features > kMaxFeatures)
         return {errorOf("a class with too many properties and methods",
                         fmt::format("at most {}", kMaxFeatures))};
-    if (cost > kMaxAllFeatures - allFeatures)
-        return {errorOf("too many classes, properties and methods",
-                        fmt::format("at most {}", kMaxAllFeatures))};
-    allFeatures += cost;
+    if (elements > kMaxElements - elementCount)
+        return {errorOf("too many classes, properties, methods and qualifiers",
+                        fmt::format("at most {}", kMaxElements))};
+    elementCount += elements;
     return {};
 }
 

@@ -30,8 +30,9 @@ class ClassRepository {
     static constexpr std::size_t kMaxInheritanceDepth = 64;
     /// Properties and methods of one class, inherited ones included.
     static constexpr std::size_t kMaxFeatures = 4096;
-    /// Features of all classes together, inherited ones included: they cost memory in each class.
-    static constexpr std::size_t kMaxAllFeatures = 4'000'000;
+    /// Classes, features, parameters and qualifiers together. Inherited ones count in each class in
+    /// which they cost memory.
+    static constexpr std::size_t kMaxElements = 4'000'000;
 
     void addNamespace(const Pegasus::CIMNamespaceName& name);
     bool hasNamespace(const Pegasus::CIMNamespaceName& name) const;
@@ -124,11 +125,11 @@ class ClassRepository {
                                  std::vector<MethodDeclaration> methods);
     RepositoryErrors addSubclass(Namespace& space, ClassEntry& super, Pegasus::CIMClass declared,
                                  std::vector<MethodDeclaration> methods);
-    RepositoryErrors reserveFeatures(std::size_t count);
+    RepositoryErrors reserve(std::size_t features, std::size_t elements);
 
     /// By names in lower case.
     std::map<std::string, Namespace> namespaces;
-    std::size_t allFeatures = 0;
+    std::size_t elementCount = 0;
 };
 
 }  // namespace cimomd

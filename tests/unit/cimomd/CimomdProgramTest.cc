@@ -335,5 +335,23 @@ TEST_F(CimomdProgramTest, saysWhatItCannotDo) {
     EXPECT_FALSE(std::filesystem::exists(socketPath));
 }
 
+TEST_F(CimomdProgramTest, checksMofFiles) {
+    const auto statusOf = [](const std::vector<std::string>& arguments) {
+        return RunningCimomd(arguments).wait();
+    };
+    tree.file("good.mof", "class Own_Device : CIM_LogicalDevice {};")
+        .file("more.mof", "class Own_Disk : Own_Device {};")
+        .file("bad.mof", "class X {");
+    const std::string good = (tree.root / "good.mof").string();
+    const std::string more = (tree.root / "more.mof").string();
+    const std::string bad = (tree.root / "bad.mof").string();
+    EXPECT_EQ(statusOf({"--check", good}), 0);
+    EXPECT_EQ(statusOf({"--check", good, more}), 0);
+    EXPECT_EQ(statusOf({"--check", more}), 1);
+    EXPECT_EQ(statusOf({"--check", good, bad}), 1);
+    EXPECT_EQ(statusOf({"--check"}), 1);
+    EXPECT_EQ(statusOf({"--check", good, "--socket", socketPath}), 1);
+}
+
 }  // namespace
 }  // namespace cimomd

@@ -128,6 +128,29 @@ TEST_F(ClassRepositoryTest, boundsTheDepthOfInheritance) {
     EXPECT_THROW(compiler.compileText("class D65 : D64 {};", "deeper.mof"), MofErrors);
 }
 
+TEST_F(ClassRepositoryTest, boundsTheFeaturesOfAClass) {
+    std::string text = "class Wide { uint8 p0;";
+    for (int i = 1; i < 4096; ++i)
+        text += "uint8 p" + std::to_string(i) + ";";
+    MofCompiler compiler(repository, Pegasus::CIMNamespaceName(kNamespace));
+    compiler.compileText(text + "};", "wide.mof");
+    EXPECT_EQ(find("Wide").getPropertyCount(), 4096U);
+    EXPECT_THROW(compiler.compileText("class Wider : Wide { uint8 q; };", "wider.mof"), MofErrors);
+}
+
+TEST_F(ClassRepositoryTest, listsTopClassesAndSubclasses) {
+    std::string names;
+    for (const Pegasus::CIMName& name : repository.topClasses(kNamespace))
+        names += utf8Of(name.getString()) + " ";
+    for (const Pegasus::CIMName& name : repository.subclassesOf(kNamespace, "Top"))
+        names += "Top/" + utf8Of(name.getString()) + " ";
+    EXPECT_EQ(names, "Top Alone Top/Middle Top/Side ");
+    EXPECT_TRUE(repository.isSameOrSubclass(kNamespace, "bottom", "TOP"));
+    EXPECT_TRUE(repository.isSameOrSubclass(kNamespace, "Top", "Top"));
+    EXPECT_FALSE(repository.isSameOrSubclass(kNamespace, "Top", "Bottom"));
+    EXPECT_FALSE(repository.isSameOrSubclass(kNamespace, "None", "None"));
+}
+
 TEST_F(ClassRepositoryTest, copiesAreIndependent) {
     ClassRepository copy = repository;
     EXPECT_TRUE(copy.addClass(kNamespace, Pegasus::CIMClass("New", "Top")).empty());
