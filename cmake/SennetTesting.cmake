@@ -15,6 +15,8 @@ function(sennet_add_test NAME)
     add_executable(${NAME} ${ARG_SOURCES})
     target_link_libraries(${NAME} PRIVATE sennet_compile ${ARG_LIBS} GTest::gtest GTest::gmock
                           GTest::gtest_main)
+    # What a test does once need not be fast, and optimising it takes most of a build's time.
+    target_compile_options(${NAME} PRIVATE -O0)
     target_include_directories(${NAME} PRIVATE "${PROJECT_SOURCE_DIR}/tests")
     target_compile_definitions(${NAME} PRIVATE
         TEST_BIN_DIR="${CMAKE_RUNTIME_OUTPUT_DIRECTORY}"
