@@ -78,6 +78,7 @@ class SpawnSettings {
         std::vector<std::string> words{program.string()};
         words.insert(words.end(), arguments.begin(), arguments.end());
         std::vector<char*> argumentList;
+        argumentList.reserve(words.size() + 1);
         for (std::string& word : words)
             argumentList.push_back(word.data());
         argumentList.push_back(nullptr);
