@@ -20,7 +20,7 @@ if(SENNET_BUILD_FUZZERS)
     if(NOT CMAKE_CXX_COMPILER_ID STREQUAL "Clang")
         message(FATAL_ERROR "SENNET_BUILD_FUZZERS needs clang++: use the preset ci")
     endif()
-    target_compile_options(sennet_compile INTERFACE -fsanitize=fuzzer-no-link -O1)
+    target_compile_options(sennet_compile INTERFACE -fsanitize=fuzzer-no-link)
 endif()
 
 if(SENNET_COVERAGE)

@@ -17,14 +17,6 @@
 namespace cimomd {
 namespace {
 
-#if defined(__SANITIZE_ADDRESS__)
-#define SENNET_TEST_SANITIZED 1
-#elif defined(__has_feature)
-#if __has_feature(address_sanitizer)
-#define SENNET_TEST_SANITIZED 1
-#endif
-#endif
-
 // A sanitizer keeps freed memory for a while, so that a peak says nothing; it is slow besides.
 #ifdef SENNET_TEST_SANITIZED
 constexpr bool kMeasuresMemory = false;
