@@ -18,6 +18,7 @@
 #include <cstring>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "support/ReplySender.h"
@@ -80,7 +81,9 @@ std::string texts(const std::string& name, const std::vector<std::string>& value
 Reply processReply(const std::vector<std::string>& arguments) {
     std::vector<std::string> environment;
     for (char** entry = environ; *entry != nullptr; ++entry) {
-        environment.emplace_back(*entry);
+        // A build for coverage adds a variable of its own.
+        if (std::string_view(*entry).substr(0, 15) != "__LLVM_PROFILE_")
+            environment.emplace_back(*entry);
     }
     return Reply::ok(
         "<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME=\"Fake_Process\"/>"

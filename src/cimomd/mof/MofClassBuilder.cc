@@ -16,8 +16,23 @@ using Pegasus::CIMName;
 using Pegasus::CIMProperty;
 using Pegasus::CIMValue;
 
-QualifierScopes scopesOf(const MofClass& declaration) {
-    QualifierScopes scopes = kScopeClass;
+/// A subclass of an association, or of an indication, is one without saying so.
+QualifierScopes inheritedScopes(const MofClass& declaration, const MofContext& context) {
+    if (!declaration.superClass)
+        return 0;
+    const auto* super =
+        context.repository.findClass(context.nameSpace, nameOf(*declaration.superClass));
+    // Without the superclass, whose absence is told by itself, the class may be either.
+    if (super == nullptr)
+        return kScopeAssociation | kScopeIndication;
+    QualifierScopes scopes = super->isAssociation() ? kScopeAssociation : 0;
+    if (super->findQualifier(CIMName("Indication")) != Pegasus::PEG_NOT_FOUND)
+        scopes |= kScopeIndication;
+    return scopes;
+}
+
+QualifierScopes scopesOf(const MofClass& declaration, const MofContext& context) {
+    QualifierScopes scopes = kScopeClass | inheritedScopes(declaration, context);
     for (const MofQualifier& qualifier : declaration.qualifiers) {
         if (equalsIgnoringCase(qualifier.name.text, "association"))
             scopes |= kScopeAssociation;
@@ -114,7 +129,7 @@ BuiltClass buildClass(const MofClass& declaration, const MofContext& context) {
                             declaration.superClass ? nameOf(*declaration.superClass) : CIMName()),
                    {}};
     for (const auto& qualifier :
-         qualifiersOf(declaration.qualifiers, scopesOf(declaration), "a class", context))
+         qualifiersOf(declaration.qualifiers, scopesOf(declaration, context), "a class", context))
         out.cimClass.addQualifier(qualifier);
     std::set<CIMName, NameOrder> properties;
     for (const MofProperty& property : declaration.properties) {

@@ -38,6 +38,7 @@ void MofErrorLog::raise(bool isCut) const {
     std::stable_sort(sorted.begin(), sorted.end(),
                      [&](const Entry& a, const Entry& b) { return placeOf(a) < placeOf(b); });
     std::vector<MofError> errors;
+    errors.reserve(sorted.size());
     for (const Entry& entry : sorted)
         errors.push_back(entry.error);
     throw MofErrors(std::move(errors), isCut);

@@ -89,7 +89,8 @@ char MofLexer::peek(std::size_t distance) const {
 
 void MofLexer::advance() {
     const char passed = text[offset++];
-    if (passed == '\n') {
+    const bool endsLine = passed == '\n' || (passed == '\r' && (atEnd() || text[offset] != '\n'));
+    if (endsLine) {
         ++position.line;
         position.column = 1;
     } else if (atEnd() || !isContinuationByte(text[offset])) {
@@ -97,13 +98,17 @@ void MofLexer::advance() {
     }
 }
 
+void MofLexer::skipLine() {
+    while (!atEnd() && current() != '\n' && current() != '\r')
+        advance();
+}
+
 void MofLexer::skipBlanksAndComments() {
     while (!atEnd()) {
         if (isBlank(current())) {
             advance();
         } else if (current() == '/' && peek(1) == '/') {
-            while (!atEnd() && current() != '\n')
-                advance();
+            skipLine();
         } else if (current() == '/' && peek(1) == '*') {
             skipBlockComment();
         } else {
@@ -178,8 +183,7 @@ bool MofLexer::startsPragma() {
     if (equalsIgnoringCase(word, "#pragma"))
         return true;
     report(start, shownText(word), "#pragma");
-    while (!atEnd() && current() != '\n')
-        advance();
+    skipLine();
     return false;
 }
 

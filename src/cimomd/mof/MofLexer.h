@@ -26,6 +26,7 @@ class MofLexer {
     char current() const { return atEnd() ? '\0' : text[offset]; }
     char peek(std::size_t distance) const;
     void advance();
+    void skipLine();
     void skipBlanksAndComments();
     void skipBlockComment();
     MofToken identifier();

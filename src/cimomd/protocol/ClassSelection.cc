@@ -11,7 +11,7 @@ std::vector<CIMName> selectClasses(const Pegasus::CimRequest& request, const Mod
     const bool deep = request.flag("DeepInheritance", false);
     if (!name.isNull())
         requiredClass(model, request, name, Pegasus::CIM_ERR_INVALID_CLASS);
-    const std::vector<CIMName> children =
+    std::vector<CIMName> children =
         name.isNull() ? model.classes->topClasses(request.nameSpace)
                       : model.classes->subclassesOf(request.nameSpace, name);
     if (!deep)

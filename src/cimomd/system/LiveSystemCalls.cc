@@ -13,6 +13,8 @@ std::int64_t LiveSystemCalls::now() const {
 }
 
 int LiveSystemCalls::utcOffsetMinutes(std::int64_t time) const {
+    // The administrator may have changed the zone since the last call.
+    ::tzset();
     const std::time_t seconds = time;
     std::tm local{};
     if (::localtime_r(&seconds, &local) == nullptr)

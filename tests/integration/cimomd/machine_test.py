@@ -169,7 +169,7 @@ class FileSystemTest(MachineTest):
     def test_file_systems(self):
         def told():
             return {target: (mount["fstype"], mount["source"].split("[")[0],
-                             "ro" in mount["options"].split(","))
+                             "ro" in mount["fs-options"].split(","))
                     for target, mount in tools.file_systems(self.recorded).items()}
 
         def ours():

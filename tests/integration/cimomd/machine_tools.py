@@ -79,7 +79,7 @@ def block_devices():
 def file_systems(recorded=None):
     """Mounted file systems on devices, and temporary ones outside of the system's directories."""
     options = [] if recorded is None else ["-F", str(recorded / "proc" / "self" / "mountinfo")]
-    mounts = json_of("findmnt", "-J", "-l", "-o", "TARGET,SOURCE,FSTYPE,MAJ:MIN,FSROOT,OPTIONS",
+    mounts = json_of("findmnt", "-J", "-l", "-o", "TARGET,SOURCE,FSTYPE,MAJ:MIN,FSROOT,FS-OPTIONS",
                      *options)["filesystems"]
     found = {}
     for place, mount in enumerate(mounts):

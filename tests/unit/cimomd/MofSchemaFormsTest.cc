@@ -112,6 +112,21 @@ TEST_F(MofSchemaFormsTest, letsAReferencePointToASubclassInAnOverride) {
               "none");
 }
 
+TEST_F(MofSchemaFormsTest, knowsASubclassOfAnAssociationForOne) {
+    EXPECT_EQ(mistakesIn("class A { [Key] string k; };\n"
+                         "[Association] class X { [Key] A REF a; [Key] A REF b; };\n"
+                         "[Aggregation] class Y : X { [Aggregate, Override(\"a\")] A REF a; };\n"),
+              "none");
+    EXPECT_EQ(mistakesIn("class P { [Key] string k; };\n[Aggregation] class Q : P { };\n"),
+              "t.mof:2:2: found Aggregation, expected a qualifier for a class");
+}
+
+TEST_F(MofSchemaFormsTest, countsLinesThatEndInACarriageReturn) {
+    EXPECT_EQ(mistakesIn("class A { };\r// a comment\rclass B : Missing { };\r\nwrong\r"),
+              "t.mof:3:11: found superclass Missing, expected a class that is declared\n"
+              "t.mof:4:1: found wrong, expected class, instance, qualifier or #pragma");
+}
+
 TEST_F(MofSchemaFormsTest, takesQualifiersOfTheDefaultNamespaceEverywhere) {
     EXPECT_EQ(mistakesIn("#pragma namespace (\"\\\\root\\\\other\")\n"
                          "class S_Elsewhere { [Key] string Id; };\n"

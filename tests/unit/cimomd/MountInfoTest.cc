@@ -29,6 +29,14 @@ TEST(MountInfo, takesReadOnlyFromTheFileSystem) {
     EXPECT_TRUE(mounts[1].readOnly);
 }
 
+TEST(MountInfo, takesAMountWithoutASource) {
+    const auto mounts = parseMountInfo("2 1 0:55 / /scratch rw - tmpfs  rw,size=4k\n");
+    ASSERT_EQ(mounts.size(), 1U);
+    EXPECT_EQ(mounts[0].mountPoint, "/scratch");
+    EXPECT_EQ(mounts[0].source, "");
+    EXPECT_TRUE(mounts[0].fileSystemOptions.has("size=4k"));
+}
+
 TEST(MountInfo, dropsIncompleteLines) {
     EXPECT_TRUE(parseMountInfo("").empty());
     EXPECT_TRUE(

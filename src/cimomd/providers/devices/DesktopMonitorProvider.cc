@@ -47,7 +47,7 @@ Fact<Uint16> displayTypeOf(const Fact<Edid>& edid) {
 
 /// The name, or what panels have in its place: maker and model as texts.
 Fact<std::string> modelOf(const Fact<Edid>& edid) {
-    const Fact<std::string> name = told<&Edid::name>(edid);
+    Fact<std::string> name = told<&Edid::name>(edid);
     if (name || !edid || edid->texts.empty())
         return name;
     return fmt::format("{}", fmt::join(edid->texts, " "));

@@ -65,7 +65,7 @@ void addFileSystemProperties(InstanceBuilder& builder, const char* className,
         .value<Pegasus::Boolean>("ReadOnly", mount.readOnly)
         .text("FileSystemType", mount.type)
         .value<Uint16>("PersistenceType", persistenceOf(mount.type))
-        .text("Device", mount.source)
+        .text("Device", mount.source.empty() ? Fact<std::string>() : mount.source)
         .value<Uint32>("FileSystemSizeMB", mebibytesOf(totalBytes))
         .value<Uint32>("AvailableSpaceMB", mebibytesOf(availableBytes));
 }

@@ -26,6 +26,7 @@ class HardwareNames {
         /// are 0.
         std::array<std::uint16_t, 4> numbers{};
 
+        // NOLINTNEXTLINE(modernize-use-nullptr): the check takes the comparison's 0 for a pointer.
         auto operator<=>(const Key&) const = default;
     };
     static Key vendor(std::uint16_t vendor);

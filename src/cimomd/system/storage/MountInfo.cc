@@ -13,7 +13,8 @@ constexpr std::size_t kFieldsAfterDash = 3;
 
 /// id parent major:minor root point options [tags...] - type source options
 std::optional<Mount> parseLine(std::string_view line) {
-    const std::vector<std::string_view> fields = fieldsOf(line);
+    // The source may be empty, so that two blanks follow each other.
+    const std::vector<std::string_view> fields = partsOf(line, ' ');
     if (fields.size() < kFixedFields)
         return std::nullopt;
     const auto dash = std::find(fields.begin() + kFixedFields, fields.end(), "-");
