@@ -8,10 +8,12 @@ namespace {
 Fact<bool> usageOf(const SmbiosStructure& structure) {
     constexpr std::uint8_t kAvailable = 3;
     constexpr std::uint8_t kInUse = 4;
-    const Fact<std::uint8_t> usage = structure.byte(0x07);
-    if (usage == kAvailable || usage == kInUse)
-        return usage == kInUse;
-    return Absence::Absent;
+    return structure.byte(0x07).then(
+        [](std::uint8_t usage) {
+            const bool isTold = usage == kAvailable || usage == kInUse;
+            return isTold ? std::optional(usage == kInUse) : std::nullopt;
+        },
+        Absence::Absent);
 }
 
 /// All bits set: no such address, the slot is for something else or empty.

@@ -128,7 +128,7 @@ Fact<std::string> HardwareNames::nameOf(const Key& key) const {
 }
 
 Fact<std::string> readHardwareList(const SystemPaths& paths, std::string_view fileName) {
-    const Fact<std::string> list = readText(paths.miscellaneousLists() / fileName, kMaxListBytes);
+    Fact<std::string> list = readText(paths.miscellaneousLists() / fileName, kMaxListBytes);
     if (list || list.reason() != Absence::Absent)
         return list;
     return readText(paths.hardwareLists() / fileName, kMaxListBytes);

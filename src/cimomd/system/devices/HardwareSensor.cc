@@ -60,6 +60,7 @@ void makeIdsUnique(std::vector<Chip>& chips) {
 std::vector<Chip> readChips(const std::filesystem::path& directory,
                             const std::vector<std::string>& names) {
     std::vector<Chip> chips;
+    chips.reserve(names.size());
     for (const std::string& name : names)
         chips.push_back(readChip(directory / name, name));
     std::sort(chips.begin(), chips.end(), [](const Chip& a, const Chip& b) {

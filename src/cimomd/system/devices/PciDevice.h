@@ -21,6 +21,7 @@ struct PciAddress {
     /// Below 8.
     std::uint8_t function = 0;
 
+    // NOLINTNEXTLINE(modernize-use-nullptr): the check takes the comparison's 0 for a pointer.
     auto operator<=>(const PciAddress&) const = default;
 };
 
