@@ -11,9 +11,9 @@ std::vector<CIMName> selectClasses(const Pegasus::CimRequest& request, const Mod
     const bool deep = request.flag("DeepInheritance", false);
     if (!name.isNull())
         requiredClass(model, request, name, Pegasus::CIM_ERR_INVALID_CLASS);
-    std::vector<CIMName> children =
-        name.isNull() ? model.classes->topClasses(request.nameSpace)
-                      : model.classes->subclassesOf(request.nameSpace, name);
+    std::vector<CIMName> children = name.isNull()
+                                        ? model.classes->topClasses(request.nameSpace)
+                                        : model.classes->subclassesOf(request.nameSpace, name);
     if (!deep)
         return children;
     std::vector<CIMName> all;
