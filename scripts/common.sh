@@ -43,20 +43,26 @@ BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev lib
 # shellcheck disable=SC2034
 TEST_PACKAGES=(libgtest-dev libgmock-dev rpm python3 mariadb-server postgresql-15 shellcheck
     sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode)
+# shellcheck disable=SC2034
+BENCHMARK_PACKAGES=(libexpat1-dev libbenchmark-dev python3)
 
-# Configures a preset unless that is done, and builds it. What a quiet build prints is shown when
-# it fails.
-build_preset() {
-    local preset=$1 log
+# Runs a command whose output is shown only when it fails; the first argument says what it does.
+quietly() {
+    local what=$1 log
     shift
     log=$(mktemp)
-    if [ ! -f "$ROOT/build/$preset/build.ninja" ]; then
-        step "configuring $preset"
-        (cd "$ROOT" && cmake --preset "$preset") >"$log" 2>&1 ||
-            { cat "$log" >&2; rm -f "$log"; fail "configuring $preset failed"; }
-    fi
-    step "building $preset"
-    (cd "$ROOT" && cmake --build --preset "$preset" "$@") >"$log" 2>&1 ||
-        { cat "$log" >&2; rm -f "$log"; fail "building $preset failed"; }
+    step "$what"
+    "$@" >"$log" 2>&1 || { cat "$log" >&2; rm -f "$log"; fail "$what failed"; }
     rm -f "$log"
+}
+
+# Further arguments go to cmake.
+configure_preset() {
+    (cd "$ROOT" && quietly "configuring $1" cmake --preset "$@")
+}
+
+# Configures a preset unless that is done, and builds it. Further arguments go to the build.
+build_preset() {
+    [ -f "$ROOT/build/$1/build.ninja" ] || configure_preset "$1"
+    (cd "$ROOT" && quietly "building $1" cmake --build --preset "$@")
 }
