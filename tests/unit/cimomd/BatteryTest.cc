@@ -58,6 +58,15 @@ TEST_F(BatteryTest, filtersAmountsThatCannotBeTrue) {
     EXPECT_EQ(battery.designMilliwattHours.reason(), Absence::Filtered);
 }
 
+TEST_F(BatteryTest, takesNoNumberThatASignedOneCannotHold) {
+    says("energy_full", "2147483648000").says("energy_full_design", "2147483647999");
+    says("cycle_count", "2147483648");
+    const Battery battery = read();
+    EXPECT_EQ(battery.designMilliwattHours, 2147483647U);
+    EXPECT_EQ(battery.fullMilliwattHours.reason(), Absence::Filtered);
+    EXPECT_FALSE(battery.fullMilliwattHours || battery.chargeCycles);
+}
+
 TEST_F(BatteryTest, doesNotOverflow) {
     says("charge_full_design", "18446744073709551615").says("charge_full", "4294967295");
     says("voltage_min_design", "4294967295");

@@ -63,7 +63,13 @@ TEST(Firmware, hasTheSizeOfItsMemory) {
     EXPECT_EQ(extended(0x4001), 1024U * 1024);
     EXPECT_EQ(extended(0x0000), std::nullopt);
     EXPECT_EQ(extended(0x8001), std::nullopt);
-    EXPECT_EQ(firmwareIn(SmbiosFields(kFirmware, 0x18).byte(9, 0xFF)).romKB, std::nullopt);
+    // 8191 GB fit 32 bits in no unit below; 2047 GB do.
+    EXPECT_EQ(extended(0x5FFF), std::nullopt);
+    EXPECT_EQ(extended(0x47FF), 2047U * 1024 * 1024);
+    EXPECT_EQ(extended(0x4800), std::nullopt);
+    // Tables without the longer field tell 256 steps of 64 KB at most.
+    EXPECT_EQ(firmwareIn(SmbiosFields(kFirmware, 0x18).byte(9, 0xFF)).romKB, 16384U);
+    EXPECT_EQ(firmwareIn(SmbiosFields(kFirmware, 0x12).byte(9, 0xFF)).romKB, 16384U);
 }
 
 TEST(Firmware, hasReleases) {

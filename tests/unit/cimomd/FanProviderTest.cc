@@ -27,10 +27,14 @@ TEST(FanProvider, tellsTheStatus) {
     EXPECT_EQ(statusAt(Absence::Unreadable, unknown, unknown), "null");
 }
 
-TEST(FanProvider, hasNoSpeedFromANegativeReading) {
+TEST(FanProvider, hasNoSpeedFromAReadingThatIsNone) {
     HardwareSensor fan;
     fan.reading = -1;
     EXPECT_EQ(textOf(FanProvider::publish("node7", fan).instance, "SpeedRPM"), "null");
+    fan.reading = std::int64_t{1} << 31;
+    EXPECT_EQ(textOf(FanProvider::publish("node7", fan).instance, "SpeedRPM"), "null");
+    fan.reading = 2147483647;
+    EXPECT_EQ(textOf(FanProvider::publish("node7", fan).instance, "SpeedRPM"), "2147483647");
 }
 
 }  // namespace

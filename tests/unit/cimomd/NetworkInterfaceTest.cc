@@ -84,9 +84,13 @@ TEST(NetworkInterface, ordersByTheNumbersInNames) {
 TEST(NetworkInterface, takesAnUnknownSpeedAsNothing) {
     RecordedTree tree;
     tree.file("net/a/speed", "-1\n").file("net/b/speed", "4294967295\n").file("net/c/speed", "0\n");
+    tree.file("net/d/speed", "2147483648\n").file("net/e/speed", "2147483647\n");
     tree.file("net/a/duplex", "unknown\n").file("net/b/duplex", "half\n");
     const auto interfaces = readNetworkInterfaces(tree.root / "net");
-    ASSERT_EQ(interfaces->size(), 3U);
+    ASSERT_EQ(interfaces->size(), 5U);
+    // The kernel has no speeds above what a signed number holds.
+    EXPECT_EQ((*interfaces)[3].speedMbps, std::nullopt);
+    EXPECT_EQ((*interfaces)[4].speedMbps, 2147483647U);
     EXPECT_EQ((*interfaces)[0].speedMbps, std::nullopt);
     EXPECT_EQ((*interfaces)[1].speedMbps, std::nullopt);
     EXPECT_EQ((*interfaces)[2].speedMbps, std::nullopt);

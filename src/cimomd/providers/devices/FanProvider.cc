@@ -64,7 +64,7 @@ ProvidedInstance FanProvider::publish(const std::string& hostName, const Hardwar
         .value<Boolean>("ActiveCooling", true)
         .value<Boolean>("VariableSpeed", variableSpeedOf(fan))
         .value<Uint64>("DesiredSpeed", fan.targetRpm)
-        .value<Uint32>("SpeedRPM", fan.reading.then(narrowedTo<Uint32, std::int64_t>));
+        .value<Uint32>("SpeedRPM", fan.reading.then(narrowedToCount<std::int64_t>));
     return builder.take();
 }
 

@@ -2,9 +2,9 @@
 
 #include "providers/EnumeratedValues.h"
 #include "providers/InstanceBuilder.h"
+#include "providers/Megabytes.h"
 #include "providers/RecordStream.h"
 #include "providers/devices/HardwareTitle.h"
-#include "system/Narrowing.h"
 #include "system/computer/SystemIdentity.h"
 
 namespace cimomd {
@@ -12,8 +12,6 @@ namespace {
 
 using Pegasus::Uint16;
 using Pegasus::Uint32;
-
-constexpr std::uint64_t kBytesPerMB = std::uint64_t{1} << 20;
 
 }  // namespace
 
@@ -42,9 +40,7 @@ ProvidedInstance VideoControllerProvider::publish(const std::string& hostName,
         .text("HardwareId", hardwareId)
         .text("VendorName", controller.vendorName)
         .text("Driver", controller.driver)
-        .value<Uint32>("VideoMemoryMB", controller.memoryBytes.then([](std::uint64_t bytes) {
-            return narrowedTo<Uint32>(bytes / kBytesPerMB);
-        }));
+        .value<Uint32>("VideoMemoryMB", megabytesOf(controller.memoryBytes));
     return builder.take();
 }
 

@@ -53,8 +53,8 @@ Fact<std::string> macAddress(const NetworkInterface& interface) {
 
 Fact<Uint32> dataBits(const Fact<std::uint64_t>& mtuBytes) {
     return mtuBytes.then([](std::uint64_t bytes) {
-        const auto narrow = narrowedTo<Uint32>(bytes);
-        return narrow ? narrowedTo<Uint32>(std::uint64_t{*narrow} * 8) : std::nullopt;
+        const auto narrow = narrowedToCount(bytes);
+        return narrow ? narrowedToCount(std::uint64_t{*narrow} * 8) : std::nullopt;
     });
 }
 
@@ -77,7 +77,7 @@ ProvidedInstance LanEndpointProvider::publish(const std::string& hostName,
         .value<Uint16>("ProtocolIFType", interfaceTypeOf(interface))
         .text("MACAddress", macAddress(interface))
         .value<Uint32>("MaxDataSize", dataBits(interface.mtuBytes))
-        .value<Uint32>("MTU", interface.mtuBytes.then(narrowedTo<Uint32, std::uint64_t>));
+        .value<Uint32>("MTU", interface.mtuBytes.then(narrowedToCount<std::uint64_t>));
     return builder.take();
 }
 

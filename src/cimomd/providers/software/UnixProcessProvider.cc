@@ -8,6 +8,7 @@
 #include "providers/EnumeratedValues.h"
 #include "providers/InstanceBuilder.h"
 #include "providers/software/OperatingSystemProvider.h"
+#include "system/Narrowing.h"
 #include "system/computer/SystemIdentity.h"
 #include "system/software/KernelTables.h"
 #include "system/software/OsRelease.h"
@@ -60,21 +61,6 @@ Uint16 operationalStatusOf(char state) {
         default:
             return kOperationalUnknown;
     }
-}
-
-/// A number that is not negative, and stays so where it is read as a signed one.
-template <typename From>
-std::optional<Uint32> asUint32(From number) {
-    if (number < 0 || number > std::numeric_limits<std::int32_t>::max())
-        return std::nullopt;
-    return static_cast<Uint32>(number);
-}
-
-std::optional<Pegasus::Sint32> asSint32(std::int64_t number) {
-    if (number < std::numeric_limits<Pegasus::Sint32>::min() ||
-        number > std::numeric_limits<Pegasus::Sint32>::max())
-        return std::nullopt;
-    return static_cast<Pegasus::Sint32>(number);
 }
 
 /// What the process table tells of every process.
@@ -214,7 +200,7 @@ ProvidedInstance UnixProcessProvider::publish(const ProcessSurroundings& surroun
         .text("OSName", surroundings.osName, kSystemNameLength)
         .text("CreationClassName", kClassName)
         .key("Handle", handle)
-        .value<Uint32>("Priority", told(status.priority).then(asUint32<std::int64_t>))
+        .value<Uint32>("Priority", told(status.priority).then(narrowedToCount<std::int64_t>))
         .value<Uint16>("ExecutionState", executionStateOf(status.state))
         .value<Pegasus::CIMDateTime>("CreationDate", creationDateOf(surroundings, process))
         .value<Uint64>("KernelModeTime", milliseconds(status.kernelTicks))
@@ -229,12 +215,14 @@ ProvidedInstance UnixProcessProvider::publish(const ProcessSurroundings& surroun
         .text("ProcessTTY", terminalOf(status.terminal))
         .text("ModulePath", process.executable)
         .texts("Parameters", process.commandLine)
-        .value<Uint32>("ProcessNiceValue", told(status.nice).then(asUint32<std::int64_t>))
+        .value<Uint32>("ProcessNiceValue", told(status.nice).then(narrowedToCount<std::int64_t>))
         .text("UserName", userName)
-        .value<Pegasus::Sint32>("Nice", told(status.nice).then(asSint32))
-        .value<Uint32>("ProcessorSeconds", processorTimeOf(status).then(asUint32<std::uint64_t>))
+        .value<Pegasus::Sint32>("Nice",
+                                told(status.nice).then(narrowedTo<Pegasus::Sint32, std::int64_t>))
+        .value<Uint32>("ProcessorSeconds",
+                       processorTimeOf(status).then(narrowedToCount<std::uint64_t>))
         .value<Uint32>("WorkingSetSizeKB",
-                       process.ownership.residentKB.then(asUint32<std::uint64_t>));
+                       process.ownership.residentKB.then(narrowedToCount<std::uint64_t>));
     return builder.take();
 }
 

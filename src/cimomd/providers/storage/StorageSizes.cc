@@ -1,8 +1,6 @@
 #include "providers/storage/StorageSizes.h"
 
-#include <limits>
-#include <optional>
-
+#include "system/Narrowing.h"
 #include "system/storage/BlockDevice.h"
 
 namespace cimomd {
@@ -12,11 +10,7 @@ constexpr std::uint64_t kBinaryMegabyte = std::uint64_t{1} << 20;
 constexpr std::uint64_t kDecimalMegabyte = 1000000;
 
 Fact<std::uint32_t> inUnitsOf(std::uint64_t unit, const Fact<std::uint64_t>& number) {
-    return number.then([unit](std::uint64_t value) {
-        const std::uint64_t units = value / unit;
-        const bool fits = units <= std::numeric_limits<std::int32_t>::max();
-        return fits ? std::optional(static_cast<std::uint32_t>(units)) : std::nullopt;
-    });
+    return number.then([unit](std::uint64_t value) { return narrowedToCount(value / unit); });
 }
 
 }  // namespace

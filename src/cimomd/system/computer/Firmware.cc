@@ -5,6 +5,7 @@
 #include <chrono>
 
 #include "files/TextFields.h"
+#include "system/Narrowing.h"
 #include "system/computer/FirmwareText.h"
 #include "text/Utf8.h"
 
@@ -21,19 +22,24 @@ Fact<std::string> releaseAt(const SmbiosStructure& structure, std::size_t offset
     return fmt::format("{}.{}", *majorNumber, *minorNumber);
 }
 
+/// Two bits for the unit, megabytes or gigabytes, and the number of them.
+std::optional<std::uint32_t> extendedRomKB(std::uint16_t bits) {
+    const unsigned unit = bits >> 14U;
+    const std::uint64_t size = bits & 0x3FFFU;
+    if (size == 0 || unit > 1)
+        return std::nullopt;
+    return narrowedToCount(unit == 0 ? size << 10U : size << 20U);
+}
+
 Fact<std::uint32_t> romSizeOf(const SmbiosStructure& structure) {
-    constexpr std::uint8_t kSeeExtended = 0xFF;
+    constexpr std::uint8_t kMaySeeExtended = 0xFF;
     constexpr std::uint32_t kKBPerStep = 64;
     const Fact<std::uint8_t> steps = structure.byte(0x09);
-    if (steps != kSeeExtended)
-        return steps.then([](std::uint8_t count) { return (count + 1U) * kKBPerStep; });
-    return structure.word(0x18).then([](std::uint16_t bits) -> std::optional<std::uint32_t> {
-        const unsigned unit = bits >> 14U;
-        const std::uint32_t size = bits & 0x3FFFU;
-        if (size == 0 || unit > 1)
-            return std::nullopt;
-        return unit == 0 ? size << 10U : size << 20U;
-    });
+    const Fact<std::uint16_t> extended = structure.word(0x18);
+    // Before SMBIOS 3.1 there was nothing to see further: 16 MiB were just the most.
+    if (steps == kMaySeeExtended && extended)
+        return extended.then(extendedRomKB);
+    return steps.then([](std::uint8_t count) { return (count + 1U) * kKBPerStep; });
 }
 
 Fact<CalendarDate> dateOf(const Fact<std::string>& text) {

@@ -38,7 +38,7 @@ Fact<std::uint32_t> readCapacity(const std::filesystem::path& directory, const s
     const auto energy = readAmount(directory / ("energy_" + which));
     if (energy)
         return energy.then([](std::uint64_t microwattHours) {
-            return narrowedTo<std::uint32_t>(microwattHours / kMicroPerMilli);
+            return narrowedToCount(microwattHours / kMicroPerMilli);
         });
     const auto charge = readAmount(directory / ("charge_" + which));
     if (!charge)
@@ -50,7 +50,7 @@ Fact<std::uint32_t> readCapacity(const std::filesystem::path& directory, const s
         .then([&](std::uint64_t microampereHours) {
             return milliwattHours(microampereHours, *microvolts);
         })
-        .then(narrowedTo<std::uint32_t, std::uint64_t>);
+        .then(narrowedToCount<std::uint64_t>);
 }
 
 Fact<std::uint16_t> readPercent(const std::filesystem::path& path) {
@@ -76,8 +76,7 @@ Battery readBattery(const std::filesystem::path& directory, const std::string& n
         });
     out.remainingPercent = readPercent(directory / "capacity");
     // Drivers write 0 when the firmware does not count.
-    out.chargeCycles =
-        readAmount(directory / "cycle_count").then(narrowedTo<std::uint32_t, std::uint64_t>);
+    out.chargeCycles = readAmount(directory / "cycle_count").then(narrowedToCount<std::uint64_t>);
     return out;
 }
 

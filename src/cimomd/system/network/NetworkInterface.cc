@@ -37,7 +37,7 @@ Fact<std::uint64_t> readSpeed(const std::filesystem::path& path) {
     return ofLink(readSignedNumber(path))
         .then(
             [](std::int64_t speed) {
-                const bool isKnown = speed > 0 && speed < std::numeric_limits<std::uint32_t>::max();
+                const bool isKnown = speed > 0 && speed <= std::numeric_limits<std::int32_t>::max();
                 return isKnown ? std::optional(static_cast<std::uint64_t>(speed)) : std::nullopt;
             },
             Absence::Absent);
