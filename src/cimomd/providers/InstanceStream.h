@@ -16,7 +16,8 @@ class InstanceStream {
     /// the source fails midway.
     virtual bool next(ProvidedInstance& out) = 0;
 
-    /// Why there are no instances, when something is in the way of finding any.
+    /// Why there are no instances, or not all, when something is in the way of finding them. To be
+    /// asked at the end.
     virtual std::optional<Absence> absence() const { return std::nullopt; }
 
   protected:

@@ -55,8 +55,38 @@ TEST_F(ProcessorProviderTest, publishesPackages) {
     EXPECT_EQ(textOf(instances[1], "Manufacturer"), "null");
 }
 
-TEST_F(ProcessorProviderTest, failsOnAMachineThatTellsNothing) {
-    EXPECT_THROW(ProcessorProvider(tree.paths()).enumerate(), ProviderError);
+TEST_F(ProcessorProviderTest, saysWhyThereAreNone) {
+    const auto reason = [this] {
+        const auto stream = ProcessorProvider(tree.paths()).enumerate();
+        ProvidedInstance provided;
+        EXPECT_FALSE(stream->next(provided));
+        return stream->absence();
+    };
+    EXPECT_EQ(reason(), Absence::Absent);
+    tree.file("proc/cpuinfo", "nothing\n");
+    EXPECT_EQ(reason(), Absence::Unreadable);
+}
+
+// Virtual machines may show the directories of processors without topology: there were no
+// processors at all then.
+TEST_F(ProcessorProviderTest, doesWithoutTopology) {
+    tree.file("sys/devices/system/cpu/cpu0/cpufreq/cpuinfo_max_freq", "2400000\n")
+        .directory("sys/devices/system/cpu/cpu1")
+        .directory("sys/devices/system/cpu/cpu2")
+        .file("proc/cpuinfo",
+              "processor: 0\nphysical id: 0\ncore id: 0\nmodel name: Q\n\n"
+              "processor: 1\nphysical id: 0\ncore id: 1\nmodel name: Q\n");
+    const auto stream = ProcessorProvider(tree.paths()).enumerate();
+    ProvidedInstance provided;
+    ASSERT_TRUE(stream->next(provided));
+    EXPECT_EQ(textOf(provided.instance, "DeviceID"), "CPU0");
+    EXPECT_EQ(textOf(provided.instance, "Model"), "Q");
+    EXPECT_EQ(textOf(provided.instance, "NumberOfEnabledCores"), "2");
+    // The third is off line.
+    EXPECT_EQ(textOf(provided.instance, "NumberOfEnabledThreads"), "2");
+    EXPECT_EQ(textOf(provided.instance, "MaxClockSpeed"), "2400");
+    EXPECT_FALSE(stream->next(provided));
+    EXPECT_EQ(stream->absence(), std::nullopt);
 }
 
 InstalledProcessor onlySocket(std::uint8_t status) {

@@ -117,15 +117,17 @@ Fact<std::vector<ProcessorSocket>> readSockets(const SystemPaths& paths) {
 
 std::unique_ptr<InstanceStream> ProcessorProvider::enumerate() const {
     const auto text = readText(paths.processors(), kMaxCpuInfoBytes);
-    std::vector<LogicalProcessor> processors = readLogicalProcessors(paths.logicalProcessors());
-    if (!text && processors.empty())
-        throw ProviderError("neither the processor topology nor /proc/cpuinfo can be read");
+    const std::vector<ProcessorPackage> packages = groupByPackage(
+        readLogicalProcessors(paths.logicalProcessors()), parseCpuInfo(text.value_or("")));
+    // Something must be running this.
+    std::optional<Absence> incompleteness;
+    if (packages.empty())
+        incompleteness = text ? Absence::Unreadable : text.reason();
     const std::string hostName = readHostName(paths);
-    const std::vector<ProcessorPackage> packages =
-        groupByPackage(std::move(processors), parseCpuInfo(text.value_or("")));
     return std::make_unique<RecordStream<InstalledProcessor>>(
         installedProcessors(packages, readSockets(paths)),
-        [hostName](const InstalledProcessor& processor) { return publish(hostName, processor); });
+        [hostName](const InstalledProcessor& processor) { return publish(hostName, processor); },
+        incompleteness);
 }
 
 ProvidedInstance ProcessorProvider::publish(const std::string& hostName,

@@ -28,10 +28,21 @@ std::uint16_t clamped(std::size_t count) {
         std::min<std::size_t>(count, std::numeric_limits<std::uint16_t>::max()));
 }
 
-std::vector<LogicalProcessor> fromInfos(const std::vector<CpuInfo>& infos) {
+bool haveTopology(const std::vector<LogicalProcessor>& processors) {
+    return std::any_of(processors.begin(), processors.end(), [](const LogicalProcessor& processor) {
+        return processor.packageId.has_value();
+    });
+}
+
+/// The processors of `infos` with their ids from there, the rest from `known`.
+std::vector<LogicalProcessor> fromInfos(const std::vector<CpuInfo>& infos,
+                                        const std::vector<LogicalProcessor>& known) {
+    std::map<std::uint64_t, LogicalProcessor> byNumber;
+    for (const LogicalProcessor& processor : known)
+        byNumber.emplace(processor.number, processor);
     std::vector<LogicalProcessor> out;
     for (const CpuInfo& info : infos) {
-        LogicalProcessor processor;
+        LogicalProcessor processor = byNumber[info.processor];
         processor.number = info.processor;
         processor.packageId = info.packageId.value_or(0);
         processor.coreId = info.coreId;
@@ -71,8 +82,8 @@ void add(const CpuInfo& info, ProcessorPackage& package) {
 
 std::vector<ProcessorPackage> groupByPackage(std::vector<LogicalProcessor> processors,
                                              const std::vector<CpuInfo>& infos) {
-    if (processors.empty())
-        processors = fromInfos(infos);
+    if (!haveTopology(processors))
+        processors = fromInfos(infos, processors);
     std::map<std::uint64_t, const CpuInfo*> infoOf;
     for (const CpuInfo& info : infos)
         infoOf.emplace(info.processor, &info);

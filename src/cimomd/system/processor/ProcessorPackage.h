@@ -26,8 +26,8 @@ struct ProcessorPackage {
     std::uint16_t threads = 0;
 };
 
-/// One package per number, ascending. Processors that are off line count nowhere. Without
-/// `processors` the ids of `infos` are taken.
+/// One package per number, ascending. Processors that are off line count nowhere. When `processors`
+/// tell no ids at all, as in kernels without topology, those of `infos` are taken.
 std::vector<ProcessorPackage> groupByPackage(std::vector<LogicalProcessor> processors,
                                              const std::vector<CpuInfo>& infos);
 
