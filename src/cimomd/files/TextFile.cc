@@ -50,18 +50,21 @@ Fact<std::int64_t> readSignedNumber(const std::filesystem::path& path) {
     return readFact(path).then([](const std::string& text) { return parseSigned(text); });
 }
 
-Fact<std::vector<std::string>> listDirectory(const std::filesystem::path& path) {
+Fact<std::vector<std::string>> listDirectory(const std::filesystem::path& path,
+                                             std::size_t maxEntries) {
     std::error_code error;
     std::filesystem::directory_iterator entry(path, error);
     if (error)
         return absenceOf(error);
     std::vector<std::string> names;
     const std::filesystem::directory_iterator end;
-    while (entry != end && names.size() < kMaxListedEntries) {
+    while (entry != end) {
+        if (names.size() == maxEntries)
+            return Absence::Unreadable;
         names.push_back(entry->path().filename().string());
         entry.increment(error);
         if (error)
-            break;
+            return absenceOf(error);
     }
     std::sort(names.begin(), names.end());
     return names;

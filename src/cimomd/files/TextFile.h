@@ -15,7 +15,8 @@
 namespace cimomd {
 
 inline constexpr std::size_t kMaxSmallFileBytes = std::size_t{64} << 10;
-inline constexpr std::size_t kMaxListedEntries = 100000;
+/// A fourth of the processes that a kernel can number; no other directory has nearly as many.
+inline constexpr std::size_t kMaxListedEntries = std::size_t{1} << 20;
 
 /// Why there is no value when a file could not be read, or a system call failed.
 Absence absenceOf(FileStatus status);
@@ -34,8 +35,9 @@ Fact<std::uint64_t> readNumber(const std::filesystem::path& path);
 /// The same, negative numbers included.
 Fact<std::int64_t> readSignedNumber(const std::filesystem::path& path);
 
-/// The names in a directory in byte order, at most kMaxListedEntries of them; nothing when the
-/// directory cannot be read.
-Fact<std::vector<std::string>> listDirectory(const std::filesystem::path& path);
+/// The names in a directory in byte order; nothing when it cannot be read to its end, or has more
+/// than `maxEntries`: what would be missing from a part of the names could not be told.
+Fact<std::vector<std::string>> listDirectory(const std::filesystem::path& path,
+                                             std::size_t maxEntries = kMaxListedEntries);
 
 }  // namespace cimomd

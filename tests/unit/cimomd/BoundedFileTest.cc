@@ -76,5 +76,15 @@ TEST(TextFile, listsNamesInByteOrder) {
     EXPECT_EQ(listDirectory(tree.root / "none"), std::nullopt);
 }
 
+// A part of the names looked like all of them.
+TEST(TextFile, listsAllNamesOrNone) {
+    RecordedTree tree;
+    tree.file("d/a", "").file("d/b", "").file("d/c", "");
+    EXPECT_EQ(listDirectory(tree.root / "d", 3), (std::vector<std::string>{"a", "b", "c"}));
+    const auto tooMany = listDirectory(tree.root / "d", 2);
+    ASSERT_FALSE(tooMany);
+    EXPECT_EQ(tooMany.reason(), Absence::Unreadable);
+}
+
 }  // namespace
 }  // namespace cimomd

@@ -44,6 +44,35 @@ TEST(NextHopIpRouteProvider, doesWithOneVersion) {
     ASSERT_EQ(instances.size(), 1U);
     EXPECT_EQ(textOf(instances[0], "AddressType"), "2");
     EXPECT_EQ(textOf(instances[0], "TypeOfRoute"), "4");
+    EXPECT_EQ(textOf(instances[0], "RouteMetric"), "1024");
+    EXPECT_EQ(textOf(instances[0], "MetricText"), "1024");
+    EXPECT_EQ(NextHopIpRouteProvider(tree.paths()).enumerate()->absence(), std::nullopt);
+}
+
+// The column of metrics had a 0 for one that takes more than 16 bits.
+TEST(NextHopIpRouteProvider, tellsLongMetricsAsText) {
+    RecordedTree tree;
+    tree.file("proc/net/route",
+              "Iface\neth0\t0000000A\t00000000\t0001\t0\t0\t4294967295\t000000FF\t0\t0\t0\n");
+    const auto instances = all(NextHopIpRouteProvider(tree.paths()).enumerate());
+    ASSERT_EQ(instances.size(), 1U);
+    EXPECT_EQ(textOf(instances[0], "RouteMetric"), "null");
+    EXPECT_EQ(textOf(instances[0], "MetricText"), "4294967295");
+}
+
+// Where one table could not be read, its routes were missing without a word.
+TEST(NextHopIpRouteProvider, saysWhenATableCannotBeRead) {
+    RecordedTree tree;
+    tree.file("proc/net/route",
+              "Iface\neth0\t0000000A\t00000000\t0001\t0\t0\t0\t000000FF\t0\t0\t0\n")
+        .directory("proc/net/ipv6_route");
+    const auto stream = NextHopIpRouteProvider(tree.paths()).enumerate();
+    ProvidedInstance provided;
+    EXPECT_TRUE(stream->next(provided));
+    EXPECT_FALSE(stream->next(provided));
+    EXPECT_EQ(stream->absence(), Absence::Unreadable);
+    std::filesystem::remove(tree.root / "proc/net/route");
+    EXPECT_EQ(NextHopIpRouteProvider(tree.paths()).enumerate()->absence(), Absence::Unreadable);
 }
 
 }  // namespace

@@ -103,6 +103,25 @@ TEST_F(SoftwareIdentityProviderTest, joinsBothKindsAndKeepsNoPackageTwice) {
     EXPECT_EQ(textOf(instances[1], "InstanceID"), "Velmira:rpm:b-1-2.x");
 }
 
+// A database that could not be read was as good as none when there was another one.
+TEST_F(SoftwareIdentityProviderTest, saysWhenADatabaseCannotBeRead) {
+    tree.file("var/lib/dpkg/status", "").file("var/lib/rpm/Packages", "");
+    const auto tool = [this](const char* name, const std::string& commands) {
+        tree.file(name, "#!/bin/sh\n" + commands + "\n");
+        std::filesystem::permissions(tree.root / name, std::filesystem::perms::owner_all);
+        return tree.root / name;
+    };
+    const SoftwareIdentityProvider provider(
+        tree.paths(), calls,
+        {tool("dpkg-query", "printf 'installed\\037a\\037all\\0371\\037M\\037s\\0371\\037t\\036'"),
+         tool("rpm", "exit 1")});
+    const auto stream = provider.enumerate();
+    ProvidedInstance provided;
+    EXPECT_TRUE(stream->next(provided));
+    EXPECT_FALSE(stream->next(provided));
+    EXPECT_EQ(stream->absence(), Absence::Unreadable);
+}
+
 TEST_F(SoftwareIdentityProviderTest, saysWhyThereAreNoPackages) {
     const SoftwareIdentityProvider provider(tree.paths(), calls);
     const auto nothing = provider.enumerate();

@@ -62,19 +62,31 @@ std::string instanceIdOf(const Route& route, std::size_t number) {
     return number == 1 ? id : id + fmt::format(" #{}", number);
 }
 
+/// A kernel may lack one of the protocols; a table that is there must be read.
+std::optional<Absence> hindranceOf(const Fact<std::vector<Route>>& ipv4,
+                                   const Fact<std::vector<Route>>& ipv6) {
+    for (const auto* routes : {&ipv4, &ipv6}) {
+        if (!*routes && routes->reason() != Absence::Absent)
+            return routes->reason();
+    }
+    return std::nullopt;
+}
+
 }  // namespace
 
 std::unique_ptr<InstanceStream> NextHopIpRouteProvider::enumerate() const {
     const auto ipv4 = readText(paths.ipv4Routes(), kMaxTableBytes).then(parseIpv4Routes);
     const auto ipv6 = readText(paths.ipv6Routes(), kMaxTableBytes).then(parseIpv6Routes);
+    const std::optional<Absence> incompleteness = hindranceOf(ipv4, ipv6);
     if (!ipv4 && !ipv6)
-        return std::make_unique<EmptyStream>(ipv4.reason());
+        return std::make_unique<EmptyStream>(incompleteness.value_or(Absence::Absent));
     std::vector<Route> routes = ipv4.value_or({});
     const std::vector<Route> more = ipv6.value_or({});
     routes.insert(routes.end(), more.begin(), more.end());
     return std::make_unique<RecordStream<NumberedRoute>>(
         inOrder(std::move(routes)),
-        [](const NumberedRoute& entry) { return publish(entry.route, entry.number); });
+        [](const NumberedRoute& entry) { return publish(entry.route, entry.number); },
+        incompleteness);
 }
 
 ProvidedInstance NextHopIpRouteProvider::publish(const Route& route, std::size_t number) {
@@ -90,6 +102,7 @@ ProvidedInstance NextHopIpRouteProvider::publish(const Route& route, std::size_t
         .value<Uint16>("AddressType", isV4 ? kAddressTypeIpv4 : kAddressTypeIpv6)
         .value<Uint16>("RouteMetric",
                        Fact(std::optional(route.metric)).then(narrowedTo<Uint16, std::uint32_t>))
+        .text("MetricText", std::to_string(route.metric))
         .value<Uint16>("TypeOfRoute", kActualRoute)
         .text("GatewayAddress", Fact(route.gateway).then(std::mem_fn(&IpAddress::text)))
         .text("InterfaceName", route.interfaceName);

@@ -8,6 +8,7 @@
 #include "providers/EnumeratedValues.h"
 #include "providers/InstanceBuilder.h"
 #include "providers/RecordStream.h"
+#include "system/Narrowing.h"
 #include "system/software/DebianPackages.h"
 #include "system/software/RpmPackages.h"
 #include "system/software/VersionNumbers.h"
@@ -52,34 +53,34 @@ Fact<std::vector<std::string>> classificationTextsOf(const SoftwarePackage& pack
 
 }  // namespace
 
-Fact<std::vector<SoftwarePackage>> SoftwareIdentityProvider::read() const {
-    std::vector<SoftwarePackage> packages;
-    Absence reason = Absence::Absent;
+SoftwareIdentityProvider::Listing SoftwareIdentityProvider::read() const {
+    Listing listing;
+    bool isAnyThere = false;
     const auto take = [&](Fact<std::vector<SoftwarePackage>> found) {
+        isAnyThere = isAnyThere || found.has_value();
         if (found)
-            std::move((*found).begin(), (*found).end(), std::back_inserter(packages));
+            std::move((*found).begin(), (*found).end(), std::back_inserter(listing.packages));
         else if (found.reason() != Absence::Absent)
-            reason = found.reason();
-        return found.has_value();
+            listing.whyNotAll = found.reason();
     };
-    bool isAnyThere = take(readDebianPackages(paths.debianPackages(), tools.dpkgQuery));
+    take(readDebianPackages(paths.debianPackages(), tools.dpkgQuery));
     for (const auto& directory : {paths.rpmPackages(), paths.vendorRpmPackages()})
-        isAnyThere = take(readRpmPackages(directory, tools.rpm)) || isAnyThere;
-    if (!isAnyThere)
-        return reason;
-    sortAndUnite(packages);
-    return packages;
+        take(readRpmPackages(directory, tools.rpm));
+    if (!isAnyThere && !listing.whyNotAll)
+        listing.whyNotAll = Absence::Absent;
+    sortAndUnite(listing.packages);
+    return listing;
 }
 
 std::unique_ptr<InstanceStream> SoftwareIdentityProvider::enumerate() const {
-    Fact<std::vector<SoftwarePackage>> packages = read();
-    if (!packages)
-        return std::make_unique<EmptyStream>(packages.reason());
+    Listing listing = read();
     return std::make_unique<RecordStream<SoftwarePackage>>(
-        std::move(*packages), [&clock = calls](const SoftwarePackage& package) {
+        std::move(listing.packages),
+        [&clock = calls](const SoftwarePackage& package) {
             const std::int64_t time = package.installTime.value_or(0);
             return publish(package, clock.utcOffsetMinutes(time));
-        });
+        },
+        listing.whyNotAll);
 }
 
 ProvidedInstance SoftwareIdentityProvider::publish(const SoftwarePackage& package,
@@ -106,9 +107,7 @@ ProvidedInstance SoftwareIdentityProvider::publish(const SoftwarePackage& packag
                 return cimTimeOf(time, utcOffsetMinutes);
             }))
         .text("Architecture", package.architecture, kShortTextLength)
-        .value<Uint32>("InstalledSizeKB", package.installedKB.then([](std::uint64_t size) {
-            return size > INT32_MAX ? std::nullopt : std::optional(static_cast<Uint32>(size));
-        }));
+        .value<Uint32>("InstalledSizeKB", package.installedKB.then(narrowedToCount<std::uint64_t>));
     return builder.take();
 }
 

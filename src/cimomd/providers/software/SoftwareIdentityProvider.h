@@ -32,7 +32,12 @@ class SoftwareIdentityProvider : public Provider {
     static ProvidedInstance publish(const SoftwarePackage& package, int utcOffsetMinutes);
 
   private:
-    Fact<std::vector<SoftwarePackage>> read() const;
+    struct Listing {
+        std::vector<SoftwarePackage> packages;
+        /// Set when a database could not be read, or there is none.
+        std::optional<Absence> whyNotAll;
+    };
+    Listing read() const;
 
     SystemPaths paths;
     const SystemCalls& calls;
