@@ -1,12 +1,36 @@
 #include "providers/InstanceBuilder.h"
 
+#include <fmt/format.h>
+
 #include "providers/EnumeratedValues.h"
 #include "text/CimText.h"
 #include "text/Utf8.h"
 
 namespace cimomd {
 
+namespace {
+
 using Pegasus::CIMValue;
+
+/// FNV-1a of 32 bits: it must give the same number on every machine and in every version.
+std::uint32_t checksumOf(std::string_view bytes) {
+    constexpr std::uint32_t kOffset = 2166136261U;
+    constexpr std::uint32_t kPrime = 16777619U;
+    std::uint32_t sum = kOffset;
+    for (const char byte : bytes)
+        sum = (sum ^ static_cast<unsigned char>(byte)) * kPrime;
+    return sum;
+}
+
+std::string shortKey(const std::string& value, std::size_t maxLength) {
+    const std::string clean = cleanText(value);
+    if (maxLength == 0 || firstCharacters(clean, maxLength).size() == clean.size())
+        return clean;
+    const std::string mark = fmt::format("~{:08x}", checksumOf(value));
+    return std::string(firstCharacters(clean, maxLength - mark.size())) + mark;
+}
+
+}  // namespace
 
 InstanceBuilder::InstanceBuilder(const char* className) : creationClass(className) {
     provided.instance = Pegasus::CIMInstance(Pegasus::CIMName(className));
@@ -37,7 +61,7 @@ InstanceBuilder& InstanceBuilder::key(const char* name, const std::string& value
     if (!provided.identity.empty())
         provided.identity += ',';
     provided.identity += cleanText(value);
-    return text(name, value, maxLength);
+    return text(name, shortKey(value, maxLength));
 }
 
 InstanceBuilder& InstanceBuilder::label(const std::string& title) {

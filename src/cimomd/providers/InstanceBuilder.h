@@ -26,7 +26,9 @@ class InstanceBuilder {
     InstanceBuilder& physicalKeys(const std::string& tag);
     /// The keys of CIM_Service.
     InstanceBuilder& serviceKeys(const std::string& hostName, const std::string& name);
-    /// Any other key that tells the instance from others of its class.
+    /// Any other key that tells the instance from others of its class. A value longer than
+    /// `maxLength` characters, when that is not 0, is cut there, and its last ones make room for
+    /// `~` and a checksum of the whole: long values that begin alike stay apart.
     InstanceBuilder& key(const char* name, const std::string& value, std::size_t maxLength = 0);
 
     /// Caption and ElementName.
@@ -43,6 +45,16 @@ class InstanceBuilder {
         if (!scalar)
             return addMissing(name, Pegasus::kCimTypeOf<T>, false, scalar.reason());
         return add(name, Pegasus::CIMValue(*scalar));
+    }
+
+    /// A number that the schema has words for. The reason for a missing one is kept as well, but
+    /// the property says `unknown`, which is the number for that: readers that know numbers only by
+    /// their words have none for null.
+    InstanceBuilder& enumerated(const char* name, const Fact<Pegasus::Uint16>& number,
+                                Pegasus::Uint16 unknown = 0) {
+        if (!number)
+            provided.missing.push_back({name, number.reason()});
+        return add(name, Pegasus::CIMValue(number.value_or(unknown)));
     }
 
     /// An array property of that element type.

@@ -3,6 +3,7 @@
 #include <Pegasus/Common/Exception.h>
 #include <fmt/format.h>
 
+#include "providers/EnumeratedValues.h"
 #include "providers/InstanceBuilder.h"
 
 namespace cimomd {
@@ -75,7 +76,8 @@ class MissingValueStream : public InstanceStream {
         InstanceBuilder builder(MissingValueProvider::kClassName);
         builder
             .key("InstanceID",
-                 fmt::format("Velmira:{}:{}:{}", className, value.property, current.identity))
+                 fmt::format("Velmira:{}:{}:{}", className, value.property, current.identity),
+                 kNameLength)
             .text("TargetClassName", std::string(className))
             .text("TargetIdentity", orNothing(current.identity))
             .text("PropertyName", orNothing(value.property))

@@ -11,7 +11,7 @@
 
 namespace cimomd {
 
-/// A property that is null.
+/// A property that is null, or says that it is unknown.
 struct MissingValue {
     /// Static text.
     const char* property = "";

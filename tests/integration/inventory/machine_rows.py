@@ -24,10 +24,6 @@ SCRIPTS = {
     "arm": sorted(COMMON + ["numericsensor", "wifiport"]),
 }
 
-# Scripts of which some number with words has no value on that machine: what a disk of a hypervisor
-# is, and what shape memory has that the kernel alone tells of.
-NAMELESS_NUMBERS = {"virtual": ["diskdrive"], "arm": ["physicalmemory"]}
-
 # Some cells by machine, script and number of the row.
 ROWS = {
     "laptop": {
@@ -73,7 +69,7 @@ ROWS = {
         "group": {3: {"Group Name": "sudo", "Group Id": "27", "Members": "ada"}},
         "localfilesystem": {
             1: {"Mount Point": "/", "Type": "ext4", "Total MB": "939488", "Free MB": "703125"},
-            5: {"Mount Point": "/media/mia/USB STICK", "Device": "/dev/sda1"},
+            5: {"Mount Point": "/media/mia/USB STICK", "Device": "/dev/sda1", "Status": "OK"},
         },
         "memory": {1: {"Usable MB": "15738", "Installed MB": "16384", "Modules": "2",
                        "Modules Missing": "false"}},
@@ -125,7 +121,7 @@ ROWS = {
         "lanendpoint": {1: {"Interface": "bond0", "Kind": "IEEE 802.3ad Link Aggregation"}},
         "memory": {1: {"Usable MB": "257676", "Installed MB": "262144", "Modules": "8"}},
         "nfs": {1: {"Mount Point": "/home", "Mounted From": "nas.example.org:/export/home",
-                    "Total MB": "8388608", "Free MB": "4194304"}},
+                    "Total MB": "8388608", "Free MB": "4194304", "Status": "OK"}},
         "numericsensor": {
             4: {"Sensor": "nct6779 CPUTIN", "Reading": "-62.0 C", "Status": "Error"},
             10: {"Sensor": "pfe1100 vin", "Measures": "Voltage", "Reading": "230.250 V"},
@@ -143,6 +139,7 @@ ROWS = {
     "virtual": {
         "bioselement": {1: {"Manufacturer": "SeaBIOS", "Type": "BIOS"}},
         "computersystem": {1: {"Manufacturer": "", "Serial Number": ""}},
+        "diskdrive": {1: {"Device": "/dev/vda", "Type": "Unknown"}},
         "diskpartition": {3: {"Device": "/dev/vda5", "Type": "Logical", "Capacity MB": "2047"}},
         "physicalmemory": {1: {"Capacity MB": "4096", "Speed MHz": "0",
                                "Described By": "SMBIOS"}},
@@ -152,6 +149,7 @@ ROWS = {
                                "Serial Number": "10000000abcdef01"}},
         "memory": {1: {"Usable MB": "3793", "Installed MB": "0"}},
         "numericsensor": {1: {"Sensor": "cpu_thermal temp1", "Reading": "48.2 C"}},
-        "physicalmemory": {1: {"Capacity MB": "3793", "Described By": "Kernel"}},
+        "physicalmemory": {1: {"Capacity MB": "3793", "Form Factor": "Unknown",
+                               "Described By": "Kernel"}},
     },
 }

@@ -56,7 +56,7 @@ TEST_F(DiskDriveProviderTest, sizesAndAbilities) {
     EXPECT_EQ(textOf(reader, "OperationalStatus"), "0 ");
     EXPECT_EQ(textOf(reader, "EnabledState"), "null");
     EXPECT_EQ(textOf(instances[2], "DeviceID"), "vda");
-    EXPECT_EQ(textOf(instances[2], "DiskType"), "null");
+    EXPECT_EQ(textOf(instances[2], "DiskType"), "0");
     EXPECT_EQ(textOf(instances[3], "DiskType"), "3");
 }
 

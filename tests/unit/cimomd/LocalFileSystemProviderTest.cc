@@ -74,6 +74,25 @@ TEST_F(LocalFileSystemProviderTest, asksInTimeWhatMayHang) {
               "TotalInodes;FreeInodes;");
 }
 
+// Whatever the reason for which the size could not be told, the status was OK.
+TEST_F(LocalFileSystemProviderTest, areNotWellWhenTheyCannotBeRead) {
+    tree.file("proc/self/mountinfo",
+              "1 0 8:1 / / rw - ext4 /dev/sda1 rw\n"
+              "2 1 8:2 / /broken rw - xfs /dev/sdb1 rw\n"
+              "3 1 8:3 / /gone rw - xfs /dev/sdc1 rw\n"
+              "4 1 8:4 / /private rw - xfs /dev/sdd1 rw\n"
+              "5 1 8:5 / /silent rw - fuseblk /dev/sde1 rw\n");
+    calls.sizes["/"] = FileSystemSize{4096, 100, 50, 20, 10};
+    calls.sizes["/broken"] = Absence::Unreadable;
+    calls.sizes["/gone"] = Absence::Absent;
+    calls.sizes["/private"] = Absence::NeedsRoot;
+    calls.sizes["/silent"] = Absence::TimedOut;
+    std::string statuses;
+    for (const auto& instance : all(LocalFileSystemProvider(tree.paths(), calls).enumerate()))
+        statuses += textOf(instance, "Name") + " " + textOf(instance, "OperationalStatus") + ";";
+    EXPECT_EQ(statuses, "/ 2 ;/broken 6 ;/gone 0 ;/private 0 ;/silent 12 ;");
+}
+
 TEST_F(LocalFileSystemProviderTest, saysWhyThereAreNone) {
     const auto stream = LocalFileSystemProvider(tree.paths(), calls).enumerate();
     ProvidedInstance provided;

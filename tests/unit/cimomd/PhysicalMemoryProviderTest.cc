@@ -47,9 +47,9 @@ TEST(PhysicalMemoryProvider, knowsTheTypesOfMemory) {
 
 TEST(PhysicalMemoryProvider, knowsTheFormsOfModules) {
     const std::map<std::uint8_t, const char*> expected{
-        {0, "null"}, {1, "1"},   {2, "0"},   {3, "7"},  {4, "2"},  {5, "1"},
-        {6, "3"},    {7, "4"},   {8, "6"},   {9, "8"},  {10, "9"}, {11, "1"},
-        {12, "11"},  {13, "12"}, {14, "13"}, {15, "8"}, {16, "1"}, {255, "1"}};
+        {0, "0"},   {1, "1"},   {2, "0"},   {3, "7"},  {4, "2"},  {5, "1"},
+        {6, "3"},   {7, "4"},   {8, "6"},   {9, "8"},  {10, "9"}, {11, "1"},
+        {12, "11"}, {13, "12"}, {14, "13"}, {15, "8"}, {16, "1"}, {255, "1"}};
     for (const auto& [form, number] : expected)
         EXPECT_EQ(formOf(form), number) << int{form};
 }

@@ -135,7 +135,7 @@ ProvidedInstance PhysicalMemoryProvider::publish(const MemoryDevice& device) {
     InstanceBuilder builder(kClassName);
     addPhysicalElement(builder, elementOf(device));
     addRemovability(builder, {});
-    builder.value<Uint16>("FormFactor", device.formFactor.then(formFactorOf))
+    builder.enumerated("FormFactor", device.formFactor.then(formFactorOf))
         .value<Uint16>("MemoryType", device.type.then(kindOf).then(
                                          [](const MemoryKind& kind) { return kind.cimNumber; }))
         .value<Uint16>("TotalWidth", device.totalWidthBits)

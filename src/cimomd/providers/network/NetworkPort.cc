@@ -91,14 +91,14 @@ void describePort(InstanceBuilder& builder, const std::string& hostName,
     builder.label(interface.name)
         .text("Name", interface.name)
         .values<Uint16>("OperationalStatus", {operationalStatusOf(interface)})
-        .value<Uint16>("EnabledState", enabledStateOf(interface))
+        .enumerated("EnabledState", enabledStateOf(interface))
         .deviceKeys(hostName, interface.name)
         .value<Uint64>("Speed", interface.speedMbps.then(bitsPerSecond))
         .text("PermanentAddress", permanentAddress(interface, link))
         .texts("NetworkAddresses", addressesInUse(interface))
         .value<Pegasus::Boolean>("FullDuplex", interface.fullDuplex)
         .value<Uint64>("ActiveMaximumTransmissionUnit", interface.mtuBytes)
-        .value<Uint32>("SpeedMbps", interface.speedMbps.then(narrowedTo<Uint32, std::uint64_t>))
+        .value<Uint32>("SpeedMbps", interface.speedMbps.then(narrowedToCount<std::uint64_t>))
         .text("DriverName", interface.driver)
         .text("BusAddress", interface.busAddress);
 }

@@ -90,7 +90,7 @@ std::unique_ptr<InstanceStream> CacheMemoryProvider::enumerate() const {
 
 ProvidedInstance CacheMemoryProvider::publish(const std::string& hostName,
                                               const ProcessorCache& cache) {
-    const auto narrow = narrowedTo<Uint32, std::uint64_t>;
+    const auto narrow = narrowedToCount<std::uint64_t>;
     const std::string deviceId = fmt::format("{}-{}", shortNameOf(cache), cache.firstProcessor);
     InstanceBuilder builder(kClassName);
     builder.label(fmt::format("{} cache of processor {}", shortNameOf(cache), cache.firstProcessor))
@@ -105,7 +105,7 @@ ProvidedInstance CacheMemoryProvider::publish(const std::string& hostName,
         .value<Pegasus::Boolean>("Volatile", true)
         .value<Uint16>("Level", levelOf(cache.level))
         .value<Uint16>("WritePolicy", cache.writePolicy.then(writePolicyOf))
-        .value<Uint16>("CacheType", cache.type.then(typeOf))
+        .enumerated("CacheType", cache.type.then(typeOf))
         .value<Uint32>("LineSize", cache.lineBytes.then(narrow))
         .value<Uint16>("Associativity", associativityOf(cache))
         .value<Uint32>("SizeKB", cache.sizeKB.then(narrow))

@@ -9,6 +9,7 @@
 #include "providers/EnumeratedValues.h"
 #include "providers/InstanceBuilder.h"
 #include "providers/RecordStream.h"
+#include "system/Narrowing.h"
 #include "system/computer/SystemIdentity.h"
 #include "system/software/ProcessTable.h"
 
@@ -67,11 +68,7 @@ Fact<std::uint64_t> sumOf(const Fact<std::uint64_t>& a, const Fact<std::uint64_t
 
 Fact<Pegasus::Uint32> inMB(const Fact<std::uint64_t>& sizeKB) {
     constexpr std::uint64_t kKBPerMB = 1024;
-    return sizeKB.then([](std::uint64_t size) {
-        return size / kKBPerMB > std::numeric_limits<std::int32_t>::max()
-                   ? std::nullopt
-                   : std::optional(static_cast<Pegasus::Uint32>(size / kKBPerMB));
-    });
+    return sizeKB.then([](std::uint64_t size) { return narrowedToCount(size / kKBPerMB); });
 }
 
 Fact<std::uint32_t> readProcessCount(const SystemPaths& paths) {
@@ -140,7 +137,7 @@ ProvidedInstance OperatingSystemProvider::publish(const OperatingSystemFacts& fa
         .text("CSCreationClassName", kComputerSystemClass)
         .text("CSName", facts.hostName, kSystemNameLength)
         .text("CreationClassName", kClassName)
-        .value<Pegasus::Uint16>("OSType", osTypeOf(facts.release.id, facts.machine))
+        .enumerated("OSType", osTypeOf(facts.release.id, facts.machine))
         .text("Version", facts.release.versionId)
         .value<Pegasus::CIMDateTime>("LastBootUpTime", bootTimeOf(facts))
         .value<Pegasus::CIMDateTime>("LocalDateTime", cimTimeOf(facts.now, facts.utcOffsetMinutes))

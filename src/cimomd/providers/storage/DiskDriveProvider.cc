@@ -73,7 +73,7 @@ ProvidedInstance DiskDriveProvider::publish(const std::string& hostName, const D
                        bytes.then([](Uint64 size) { return std::optional(size / kBytesPerKB); }))
         .value<Uint64>("DefaultBlockSize", device.logicalBlockBytes)
         .value<Uint32>("MaxMediaSizeMB", decimalMegabytesOf(bytes))
-        .value<Uint16>("DiskType", diskTypeOf(device))
+        .enumerated("DiskType", diskTypeOf(device))
         .text("Model", disk.identity.model)
         .text("SerialNumber", disk.identity.serial);
     return builder.take();

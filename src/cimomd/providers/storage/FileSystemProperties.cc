@@ -38,8 +38,16 @@ Fact<Uint64> bytesOf(const Fact<FileSystemSize>& size, std::uint64_t FileSystemS
 }
 
 Uint16 statusOf(const Fact<FileSystemSize>& size) {
-    const bool isSilent = !size && size.reason() == Absence::TimedOut;
-    return isSilent ? kOperationalNoContact : kOperationalOk;
+    if (size)
+        return kOperationalOk;
+    switch (size.reason()) {
+        case Absence::TimedOut:
+            return kOperationalNoContact;
+        case Absence::Unreadable:
+            return kOperationalError;
+        default:
+            return kOperationalUnknown;
+    }
 }
 
 }  // namespace

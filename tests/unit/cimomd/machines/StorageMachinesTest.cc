@@ -170,8 +170,8 @@ TEST(StorageMachines, serverFileSystems) {
 TEST(StorageMachines, virtualMachine) {
     // 83,886,080 sectors are 42,949,672,960 bytes; 16,777,216 are 8,589,934,592.
     EXPECT_EQ(devices<DiskDriveProvider>("virtual", kDrive),
-              (Table{{"vda", "/dev/vda", "3 4 ", "42949672", "42949", "512", "null", "0 ", "null"},
-                     {"vdb", "/dev/vdb", "3 4 ", "8589934", "8589", "512", "null", "0 ", "null"}}));
+              (Table{{"vda", "/dev/vda", "3 4 ", "42949672", "42949", "512", "0", "0 ", "null"},
+                     {"vdb", "/dev/vdb", "3 4 ", "8589934", "8589", "512", "0", "0 ", "null"}}));
     EXPECT_EQ(devices<DiskPackageProvider>("virtual", kPackage),
               (Table{{"/dev/vda", "null", "null", "web3-root", "null", "null"},
                      {"/dev/vdb", "null", "null", "null", "null", "null"}}));
