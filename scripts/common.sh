@@ -45,6 +45,8 @@ TEST_PACKAGES=(libgtest-dev libgmock-dev rpm python3 mariadb-server postgresql-1
     sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode)
 # shellcheck disable=SC2034
 BENCHMARK_PACKAGES=(libexpat1-dev libbenchmark-dev python3)
+# shellcheck disable=SC2034
+COMPARED_PACKAGES=(fusioninventory-agent lshw)
 
 # Runs a command whose output is shown only when it fails; the first argument says what it does.
 quietly() {

@@ -11,8 +11,10 @@ import tempfile
 
 import cost
 import inventory
+import machine
 import table
 
+SCRIPTS = os.path.join(os.path.dirname(os.path.abspath(__file__)), "../../inventory")
 LARGE = 50000
 GOALS = {"fetch": 0.4, "sennet /SMS": 0.7, "sennet /LD": 0.7, "sennet /CA": 1.8, "sennet /QVE": 1.0}
 PEAK_GOALS = {"sennet /SMS": 120}
@@ -27,6 +29,8 @@ def parse_arguments():
                         help="small inventories, once: only whether all of them arrives")
     parser.add_argument("--sizes", metavar="N,N...",
                         help="only inventories of one class of 20 properties with so many instances")
+    parser.add_argument("--machine", action="store_true",
+                        help="only this machine's own inventory, with the object manager")
     parser.add_argument("--repeat", type=int, default=5, metavar="N",
                         help="turns; large inventories have fewer (%(default)s)")
     return parser.parse_args()
@@ -36,6 +40,8 @@ def chosen_inventories(arguments):
     if arguments.quick:
         return [inventory.Inventory(1, 20, 500), inventory.Inventory(5, 20, 10),
                 inventory.Inventory(1, 300, 20)]
+    if arguments.machine:
+        return []
     if arguments.sizes is not None:
         return [inventory.Inventory(1, 20, int(size)) for size in arguments.sizes.split(",")]
     return [inventory.Inventory(1, 20, size) for size in (5000, LARGE, 10 * LARGE)] + [
@@ -59,7 +65,7 @@ def goals_for(chosen):
 
 def work_directory(inventories):
     """A directory in memory if the outputs leave enough of it, so that no disk is measured."""
-    need = 5 * max(chosen.values() for chosen in inventories) * 250
+    need = 5 * 250 * max((chosen.values() for chosen in inventories), default=0)
     memory = "/dev/shm"
     if os.path.isdir(memory) and os.access(memory, os.W_OK):
         with open("/proc/meminfo", encoding="ascii") as file:
@@ -109,6 +115,8 @@ def main():
                 print(f"{chosen}: complete in every output")
             else:
                 show_costs(chosen, results[chosen])
+        if not arguments.quick and arguments.sizes is None:
+            machine.compare(arguments.programs, SCRIPTS, directory, arguments.repeat)
     show_growth(results)
 
 

@@ -17,16 +17,22 @@ class Cost:
     peak: float  # MiB
 
 
+def read(result):
+    """What the program `measure` wrote into the file `result`."""
+    with open(result, encoding="ascii") as file:
+        user, system, wall, peak = map(float, file.read().split())
+    return Cost(user + system, wall, peak / 1024)
+
+
 def run(measure, command, environment, directory):
     """The cost of the command and what it printed."""
     result = os.path.join(directory, "cost")
     done = subprocess.run([measure, result, *command], env={**os.environ, **environment},
-                          stdout=subprocess.PIPE, text=True, check=False)
+                          stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True,
+                          check=False)
     if done.returncode != 0:
-        raise Failure(f"{' '.join(command)} ended with status {done.returncode}")
-    with open(result, encoding="ascii") as file:
-        user, system, wall, peak = map(float, file.read().split())
-    return Cost(user + system, wall, peak / 1024), done.stdout
+        raise Failure(f"{' '.join(command)} ended with status {done.returncode}\n{done.stderr}")
+    return read(result), done.stdout
 
 
 def middle(costs):
