@@ -6,6 +6,8 @@ machine strikes all of them; shown are the medians of the turns."""
 import argparse
 import os
 import shutil
+import signal
+import subprocess
 import sys
 import tempfile
 
@@ -123,7 +125,9 @@ def main():
 
 
 if __name__ == "__main__":
+    # Leaves no server and no output behind when it is told to end.
+    signal.signal(signal.SIGTERM, lambda *_: sys.exit(1))
     try:
         main()
-    except (cost.Failure, OSError) as failure:
+    except (cost.Failure, OSError, subprocess.SubprocessError) as failure:
         sys.exit(f"bench/compare: {failure}")
