@@ -51,13 +51,12 @@ ROWS = {
         }},
         "desktopmonitor": {
             1: {"Connector": "card0-DP-2", "Model": "DELL U2719D", "Pixels Wide": "2560",
-                "Pixels High": "1440", "Diagonal Inches": "27.0", "Year Made": "2019",
-                "Week Made": "33"},
+                "Pixels High": "1440", "Diagonal Inches": "27.0", "Made": "2019-W33"},
             2: {"Connector": "card0-eDP-1", "Diagonal Inches": "14.0"},
         },
         "diskdrive": {
             1: {"Device": "/dev/sda", "Abilities":
-                "Random Access,Supports Writing,Supports Removeable Media"},
+                "Random Access,Supports Writing,Supports Removeable Media", "Type": "Other"},
             2: {"Device": "/dev/nvme0n1", "Model": "Samsung SSD 980 PRO 1TB",
                 "Serial Number": "S5P2NG0R704512X", "Type": "Solid State Drive",
                 "Capacity MB": "1024209"},

@@ -38,6 +38,22 @@ TEST(DesktopMonitorProvider, callsAMonitorByWhatIsKnown) {
     EXPECT_EQ(textOf(published(edid), "Model"), "DELL U2719D");
 }
 
+TEST(DesktopMonitorProvider, tellsTheYearOfTheModelFromThatOfTheMonitor) {
+    Edid edid;
+    EXPECT_EQ(textOf(published(edid), "Made"), "null");
+    edid.year = 2019;
+    EXPECT_EQ(textOf(published(edid), "Made"), "2019");
+    edid.week = 7;
+    EXPECT_EQ(textOf(published(edid), "Made"), "2019-W07");
+    EXPECT_EQ(textOf(published(edid), "YearOfManufacture"), "2019");
+    EXPECT_EQ(textOf(published(edid), "ModelYear"), "null");
+    Edid ofModel;
+    ofModel.modelYear = 2021;
+    EXPECT_EQ(textOf(published(ofModel), "Made"), "model 2021");
+    EXPECT_EQ(textOf(published(ofModel), "ModelYear"), "2021");
+    EXPECT_EQ(textOf(published(ofModel), "YearOfManufacture"), "null");
+}
+
 TEST(DesktopMonitorProvider, passesOnWhyAMonitorTellsNothing) {
     const auto provided =
         DesktopMonitorProvider::publish("node7", {"card0-DP-1", true, Absence::Unreadable});
@@ -50,7 +66,7 @@ TEST(DesktopMonitorProvider, passesOnWhyAMonitorTellsNothing) {
             EXPECT_STREQ(value.property, "OperationalStatus");
     }
     // All that the monitor would have told.
-    EXPECT_EQ(unreadable, 12U);
+    EXPECT_EQ(unreadable, 14U);
 }
 
 }  // namespace

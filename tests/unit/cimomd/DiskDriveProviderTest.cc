@@ -60,6 +60,23 @@ TEST_F(DiskDriveProviderTest, sizesAndAbilities) {
     EXPECT_EQ(textOf(instances[3], "DiskType"), "3");
 }
 
+// Most sticks do not say that they do not rotate, so that the kernel takes them for rotating.
+TEST_F(DiskDriveProviderTest, takesNoStickForAHardDisk) {
+    tree.file("sys/block/sda/removable", "1\n")
+        .file("sys/block/sda/queue/rotational", "1\n")
+        .file("sys/block/sdb/removable", "1\n")
+        .file("sys/block/sdb/queue/rotational", "0\n")
+        .file("sys/block/sdc/removable", "0\n")
+        .file("sys/block/sdc/queue/rotational", "1\n")
+        .file("sys/block/sdd/queue/rotational", "1\n");
+    const auto instances = all(DiskDriveProvider(tree.paths()).enumerate());
+    ASSERT_EQ(instances.size(), 4U);
+    EXPECT_EQ(textOf(instances[0], "DiskType"), "1");
+    EXPECT_EQ(textOf(instances[1], "DiskType"), "3");
+    EXPECT_EQ(textOf(instances[2], "DiskType"), "2");
+    EXPECT_EQ(textOf(instances[3], "DiskType"), "2");
+}
+
 TEST_F(DiskDriveProviderTest, saysWhyThereAreNone) {
     const auto stream = DiskDriveProvider(tree.paths()).enumerate();
     ProvidedInstance provided;

@@ -98,7 +98,9 @@ TEST(Edid, readsWhenItWasMade) {
     EXPECT_EQ(made.year, std::uint16_t{2019});
     const Edid model = Block().put(16, {255, 31}).read();
     EXPECT_FALSE(model.week);
-    EXPECT_EQ(model.year, std::uint16_t{2021});
+    EXPECT_FALSE(model.year);
+    EXPECT_EQ(model.modelYear, std::uint16_t{2021});
+    EXPECT_FALSE(made.modelYear);
     EXPECT_EQ(Block().put(16, {54, 4}).read().year, std::uint16_t{1994});
     EXPECT_FALSE(Block().put(16, {55, 3}).read().week);
     EXPECT_FALSE(Block().put(16, {55, 3}).read().year);

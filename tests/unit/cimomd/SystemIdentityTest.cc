@@ -16,9 +16,11 @@ TEST(FirmwareText, knowsPlaceholders) {
     for (const char* text :
          {"To be filled by O.E.M.", " default STRING ", "0000", "XXXXXX", "........", "", "  ",
           "00000000-0000-0000-0000-000000000000", "FFFFFFFF-FFFF-FFFF-ffff-ffffffffffff", "N/A",
-          "None", "0123456789", "INVALID", "No Asset Information", "not available"})
+          "None", "0123456789", "INVALID", "No Asset Information", "not available", "0x0",
+          "0X00000000", "---", "111"})
         EXPECT_TRUE(isPlaceholder(text)) << text;
-    for (const char* text : {"Dell Inc.", "5", "00001", "None of these", "4C4C4544-0042"})
+    for (const char* text : {"Dell Inc.", "5", "00001", "None of these", "4C4C4544-0042", "11",
+                             "AA", "0x", "0x01", "0x0 rev"})
         EXPECT_FALSE(isPlaceholder(text)) << text;
 }
 

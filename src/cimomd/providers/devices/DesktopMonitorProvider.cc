@@ -68,6 +68,20 @@ Fact<std::string> diagonalOf(const Fact<Edid>& edid) {
         width.reason());
 }
 
+/// A text, so that what is not known stays empty where numbers are printed.
+Fact<std::string> madeOf(const Fact<Edid>& edid) {
+    return edid.then(
+        [](const Edid& found) -> std::optional<std::string> {
+            if (found.modelYear)
+                return fmt::format("model {}", *found.modelYear);
+            if (!found.year)
+                return std::nullopt;
+            return found.week ? fmt::format("{}-W{:02}", *found.year, *found.week)
+                              : std::to_string(*found.year);
+        },
+        edid ? told<&Edid::year>(edid).reason() : Absence::Absent);
+}
+
 Fact<Uint16> enabledStateOf(const Fact<bool>& isEnabled) {
     return isEnabled.then([](bool is) { return is ? kEnabled : kDisabled; });
 }
@@ -104,6 +118,8 @@ ProvidedInstance DesktopMonitorProvider::publish(const std::string& hostName,
         .text("SerialNumber", told<&Edid::serialNumber>(edid))
         .value<Uint16>("YearOfManufacture", told<&Edid::year>(edid))
         .value<Uint8>("WeekOfManufacture", told<&Edid::week>(edid))
+        .value<Uint16>("ModelYear", told<&Edid::modelYear>(edid))
+        .text("Made", madeOf(edid))
         .value<Uint32>("WidthMillimetres", told<&Edid::widthMillimetres>(edid))
         .value<Uint32>("HeightMillimetres", told<&Edid::heightMillimetres>(edid))
         .text("DiagonalInches", diagonalOf(edid));

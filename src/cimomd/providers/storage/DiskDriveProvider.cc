@@ -16,6 +16,7 @@ using Pegasus::Uint32;
 using Pegasus::Uint64;
 
 // Velmira_DiskDrive.DiskType
+constexpr Uint16 kOtherDisk = 1;
 constexpr Uint16 kHardDisk = 2;
 constexpr Uint16 kSolidState = 3;
 
@@ -38,13 +39,17 @@ Fact<Uint64> mediaBytesOf(const BlockDevice& device) {
               Absence::Absent);
 }
 
-/// The disks of hypervisors count as rotating only because nobody says otherwise.
+/// The kernel takes for rotating whatever does not say otherwise: the disks of hypervisors, USB
+/// sticks, card readers.
 Fact<Uint16> diskTypeOf(const BlockDevice& device) {
     const bool isVirtual = device.name.substr(0, 2) == "vd" || device.name.substr(0, 3) == "xvd";
-    return device.isRotational.then([isVirtual](bool rotates) {
+    const bool isRemovable = device.isRemovable == true;
+    return device.isRotational.then([isVirtual, isRemovable](bool rotates) {
         if (isVirtual)
             return std::optional<Uint16>();
-        return std::optional(rotates ? kHardDisk : kSolidState);
+        if (!rotates)
+            return std::optional(kSolidState);
+        return std::optional(isRemovable ? kOtherDisk : kHardDisk);
     });
 }
 

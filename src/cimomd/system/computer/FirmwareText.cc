@@ -29,6 +29,9 @@ constexpr std::array<std::string_view, 19> kPlaceholders{"To be filled by O.E.M.
                                                          "123456789",
                                                          ""};
 
+// Two equal characters are a plausible revision or slot: "AA", "11".
+constexpr std::size_t kLeastRepeated = 3;
+
 bool isRepetition(std::string_view text) {
     char repeated = '\0';
     std::size_t count = 0;
@@ -40,14 +43,20 @@ bool isRepetition(std::string_view text) {
         repeated = c;
         ++count;
     }
-    return count != 1;
+    return count == 0 || count >= kLeastRepeated;
+}
+
+/// What some firmware prints for a number that nobody set.
+bool isHexadecimalZero(std::string_view text) {
+    return text.size() > 2 && equalsIgnoringCase(text.substr(0, 2), "0x") &&
+           text.find_first_not_of('0', 2) == std::string_view::npos;
 }
 
 }  // namespace
 
 bool isPlaceholder(std::string_view text) {
     const std::string_view value = trimmed(text);
-    return isRepetition(value) ||
+    return isRepetition(value) || isHexadecimalZero(value) ||
            std::any_of(kPlaceholders.begin(), kPlaceholders.end(), [value](std::string_view known) {
                return equalsIgnoringCase(known, value);
            });

@@ -11,8 +11,8 @@
 namespace cimomd {
 
 /// Whether `text` only stands where a value should: a known placeholder (ignoring case and outer
-/// blanks), nothing at all, or one character repeated, blanks and dashes apart ("0000", and UUIDs
-/// of zeros or Fs).
+/// blanks), nothing at all, a hexadecimal zero ("0x0"), or one character at least three times,
+/// blanks and dashes apart ("0000", and UUIDs of zeros or Fs).
 bool isPlaceholder(std::string_view text);
 
 /// The text without outer blanks; a placeholder is filtered.

@@ -34,6 +34,8 @@ constexpr unsigned kSerialDescriptor = 0xFF;
 constexpr std::size_t kDescriptorText = 5;
 
 constexpr std::uint8_t kLastWeek = 54;
+// In the place of the week: the year is the model's.
+constexpr unsigned kModelYearMark = 255;
 constexpr unsigned kFirstYear = 1990;
 // The first structure was published in 1994; years before it are fields nobody filled in.
 constexpr unsigned kLeastYearByte = 4;
@@ -82,6 +84,10 @@ Fact<std::uint8_t> weekOf(std::string_view block) {
     if (week == 0 || week > kLastWeek)
         return Absence::Absent;
     return static_cast<std::uint8_t>(week);
+}
+
+bool hasModelYear(std::string_view block) {
+    return byteAt(block, kWeek) == kModelYearMark;
 }
 
 Fact<std::uint16_t> yearOf(std::string_view block) {
@@ -197,7 +203,7 @@ std::optional<Edid> parseEdid(std::string_view bytes) {
     out.productCode =
         static_cast<std::uint16_t>(byteAt(block, kProduct) | byteAt(block, kProduct + 1) << 8);
     out.serialNumber = serialNumberOf(block);
-    out.year = yearOf(block);
+    (hasModelYear(block) ? out.modelYear : out.year) = yearOf(block);
     out.week = weekOf(block);
     out.isColour = colourOf(block);
     readSize(out, block, block.substr(kFirstDescriptor, kDescriptorBytes));

@@ -19,8 +19,9 @@ struct Edid {
     std::uint16_t productCode = 0;
     /// The text, else the number that stands in for it.
     Fact<std::string> serialNumber;
-    /// The year of manufacture, or the model's year when `week` has none.
+    /// The year of manufacture, or the year of the model; a monitor tells one of them.
     Fact<std::uint16_t> year;
+    Fact<std::uint16_t> modelYear;
     /// 1 to 54.
     Fact<std::uint8_t> week;
     /// The name for customers; panels of portable computers have none.

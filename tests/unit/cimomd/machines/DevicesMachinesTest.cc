@@ -272,8 +272,10 @@ TEST(DevicesMachines, monitorsOfTheOthers) {
                                  {"DisplayType", "4"},
                                  {"ScreenWidth", "1920"},
                                  {"ScreenHeight", "1080"},
-                                 {"YearOfManufacture", "2015"},
+                                 {"YearOfManufacture", "null"},
                                  {"WeekOfManufacture", "null"},
+                                 {"ModelYear", "2015"},
+                                 {"Made", "model 2015"},
                                  {"WidthMillimetres", "890"},
                                  {"HeightMillimetres", "500"},
                                  // The root of 890^2 + 500^2 is 1020.83; by 25.4 that is 40.19.

@@ -75,7 +75,7 @@ const std::vector<const char*> kRemote{"Name",       "Device",           "FileSy
 TEST(StorageMachines, laptop) {
     // 2,000,409,264 sectors are 1,024,209,543,168 bytes; 60,062,500 are 30,752,000,000.
     EXPECT_EQ(devices<DiskDriveProvider>("laptop", kDrive),
-              (Table{{"sda", "/dev/sda", "3 4 7 ", "30752000", "30752", "512", "2", "2 ", "2"},
+              (Table{{"sda", "/dev/sda", "3 4 7 ", "30752000", "30752", "512", "1", "2 ", "2"},
                      {"nvme0n1", "/dev/nvme0n1", "3 4 ", "1024209543", "1024209", "512", "3", "2 ",
                       "2"}}));
     EXPECT_EQ(devices<DiskPackageProvider>("laptop", kPackage),
@@ -201,7 +201,7 @@ TEST(StorageMachines, arm) {
                {"mmcblk1", "/dev/mmcblk1", "3 4 ", "7818182", "7818", "512", "3", "0 ", "null"}}));
     EXPECT_EQ(
         devices<DiskPackageProvider>("arm", kPackage),
-        (Table{{"/dev/mmcblk0", "null", "SD32G", "0x1b2c3d4e", "0x0", "null"},
+        (Table{{"/dev/mmcblk0", "null", "SD32G", "0x1b2c3d4e", "null", "null"},
                {"/dev/mmcblk1", "null", "DG4008", "0x7a6b5c4d", "0x3731303131323031", "null"}}));
     EXPECT_EQ(devices<DiskPartitionProvider>("arm", kPartition),
               (Table{{"mmcblk0p1", "mmcblk0", "1", "512", "1048576", "512", "4"},
