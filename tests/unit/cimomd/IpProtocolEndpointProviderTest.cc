@@ -17,6 +17,16 @@ std::string originOf(const std::string& recordedLine) {
                   "AddressOrigin");
 }
 
+// IFA_PROTO of the kernel: 1 loopback, 2 router announcement, 3 link-local, others of programs.
+TEST(IpProtocolEndpointProvider, takesTheOriginThatTheKernelTells) {
+    EXPECT_EQ(originOf("eth0 2001:db8::1 - 64 0x0 forever 2"), "9");
+    EXPECT_EQ(originOf("eth0 2001:db8::1 - 128 0x0 3600 2"), "9");
+    EXPECT_EQ(originOf("eth0 fe80::1 - 64 0x80 forever 3"), "10");
+    EXPECT_EQ(originOf("lo ::1 - 128 0x80 forever 1"), "2");
+    EXPECT_EQ(originOf("eth0 192.0.2.1 - 24 0x0 3600 0"), "4");
+    EXPECT_EQ(originOf("eth0 192.0.2.1 - 24 0x80 forever 16"), "3");
+}
+
 TEST(IpProtocolEndpointProvider, concludesTheOrigin) {
     EXPECT_EQ(originOf("eth0 192.0.2.1 - 24 0x80 forever"), "3");
     EXPECT_EQ(originOf("eth0 192.0.2.1 - 24 0x0 3600"), "4");

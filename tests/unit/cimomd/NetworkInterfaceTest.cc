@@ -41,6 +41,29 @@ TEST(NetworkInterface, readsAPort) {
     EXPECT_FALSE(port.isWifiPort());
 }
 
+// The PCI address belongs to the device that carries the virtio one; a USB adapter has none.
+TEST(NetworkInterface, findsThePciAddressOfItsParent) {
+    RecordedTree tree;
+    tree.file("devices/0000:00:03.0/uevent", "DRIVER=virtio-pci\nPCI_SLOT_NAME=0000:00:03.0\n")
+        .file("devices/0000:00:03.0/virtio0/uevent", "DRIVER=virtio_net\n")
+        .file("devices/0000:00:14.0/uevent", "DRIVER=xhci_hcd\nPCI_SLOT_NAME=0000:00:14.0\n")
+        .file("devices/0000:00:14.0/usb1/uevent", "DRIVER=usb\n")
+        .file("devices/0000:00:14.0/usb1/1-1:1.0/uevent", "DRIVER=cdc_ether\n")
+        .directory("net/eth0")
+        .directory("net/eth1");
+    std::filesystem::create_directory_symlink("../../devices/0000:00:03.0/virtio0",
+                                              tree.root / "net/eth0/device");
+    std::filesystem::create_directory_symlink("../../devices/0000:00:14.0/usb1/1-1:1.0",
+                                              tree.root / "net/eth1/device");
+    const auto interfaces = readNetworkInterfaces(tree.root / "net");
+    ASSERT_EQ(interfaces->size(), 2U);
+    EXPECT_EQ((*interfaces)[0].driver, "virtio_net");
+    EXPECT_EQ((*interfaces)[0].busAddress, "0000:00:03.0");
+    EXPECT_EQ((*interfaces)[1].driver, "cdc_ether");
+    EXPECT_EQ((*interfaces)[1].busAddress.reason(), Absence::Absent);
+    EXPECT_FALSE((*interfaces)[1].busAddress);
+}
+
 TEST(NetworkInterface, readsOddTexts) {
     RecordedTree tree;
     tree.file("net/eth0/address", "\n")

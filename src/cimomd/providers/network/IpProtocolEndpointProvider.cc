@@ -30,10 +30,27 @@ constexpr Uint16 kOriginDhcpv6 = 7;
 constexpr Uint16 kOriginStateless = 9;
 constexpr Uint16 kOriginLinkLocal = 10;
 
-/// The kernel does not tell who set an address. A server that lends one says until when; a DHCPv6
-/// server lends single addresses, a router announces the prefix of a network.
+/// What the kernel set by itself, when it says so: kernels before 5.18 do not, nor do they know who
+/// among the programs set an address.
+std::optional<Uint16> originFromKernel(const InterfaceAddress& address) {
+    switch (address.origin) {
+        case IFAPROT_KERNEL_LO:
+            return kOriginNotApplicable;
+        case IFAPROT_KERNEL_RA:
+            return kOriginStateless;
+        case IFAPROT_KERNEL_LL:
+            return kOriginLinkLocal;
+        default:
+            return std::nullopt;
+    }
+}
+
+/// A server that lends an address says until when; a DHCPv6 server lends single addresses, a router
+/// announces the prefix of a network.
 Uint16 originOf(const InterfaceAddress& address) {
     const bool isV4 = address.local.version() == IpAddress::Version::V4;
+    if (const auto known = originFromKernel(address))
+        return *known;
     if (address.local.isLoopback())
         return kOriginNotApplicable;
     if (address.local.isLinkLocal())

@@ -53,11 +53,12 @@ class AddressCollector {
         // IPv6 has the local address in IFA_ADDRESS unless there is a peer.
         if ((!address && !local) || name.empty())
             return;
-        InterfaceAddress out{name, local ? *local : *address, {}, head.ifa_prefixlen, 0, {}};
+        InterfaceAddress out{name, local ? *local : *address, {}, head.ifa_prefixlen, 0, {}, 0};
         if (local && address && *local != *address)
             out.peer = address;
         out.flags = flagsOf(head, attributes);
         out.validSeconds = validSeconds(attributes[IFA_CACHEINFO]);
+        out.origin = originOf(attributes[IFA_PROTO]);
         addresses.push_back(std::move(out));
     }
 
@@ -89,6 +90,13 @@ class AddressCollector {
         if (times.ifa_valid == std::numeric_limits<std::uint32_t>::max())
             return std::nullopt;
         return times.ifa_valid;
+    }
+
+    /// Kernels before 5.18 do not send it.
+    static std::uint8_t originOf(const nlattr* attribute) {
+        if (attribute == nullptr || mnl_attr_get_payload_len(attribute) < sizeof(std::uint8_t))
+            return IFAPROT_UNSPEC;
+        return mnl_attr_get_u8(attribute);
     }
 
     const std::string& interfaceName(unsigned index) {

@@ -23,11 +23,13 @@ struct InterfaceAddress {
     std::uint32_t flags = 0;
     /// How long the address stays valid; nothing for ever.
     std::optional<std::uint32_t> validSeconds;
+    /// Who set it, an IFAPROT number of <linux/if_addr.h>; 0 when nobody says.
+    std::uint8_t origin = 0;
 
     bool operator==(const InterfaceAddress&) const = default;
 };
 
-/// Reads lines `interface local peer prefix-length flags seconds`, with "-" for no peer,
+/// Reads lines `interface local peer prefix-length flags seconds [origin]`, with "-" for no peer,
 /// hexadecimal flags after 0x and "forever" for no end. Other lines are dropped.
 std::vector<InterfaceAddress> parseRecordedAddresses(std::string_view text);
 

@@ -78,6 +78,10 @@ NetworkInterface readInterface(const std::filesystem::path& directory, const std
     const Fact<std::string> deviceEvent = readFact(directory / "device" / "uevent");
     out.driver = eventValue(deviceEvent, "DRIVER");
     out.busAddress = eventValue(deviceEvent, "PCI_SLOT_NAME");
+    // A virtio device is the only child of the PCI device that carries it.
+    if (!out.busAddress)
+        out.busAddress =
+            eventValue(readFact(directory / "device" / ".." / "uevent"), "PCI_SLOT_NAME");
     out.hasDevice = isThere(directory / "device");
     out.isWireless = isThere(directory / "phy80211") || isThere(directory / "wireless");
     return out;
