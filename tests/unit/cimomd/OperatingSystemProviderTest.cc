@@ -89,13 +89,36 @@ TEST_F(OperatingSystemProviderTest, knowsTheTypesOfDistributions) {
                                                   {"centos", 107, 106},
                                                   {"ol", 109, 108},
                                                   {"sles", 85, 84},
+                                                  {"sles_sap", 85, 84},
+                                                  {"sled", 83, 82},
+                                                  {"sle_hpc", 83, 82},
+                                                  {"sle-micro", 83, 82},
+                                                  {"sl-micro", 83, 82},
+                                                  {"suse-microos", 83, 82},
+                                                  {"opensuse", 83, 82},
                                                   {"opensuse-leap", 83, 82},
+                                                  {"opensuse-tumbleweed", 83, 82},
+                                                  {"opensuse-microos", 83, 82},
+                                                  {"ubuntu-core", 94, 93},
+                                                  {"olpc", 101, 36},
+                                                  {"slestuff", 101, 36},
+                                                  {"deb", 101, 36},
                                                   {"arch", 101, 36}}) {
         EXPECT_EQ(OperatingSystemProvider::osTypeOf(expected.id, "x86_64"), expected.type64);
         EXPECT_EQ(OperatingSystemProvider::osTypeOf(expected.id, "armv7l"), expected.type32);
     }
     EXPECT_EQ(OperatingSystemProvider::osTypeOf(std::nullopt, "x86_64"), 101);
     EXPECT_EQ(OperatingSystemProvider::osTypeOf("debian", std::nullopt), std::nullopt);
+}
+
+TEST_F(OperatingSystemProviderTest, knowsMachinesOf64Bits) {
+    for (const char* machine :
+         {"x86_64", "aarch64", "aarch64_be", "ppc64", "ppc64le", "s390x", "riscv64", "mips64",
+          "loongarch64", "sparc64", "ia64", "parisc64", "alpha"})
+        EXPECT_EQ(OperatingSystemProvider::osTypeOf("debian", machine), 96) << machine;
+    for (const char* machine : {"i386", "i686", "armv6l", "armv7l", "armv8l", "ppc", "s390",
+                                "riscv32", "mips", "sparc", "parisc", "m68k"})
+        EXPECT_EQ(OperatingSystemProvider::osTypeOf("debian", machine), 95) << machine;
 }
 
 TEST_F(OperatingSystemProviderTest, printsMoreMemoryThan32BitsCountInMB) {

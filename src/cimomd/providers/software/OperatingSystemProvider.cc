@@ -18,32 +18,35 @@ namespace {
 
 constexpr std::size_t kVersionLength = 64;
 
+// What is called `family`, or has a name that begins with it and a separator: "sles_sap",
+// "opensuse-leap".
 struct Distribution {
-    std::string_view id;
+    std::string_view family;
     std::uint16_t type64;
     std::uint16_t type32;
+
+    bool has(std::string_view id) const {
+        return id.substr(0, family.size()) == family &&
+               (id.size() == family.size() || id[family.size()] == '-' || id[family.size()] == '_');
+    }
 };
 
-constexpr std::array<Distribution, 11> kDistributions{{
-    {"debian", 96, 95},
-    {"ubuntu", 94, 93},
-    {"rhel", 80, 79},
-    {"centos", 107, 106},
-    {"ol", 109, 108},
-    {"sles", 85, 84},
-    {"suse", 83, 82},
-    {"opensuse", 83, 82},
-    {"opensuse-leap", 83, 82},
-    {"opensuse-tumbleweed", 83, 82},
-    {"sled", 83, 82},
-}};
+constexpr std::array<Distribution, 11> kDistributions{{{"debian", 96, 95},
+                                                       {"ubuntu", 94, 93},
+                                                       {"rhel", 80, 79},
+                                                       {"centos", 107, 106},
+                                                       {"ol", 109, 108},
+                                                       {"sles", 85, 84},
+                                                       {"suse", 83, 82},
+                                                       {"opensuse", 83, 82},
+                                                       {"sled", 83, 82},
+                                                       {"sle", 83, 82},
+                                                       {"sl-micro", 83, 82}}};
 constexpr Distribution kOtherLinux{"", 101, 36};
 
-constexpr std::array<std::string_view, 7> kMachines64{"x86_64", "aarch64", "ppc64", "ppc64le",
-                                                      "s390x",  "riscv64", "mips64"};
-
+/// Almost all machines with addresses of 64 bits have the number in the name that uname gives.
 bool is64Bit(std::string_view machine) {
-    return std::find(kMachines64.begin(), kMachines64.end(), machine) != kMachines64.end();
+    return machine.find("64") != std::string_view::npos || machine == "s390x" || machine == "alpha";
 }
 
 Fact<Pegasus::CIMDateTime> bootTimeOf(const OperatingSystemFacts& facts) {
@@ -120,8 +123,9 @@ std::optional<std::uint16_t> OperatingSystemProvider::osTypeOf(
     const std::optional<std::string>& id, const std::optional<std::string>& machine) {
     if (!machine)
         return std::nullopt;
-    const auto known = std::find_if(kDistributions.begin(), kDistributions.end(),
-                                    [&id](const Distribution& entry) { return entry.id == id; });
+    const auto known =
+        std::find_if(kDistributions.begin(), kDistributions.end(),
+                     [&id](const Distribution& entry) { return id && entry.has(*id); });
     const Distribution& distribution = known == kDistributions.end() ? kOtherLinux : *known;
     return is64Bit(*machine) ? distribution.type64 : distribution.type32;
 }
