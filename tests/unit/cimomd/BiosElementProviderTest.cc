@@ -108,9 +108,12 @@ TEST(BiosElementProvider, takesWhatTheKernelHandsOn) {
     EXPECT_EQ(textOf(all(provider.enumerate()).at(0), "FirmwareType"), "UEFI");
 }
 
-TEST(BiosElementProvider, hasAnEmptyKeyWhereNoVersionIsTold) {
+TEST(BiosElementProvider, hasAKeyWhereNoVersionIsTold) {
+    Firmware released;
+    released.release = "1.30";
+    EXPECT_EQ(textOf(BiosElementProvider::publish(released, false).instance, "Version"), "1.30");
     const auto instance = BiosElementProvider::publish({}, false).instance;
-    EXPECT_EQ(textOf(instance, "Version"), "");
+    EXPECT_EQ(textOf(instance, "Version"), "Unknown");
     EXPECT_EQ(textOf(instance, "Caption"), "BIOS");
     EXPECT_EQ(textOf(instance, "ReleaseDate"), "null");
 }

@@ -65,7 +65,8 @@ TEST_F(UnixProcessProviderTest, publishesAnOrdinaryProcess) {
     EXPECT_EQ(textOf(tmux, "CreationDate"), "20231114202820.000000+060");
     EXPECT_EQ(textOf(tmux, "UserModeTime"), "2500");
     EXPECT_EQ(textOf(tmux, "KernelModeTime"), "1500");
-    EXPECT_EQ(textOf(tmux, "ProcessorSeconds"), "3");
+    // Two and a half and one and a half.
+    EXPECT_EQ(textOf(tmux, "ProcessorSeconds"), "4");
     EXPECT_EQ(textOf(tmux, "WorkingSetSize"), "6442450944");
     EXPECT_EQ(textOf(tmux, "WorkingSetSizeKB"), "6291456");
     EXPECT_EQ(textOf(tmux, "ModulePath"), "/usr/bin/tmux");
@@ -75,7 +76,7 @@ TEST_F(UnixProcessProviderTest, publishesAnOrdinaryProcess) {
 
 TEST_F(UnixProcessProviderTest, leavesOutWhatDoesNotFit) {
     // A real-time priority is below 0, and so is a nice value that takes instead of giving way.
-    process("9", "(rt) R 0 -1 -1 0 -1 0 0 0 0 0 18446744073709551615 0 0 0 -100 -20 1 0 1 0");
+    process("9", "(rt) R 0 -1 -1 0 -1 0 0 0 0 0 18446744073709551615 300 0 0 -100 -20 1 0 1 0");
     tree.file("proc/9/status", "Uid:\t4242\nVmRSS:\t18446744073709551615 kB\n")
         .file("proc/9/cmdline", "");
     const auto instances = all(provider.enumerate());

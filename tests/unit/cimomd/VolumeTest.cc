@@ -49,6 +49,26 @@ TEST(Volume, ofSoftwareRaid) {
     EXPECT_EQ(raid.missingDisks, 1U);
 }
 
+// The kernel shows 0 sectors until the array is started.
+TEST(Volume, thatIsNotRunningHasNoSize) {
+    RecordedTree tree;
+    tree.file("sys/block/md0/md/array_state", "inactive\n")
+        .file("sys/block/md0/size", "0\n")
+        .file("sys/block/md1/md/array_state", "clean\n")
+        .file("sys/block/md1/size", "8\n")
+        .file("sys/block/dm-0/dm/name", "vg-new\n")
+        .file("sys/block/dm-0/size", "0\n");
+    const auto volumes = readVolumes(tree.paths());
+    ASSERT_EQ(volumes->size(), 3U);
+    for (const Volume& volume : *volumes) {
+        if (volume.device.name == "md1")
+            EXPECT_EQ(volume.device.sizeSectors, 8U);
+        else
+            EXPECT_EQ(volume.device.sizeSectors.reason(), Absence::Absent) << volume.device.name;
+        EXPECT_EQ(volume.device.sizeSectors.has_value(), volume.device.name == "md1");
+    }
+}
+
 TEST(Volume, withOddFiles) {
     RecordedTree tree;
     tree.file("sys/block/md0/md/raid_disks", "many\n")

@@ -31,6 +31,11 @@ std::optional<Pegasus::CIMDateTime> startOf(const CalendarDate& date) {
         std::chrono::duration_cast<std::chrono::seconds>(day.time_since_epoch()).count(), 0);
 }
 
+/// A key may not be null, and an empty one does not get through every client.
+std::string versionKeyOf(const Firmware& firmware) {
+    return firmware.version ? *firmware.version : firmware.release.value_or("Unknown");
+}
+
 }  // namespace
 
 std::unique_ptr<InstanceStream> BiosElementProvider::enumerate() const {
@@ -47,7 +52,7 @@ ProvidedInstance BiosElementProvider::publish(const Firmware& firmware, bool uef
     InstanceBuilder builder(kClassName);
     builder.label(firmware.version ? fmt::format("{} {}", type, *firmware.version) : type)
         .text("Name", "System firmware")
-        .text("Version", firmware.version.value_or(""), kVersionLength)
+        .key("Version", versionKeyOf(firmware), kVersionLength)
         .value<Uint16>("SoftwareElementState", kRunning)
         .key("SoftwareElementID", fmt::format("Firmware {}", firmware.index))
         .value<Uint16>("TargetOperatingSystem", kNoOperatingSystem)

@@ -86,7 +86,9 @@ Fact<Uint64> milliseconds(std::uint64_t ticks) {
 }
 
 Fact<std::uint64_t> processorTimeOf(const ProcessStatus& status) {
-    return status.userTicks / kTicksPerSecond + status.kernelTicks / kTicksPerSecond;
+    if (status.userTicks > std::numeric_limits<std::uint64_t>::max() - status.kernelTicks)
+        return Absence::Filtered;
+    return (status.userTicks + status.kernelTicks) / kTicksPerSecond;
 }
 
 Fact<Uint64> identifier(std::int64_t number) {

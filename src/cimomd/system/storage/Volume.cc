@@ -35,9 +35,17 @@ Fact<std::vector<std::string>> readMembers(const std::filesystem::path& director
     });
 }
 
+/// An array that is not running, and a mapping without a table, have the size 0 meanwhile.
+Fact<std::uint64_t> sizeOfActive(const Fact<std::uint64_t>& sectors) {
+    return sectors.then(
+        [](std::uint64_t count) { return count == 0 ? std::nullopt : std::optional(count); },
+        Absence::Absent);
+}
+
 Volume readVolume(const std::filesystem::path& directory) {
     Volume out;
     out.device = readBlockDevice(directory);
+    out.device.sizeSectors = sizeOfActive(out.device.sizeSectors);
     out.isRaid = isDirectory(directory / "md");
     out.members = readMembers(directory / "slaves");
     if (out.isRaid) {

@@ -27,6 +27,7 @@ struct RaidState {
 };
 
 struct Volume {
+    /// Without a size while it is not running.
     BlockDevice device;
     bool isRaid = false;
     /// The name and the identity that the device mapper knows it by; for example "vg-root" and
