@@ -4,6 +4,7 @@
 #include <Pegasus/Common/Exception.h>
 
 #include <algorithm>
+#include <array>
 #include <utility>
 
 #include "files/TextFields.h"
@@ -26,6 +27,11 @@ constexpr unsigned kMethodNotAllowed = 405;
 constexpr unsigned kBodyTooLarge = 413;
 constexpr unsigned kUnsupportedMediaType = 415;
 constexpr unsigned kNotImplemented = 501;
+
+// The values of CIMError for what DSP0200 has and this server has not; all others are mistakes.
+constexpr std::array<std::string_view, 5> kNotImplementedErrors{
+    "multiple-requests-unsupported", "unsupported-cim-version", "unsupported-dtd-version",
+    "unsupported-operation", "unsupported-protocol-version"};
 
 HttpAnswer refusal(unsigned status) {
     HttpAnswer answer;
@@ -93,8 +99,8 @@ std::optional<HttpAnswer> headerMismatch(const HttpHead& head, const Pegasus::Ci
 }
 
 unsigned statusOf(const Pegasus::CimRequestError& error) {
-    const bool isMissing = error.cimError == "unsupported-operation" ||
-                           error.cimError == "multiple-requests-unsupported";
+    const bool isMissing = std::find(kNotImplementedErrors.begin(), kNotImplementedErrors.end(),
+                                     error.cimError) != kNotImplementedErrors.end();
     return isMissing ? kNotImplemented : kBadRequest;
 }
 
