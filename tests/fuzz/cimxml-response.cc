@@ -35,7 +35,7 @@ std::string classOutcome(std::string_view text, std::size_t pieceSize) {
     try {
         const Pegasus::CIMClass cimClass = Pegasus::decodeGetClassResponse(source, "7");
         if (!cimClass.isUninitialized()) {
-            Pegasus::appendClass(outcome, cimClass);
+            Pegasus::appendClassElement(outcome, cimClass);
         }
     } catch (const Pegasus::Exception& error) {
         outcome = error.getMessage().getCString();

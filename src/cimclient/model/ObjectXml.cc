@@ -126,9 +126,8 @@ void appendProperties(std::string& xml, const Owner& owner, const ObjectXmlOptio
 
 }  // namespace
 
-void appendClassElement(std::string& xml, const CIMConstClass& cimClass,
-                        const ObjectXmlOptions& options) {
-    beginClassElement(xml, cimClass, options);
+void appendClassElement(std::string& xml, const CIMConstClass& cimClass) {
+    beginClassElement(xml, cimClass, ObjectXmlOptions());
     endClassElement(xml);
 }
 

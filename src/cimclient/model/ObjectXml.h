@@ -37,8 +37,7 @@ void appendLocalNamespacePath(std::string& xml, const CIMNamespaceName& nameSpac
 void appendClassName(std::string& xml, const CIMName& className);
 
 /// CLASS with its qualifiers and properties. The class must be initialized.
-void appendClassElement(std::string& xml, const CIMConstClass& cimClass,
-                        const ObjectXmlOptions& options = ObjectXmlOptions());
+void appendClassElement(std::string& xml, const CIMConstClass& cimClass);
 
 /// The same without its end, so that more can be put into the element behind the properties.
 void beginClassElement(std::string& xml, const CIMConstClass& cimClass,

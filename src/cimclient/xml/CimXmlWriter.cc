@@ -121,11 +121,6 @@ void appendError(std::string& xml, Uint32 code, const String& description) {
     xml += "/>";
 }
 
-void appendClass(std::string& xml, const CIMConstClass& cimClass, const ObjectXmlOptions& options) {
-    appendClassElement(xml, cimClass, options);
-    xml += '\n';
-}
-
 void appendNamedInstance(std::string& xml, const CIMConstInstance& instance,
                          const ObjectXmlOptions& options) {
     xml += "<VALUE.NAMEDINSTANCE>";

@@ -51,10 +51,6 @@ void endReturnValue(std::string& xml);
 /// ERROR with the status code as defined in DSP0200.
 void appendError(std::string& xml, Uint32 code, const String& description);
 
-/// CLASS with its qualifiers and properties, and a line end. The class must be initialized.
-void appendClass(std::string& xml, const CIMConstClass& cimClass,
-                 const ObjectXmlOptions& options = ObjectXmlOptions());
-
 /// VALUE.NAMEDINSTANCE: the instance under its path, which must be set; and a line end.
 void appendNamedInstance(std::string& xml, const CIMConstInstance& instance,
                          const ObjectXmlOptions& options = ObjectXmlOptions());

@@ -8,7 +8,6 @@
 #include "InstanceText.h"
 #include "RecordedTree.h"
 #include "SchemaConformance.h"
-#include "providers/CimTime.h"
 #include "providers/ProviderList.h"
 
 namespace cimomd {
@@ -21,16 +20,6 @@ class ProvidersTest : public testing::Test {
     RecordedTree tree;
     FixedSystemCalls calls;
 };
-
-TEST(CimTime, writesLocalTimeWithItsOffset) {
-    EXPECT_EQ(utf8Of(cimTimeOf(0, 0)->toString()), "19700101000000.000000+000");
-    EXPECT_EQ(utf8Of(cimTimeOf(0, -90)->toString()), "19691231223000.000000-090");
-    EXPECT_EQ(utf8Of(cimTimeOf(253402300799, 0)->toString()), "99991231235959.000000+000");
-    EXPECT_FALSE(cimTimeOf(253402300800, 0));
-    EXPECT_FALSE(cimTimeOf(253402300799, 1));
-    EXPECT_FALSE(cimTimeOf(INT64_MAX, 60));
-    EXPECT_FALSE(cimTimeOf(0, 1000));
-}
 
 TEST_F(ProvidersTest, serveWhatTheSchemaDeclares) {
     tree.file("proc/cpuinfo", "processor: 0\n")

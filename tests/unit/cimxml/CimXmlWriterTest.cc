@@ -187,7 +187,7 @@ CIMClass sampleClass() {
 
 TEST(CimXmlWriter, AWholeClass) {
     std::string xml;
-    appendClass(xml, sampleClass());
+    appendClassElement(xml, sampleClass());
     EXPECT_EQ(xml,
               "<CLASS NAME=\"T_Thing\" SUPERCLASS=\"T_Base\">"
               "<QUALIFIER NAME=\"Version\" TYPE=\"string\" TOSUBCLASS=\"false\" "
@@ -200,14 +200,20 @@ TEST(CimXmlWriter, AWholeClass) {
               "<PROPERTY.ARRAY NAME=\"States\" TYPE=\"uint16\" ARRAYSIZE=\"4\" "
               "CLASSORIGIN=\"T_Thing\"></PROPERTY.ARRAY>"
               "<PROPERTY.REFERENCE NAME=\"Peer\" REFERENCECLASS=\"T_Other\"></PROPERTY.REFERENCE>"
-              "</CLASS>\n");
+              "</CLASS>");
+}
+
+std::string classXml(const ObjectXmlOptions& options) {
+    std::string xml;
+    beginClassElement(xml, sampleClass(), options);
+    endClassElement(xml);
+    return xml;
 }
 
 TEST(CimXmlWriter, OptionsLeavePartsOut) {
     ObjectXmlOptions options;
     options.localOnly = true;
-    std::string xml;
-    appendClass(xml, sampleClass(), options);
+    std::string xml = classXml(options);
     EXPECT_EQ(xml.find("Note"), std::string::npos);
     EXPECT_EQ(xml.find("\"Id\""), std::string::npos);
     EXPECT_NE(xml.find("Version"), std::string::npos);
@@ -220,16 +226,14 @@ TEST(CimXmlWriter, OptionsLeavePartsOut) {
     names.append(CIMName("ID"));
     names.append(CIMName("NoSuch"));
     options.propertyList.set(names);
-    xml.clear();
-    appendClass(xml, sampleClass(), options);
+    xml = classXml(options);
     EXPECT_EQ(xml,
               "<CLASS NAME=\"T_Thing\" SUPERCLASS=\"T_Base\"><PROPERTY NAME=\"Id\" TYPE=\"string\" "
-              "PROPAGATED=\"true\"></PROPERTY></CLASS>\n");
+              "PROPAGATED=\"true\"></PROPERTY></CLASS>");
 
     options.propertyList.set(Array<CIMName>());
-    xml.clear();
-    appendClass(xml, sampleClass(), options);
-    EXPECT_EQ(xml, "<CLASS NAME=\"T_Thing\" SUPERCLASS=\"T_Base\"></CLASS>\n");
+    xml = classXml(options);
+    EXPECT_EQ(xml, "<CLASS NAME=\"T_Thing\" SUPERCLASS=\"T_Base\"></CLASS>");
 }
 
 TEST(CimXmlWriter, NamedInstances) {

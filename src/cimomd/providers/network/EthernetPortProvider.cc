@@ -64,16 +64,6 @@ Fact<std::string> otherPortTypeOf(const Fact<Uint16>& type, const Fact<PortConne
 
 }  // namespace
 
-std::unique_ptr<InstanceStream> EthernetPortProvider::enumerate() const {
-    const auto isWanted = [](const NetworkInterface& interface) {
-        return interface.isEthernetPort();
-    };
-    return streamInterfaces(
-        paths, isWanted, [&systemCalls = calls](const auto& hostName, const auto& interface) {
-            return publish(hostName, interface, systemCalls.linkSettings(interface.name));
-        });
-}
-
 ProvidedInstance EthernetPortProvider::publish(const std::string& hostName,
                                                const NetworkInterface& interface,
                                                const LinkSettings& link) {

@@ -1,32 +1,24 @@
 #pragma once
 
-// The Ethernet ports that are hardware, a hypervisor's included. Reads /sys/class/net and asks the
-// drivers for the address burnt in and the connector.
+// The Ethernet ports that are hardware, a hypervisor's included.
 
-#include "providers/Provider.h"
-#include "system/SystemCalls.h"
-#include "system/SystemPaths.h"
-#include "system/network/NetworkInterface.h"
+#include "providers/network/NetworkPortProvider.h"
 
 namespace cimomd {
 
-class EthernetPortProvider : public Provider {
+class EthernetPortProvider : public NetworkPortProvider {
   public:
     static constexpr const char* kClassName = "Velmira_EthernetPort";
 
     /// `systemCalls` must outlive the provider and its streams.
     EthernetPortProvider(SystemPaths systemPaths, const SystemCalls& systemCalls)
-        : paths(std::move(systemPaths)), calls(systemCalls) {}
+        : NetworkPortProvider(std::move(systemPaths), systemCalls,
+                              &NetworkInterface::isEthernetPort, publish) {}
 
     const char* className() const override { return kClassName; }
-    std::unique_ptr<InstanceStream> enumerate() const override;
 
     static ProvidedInstance publish(const std::string& hostName, const NetworkInterface& interface,
                                     const LinkSettings& link);
-
-  private:
-    SystemPaths paths;
-    const SystemCalls& calls;
 };
 
 }  // namespace cimomd

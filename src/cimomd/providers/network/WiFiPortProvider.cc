@@ -12,14 +12,6 @@ constexpr Uint16 kLinkTechnologyWirelessLan = 11;
 
 }  // namespace
 
-std::unique_ptr<InstanceStream> WiFiPortProvider::enumerate() const {
-    const auto isWanted = [](const NetworkInterface& interface) { return interface.isWifiPort(); };
-    return streamInterfaces(
-        paths, isWanted, [&systemCalls = calls](const auto& hostName, const auto& interface) {
-            return publish(hostName, interface, systemCalls.linkSettings(interface.name));
-        });
-}
-
 ProvidedInstance WiFiPortProvider::publish(const std::string& hostName,
                                            const NetworkInterface& interface,
                                            const LinkSettings& link) {

@@ -18,10 +18,6 @@ Fact<Uint64> inodesOf(const Fact<FileSystemSize>& size, std::uint64_t FileSystem
 
 }  // namespace
 
-std::unique_ptr<InstanceStream> LocalFileSystemProvider::enumerate() const {
-    return streamFileSystems(paths, calls, FileSystemKind::Local, publish);
-}
-
 ProvidedInstance LocalFileSystemProvider::publish(const std::string& hostName, const Mount& mount,
                                                   const Fact<FileSystemSize>& size) {
     InstanceBuilder builder(kClassName);

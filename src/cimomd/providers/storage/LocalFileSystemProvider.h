@@ -2,30 +2,22 @@
 
 // The mounted file systems on devices of this machine, each once.
 
-#include "providers/Provider.h"
-#include "system/SystemCalls.h"
-#include "system/SystemPaths.h"
-#include "system/storage/MountInfo.h"
+#include "providers/storage/FileSystemProvider.h"
 
 namespace cimomd {
 
-class LocalFileSystemProvider : public Provider {
+class LocalFileSystemProvider : public FileSystemProvider {
   public:
     static constexpr const char* kClassName = "Velmira_LocalFileSystem";
 
     /// `systemCalls` must outlive the provider.
     LocalFileSystemProvider(SystemPaths systemPaths, const SystemCalls& systemCalls)
-        : paths(std::move(systemPaths)), calls(systemCalls) {}
+        : FileSystemProvider(std::move(systemPaths), systemCalls, FileSystemKind::Local, publish) {}
 
     const char* className() const override { return kClassName; }
-    std::unique_ptr<InstanceStream> enumerate() const override;
 
     static ProvidedInstance publish(const std::string& hostName, const Mount& mount,
                                     const Fact<FileSystemSize>& size);
-
-  private:
-    SystemPaths paths;
-    const SystemCalls& calls;
 };
 
 }  // namespace cimomd

@@ -30,10 +30,6 @@ void addOptions(InstanceBuilder& builder, const NfsOptions& options) {
 
 }  // namespace
 
-std::unique_ptr<InstanceStream> NFSProvider::enumerate() const {
-    return streamFileSystems(paths, calls, FileSystemKind::Nfs, publish);
-}
-
 ProvidedInstance NFSProvider::publish(const std::string& hostName, const Mount& mount,
                                       const Fact<FileSystemSize>& size) {
     InstanceBuilder builder(kClassName);

@@ -2,30 +2,22 @@
 
 // The mounted file systems of NFS servers, each once.
 
-#include "providers/Provider.h"
-#include "system/SystemCalls.h"
-#include "system/SystemPaths.h"
-#include "system/storage/MountInfo.h"
+#include "providers/storage/FileSystemProvider.h"
 
 namespace cimomd {
 
-class NFSProvider : public Provider {
+class NFSProvider : public FileSystemProvider {
   public:
     static constexpr const char* kClassName = "Velmira_NFS";
 
     /// `systemCalls` must outlive the provider.
     NFSProvider(SystemPaths systemPaths, const SystemCalls& systemCalls)
-        : paths(std::move(systemPaths)), calls(systemCalls) {}
+        : FileSystemProvider(std::move(systemPaths), systemCalls, FileSystemKind::Nfs, publish) {}
 
     const char* className() const override { return kClassName; }
-    std::unique_ptr<InstanceStream> enumerate() const override;
 
     static ProvidedInstance publish(const std::string& hostName, const Mount& mount,
                                     const Fact<FileSystemSize>& size);
-
-  private:
-    SystemPaths paths;
-    const SystemCalls& calls;
 };
 
 }  // namespace cimomd

@@ -5,10 +5,6 @@
 
 namespace cimomd {
 
-std::unique_ptr<InstanceStream> RemoteFileSystemProvider::enumerate() const {
-    return streamFileSystems(paths, calls, FileSystemKind::Remote, publish);
-}
-
 ProvidedInstance RemoteFileSystemProvider::publish(const std::string& hostName, const Mount& mount,
                                                    const Fact<FileSystemSize>& size) {
     InstanceBuilder builder(kClassName);
