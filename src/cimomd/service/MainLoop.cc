@@ -11,6 +11,7 @@
 #include <cstring>
 #include <stdexcept>
 
+#include "service/EndDeadline.h"
 #include "service/Log.h"
 
 namespace cimomd {
@@ -19,6 +20,8 @@ namespace {
 using Clock = std::chrono::steady_clock;
 
 constexpr int kWatchEveryMs = 500;
+// For answers under way, whose clients are cut off already.
+constexpr unsigned kEndSeconds = 5;
 // Without descriptors or memory there is no use in trying again at once.
 constexpr auto kPauseAfterFailure = std::chrono::milliseconds(200);
 
@@ -46,6 +49,7 @@ MainLoop::MainLoop(HttpServer& httpServer, Signals& daemonSignals)
 }
 
 MainLoop::~MainLoop() {
+    const EndDeadline deadline(kEndSeconds);
     server.stop();
     ::close(ended);
 }

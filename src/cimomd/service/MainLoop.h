@@ -16,6 +16,8 @@ class MainLoop {
   public:
     /// Both must outlive the loop. Raises std::runtime_error when the kernel gives no descriptor.
     MainLoop(HttpServer& httpServer, Signals& daemonSignals);
+    /// Closes all connections. When a provider still works after five seconds, the process ends
+    /// without it.
     ~MainLoop();
     MainLoop(const MainLoop&) = delete;
     MainLoop& operator=(const MainLoop&) = delete;

@@ -5,6 +5,7 @@ badly."""
 import argparse
 import os
 import pathlib
+import re
 import shutil
 import signal
 import socket
@@ -176,6 +177,20 @@ class UnixSocketTest(CimomdTest):
                       server.log())
         self.assertEqual(server.end(), 0)
         self.assertFalse(os.path.exists(path))
+
+    def test_both_kinds_of_sockets_give_the_same(self):
+        path = str(self.place / "s")
+        server = self.started("--socket", path, "--http", "127.0.0.1:0")
+        port = server.port()
+        request = post(call("EnumerateInstances", class_name("CIM_OperatingSystem")))
+        with socket.socket(socket.AF_UNIX) as connection:
+            connection.connect(path)
+            local = body_of(exchange(connection, request))
+        with socket.create_connection(("127.0.0.1", port), PATIENCE_S) as connection:
+            over_http = body_of(exchange(connection, request))
+        self.assertIn(b"<VALUE>node7</VALUE>", local)
+        changing = rb"(<PROPERTY NAME=\"(LocalDateTime|NumberOfProcesses)\".*?</PROPERTY>)"
+        self.assertEqual(re.sub(changing, b"", local), re.sub(changing, b"", over_http))
 
     def test_a_wrong_reload_is_told_with_its_place(self):
         path = str(self.place / "s")

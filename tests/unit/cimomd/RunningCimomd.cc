@@ -10,6 +10,7 @@
 #include <array>
 #include <chrono>
 #include <csignal>
+#include <cstdlib>
 #include <cstring>
 #include <thread>
 
@@ -33,6 +34,15 @@ bool isWholeAnswer(const std::string& text) {
     const std::size_t length = head.find("Content-Length: ");
     return length != std::string::npos &&
            text.size() - headEnd - 4 >= std::stoul(head.substr(length + 16));
+}
+
+/// In the child: what sd_listen_fds(3) looks for. The descriptor's new number.
+int activate(int listeningSocket) {
+    constexpr int kFirstHandedOver = 3;
+    ::dup2(listeningSocket, kFirstHandedOver);
+    ::setenv("LISTEN_FDS", "1", 1);
+    ::setenv("LISTEN_PID", std::to_string(::getpid()).c_str(), 1);
+    return kFirstHandedOver;
 }
 
 }  // namespace
@@ -92,7 +102,8 @@ void Connection::close() {
     descriptor = -1;
 }
 
-RunningCimomd::RunningCimomd(const std::vector<std::string>& arguments, int inherited) {
+RunningCimomd::RunningCimomd(const std::vector<std::string>& arguments, int inherited,
+                             Handover handover) {
     std::vector<std::string> words{TEST_BIN_DIR "/cimomd"};
     words.insert(words.end(), arguments.begin(), arguments.end());
     std::vector<char*> argv;
@@ -102,6 +113,8 @@ RunningCimomd::RunningCimomd(const std::vector<std::string>& arguments, int inhe
     child = ::fork();
     if (child != 0)
         return;
+    if (handover == Handover::Activation)
+        inherited = activate(inherited);
     if (inherited >= 0)
         ::fcntl(inherited, F_SETFD, 0);
     const int quiet = ::open("/dev/null", O_WRONLY);

@@ -39,8 +39,13 @@ class Connection {
 /// Started with `arguments`; killed at the end if it still runs.
 class RunningCimomd {
   public:
-    /// `inherited` stays open in the child under its number; -1 for none.
-    explicit RunningCimomd(const std::vector<std::string>& arguments, int inherited = -1);
+    /// What becomes of a descriptor that the child inherits: it keeps its number, or it is handed
+    /// over as a service manager does it.
+    enum class Handover { SameNumber, Activation };
+
+    /// `inherited` stays open in the child; -1 for none.
+    explicit RunningCimomd(const std::vector<std::string>& arguments, int inherited = -1,
+                           Handover handover = Handover::SameNumber);
     ~RunningCimomd();
     RunningCimomd(const RunningCimomd&) = delete;
     RunningCimomd& operator=(const RunningCimomd&) = delete;
