@@ -31,7 +31,8 @@ def run(measure, command, environment, directory):
                           stdout=subprocess.PIPE, stderr=subprocess.PIPE, text=True,
                           check=False)
     if done.returncode != 0:
-        raise Failure(f"{' '.join(command)} ended with status {done.returncode}\n{done.stderr}")
+        raise Failure(f"{' '.join(command)} ended with status {done.returncode}\n"
+                      f"{done.stdout}{done.stderr}")
     return read(result), done.stdout
 
 

@@ -5,7 +5,7 @@
 //
 // Writes into FILE one line: seconds of CPU in user mode and in the kernel, both with all
 // descendants; seconds from start to end; peak of resident memory of the largest process in KiB.
-// The exit status is the program's.
+// The exit status is the program's, as a shell tells it.
 
 #include <sys/prctl.h>
 #include <sys/resource.h>
@@ -18,6 +18,8 @@
 namespace {
 
 using Clock = std::chrono::steady_clock;
+
+constexpr int kSignalled = 128;
 
 double seconds(const timeval& time) {
     return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) / 1e6;
@@ -54,5 +56,5 @@ int main(int argc, char** argv) {
     std::fprintf(file, "%.6f %.6f %.6f %ld\n", seconds(usage.ru_utime), seconds(usage.ru_stime),
                  wall.count(), usage.ru_maxrss);
     std::fclose(file);
-    return WIFEXITED(status) ? WEXITSTATUS(status) : 1;
+    return WIFEXITED(status) ? WEXITSTATUS(status) : kSignalled + WTERMSIG(status);
 }
