@@ -1,5 +1,7 @@
 #include "mof/MofInstanceClass.h"
 
+#include "repository/QualifierInheritance.h"
+
 namespace cimomd {
 namespace {
 
@@ -11,13 +13,7 @@ using Pegasus::CIMValue;
 bool isKey(const CIMConstProperty& property) {
     static const CIMName kKey("Key");
     const Pegasus::Uint32 position = property.findQualifier(kKey);
-    if (position == Pegasus::PEG_NOT_FOUND)
-        return false;
-    const CIMValue value = property.getQualifier(position).getValue();
-    Pegasus::Boolean isTrue = false;
-    if (value.getType() == Pegasus::CIMTYPE_BOOLEAN && !value.isArray())
-        value.get(isTrue);
-    return isTrue;
+    return position != Pegasus::PEG_NOT_FOUND && isTrue(property.getQualifier(position));
 }
 
 }  // namespace

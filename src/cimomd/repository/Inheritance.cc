@@ -2,6 +2,7 @@
 
 #include <fmt/format.h>
 
+#include <string>
 #include <utility>
 
 #include "repository/QualifierInheritance.h"
@@ -33,9 +34,14 @@ void inheritQualifiers(Element& super, const ConstElement* declared, Element& ta
 }
 
 template <typename Element>
-void takeQualifiers(Element& declared, Element& target) {
-    for (Uint32 i = 0; i < declared.getQualifierCount(); ++i)
-        target.addQualifier(declared.getQualifier(i));
+void takeQualifiers(const Element& super, Element& declared, Element& target) {
+    for (Uint32 i = 0; i < declared.getQualifierCount(); ++i) {
+        const CIMQualifier qualifier = declared.getQualifier(i);
+        const Uint32 before = super.findQualifier(qualifier.getName());
+        target.addQualifier(before == Pegasus::PEG_NOT_FOUND
+                                ? qualifier
+                                : overriding(super.getQualifier(before), qualifier));
+    }
 }
 
 CIMProperty bareProperty(const CIMConstProperty& property, const CIMName& origin,
@@ -57,17 +63,22 @@ CIMProperty overridingProperty(CIMProperty super, CIMProperty declared) {
     if (declared.getValue().isNull())
         out.setValue(super.getValue());
     inheritQualifiers<CIMProperty, CIMConstProperty>(super, &declared, out);
-    takeQualifiers(declared, out);
+    takeQualifiers(super, declared, out);
     return out;
 }
 
-bool sameType(const CIMConstProperty& a, const CIMConstProperty& b) {
-    return a.getType() == b.getType() && a.isArray() == b.isArray();
+bool keepsType(const CIMConstProperty& super, const CIMConstProperty& declared) {
+    const bool isSizeKept =
+        super.getArraySize() == 0 || super.getArraySize() == declared.getArraySize();
+    return super.getType() == declared.getType() && super.isArray() == declared.isArray() &&
+           isSizeKept;
 }
 
 std::string typeText(const CIMConstProperty& property) {
+    const std::string size =
+        property.getArraySize() == 0 ? "" : std::to_string(property.getArraySize());
     return fmt::format("{}{}", Pegasus::cimTypeToString(property.getType()),
-                       property.isArray() ? "[]" : "");
+                       property.isArray() ? "[" + size + "]" : "");
 }
 
 template <typename Element>
@@ -83,7 +94,7 @@ void checkQualifiers(const Element& super, const Element& declared, RepositoryEr
 void checkProperty(const CIMConstProperty& super, const CIMConstProperty& declared,
                    RepositoryErrors& errors) {
     const std::size_t first = errors.size();
-    if (!sameType(super, declared)) {
+    if (!keepsType(super, declared)) {
         RepositoryError error;
         error.found =
             fmt::format("{} {}", typeText(declared), utf8Of(declared.getName().getString()));
@@ -93,6 +104,19 @@ void checkProperty(const CIMConstProperty& super, const CIMConstProperty& declar
     checkQualifiers(super, declared, errors);
     for (std::size_t i = first; i < errors.size(); ++i)
         errors[i].property = declared.getName();
+}
+
+void checkTerminal(const CIMConstClass& super, RepositoryErrors& errors) {
+    static const CIMName kTerminal("Terminal");
+    const Uint32 index = super.findQualifier(kTerminal);
+    if (index == Pegasus::PEG_NOT_FOUND || !isTrue(super.getQualifier(index)))
+        return;
+    RepositoryError error;
+    error.atSuperClass = true;
+    error.found =
+        fmt::format("superclass {}, which is terminal", utf8Of(super.getClassName().getString()));
+    error.expected = "a class that may have subclasses";
+    errors.push_back(std::move(error));
 }
 
 }  // namespace
@@ -106,7 +130,7 @@ CIMClass asTopClass(CIMClass declared) {
 CIMClass inherit(CIMClass super, CIMClass declared) {
     CIMClass out(declared.getClassName(), super.getClassName());
     inheritQualifiers<CIMClass, CIMConstClass>(super, &declared, out);
-    takeQualifiers(declared, out);
+    takeQualifiers(super, declared, out);
     for (Uint32 i = 0; i < super.getPropertyCount(); ++i) {
         const CIMProperty property = super.getProperty(i);
         const Uint32 index = declared.findProperty(property.getName());
@@ -127,6 +151,7 @@ CIMClass inherit(CIMClass super, CIMClass declared) {
 
 RepositoryErrors checkOverrides(const CIMConstClass& super, const CIMConstClass& declared) {
     RepositoryErrors errors;
+    checkTerminal(super, errors);
     checkQualifiers(super, declared, errors);
     for (Uint32 i = 0; i < declared.getPropertyCount(); ++i) {
         const CIMConstProperty property = declared.getProperty(i);

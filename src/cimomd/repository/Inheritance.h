@@ -17,8 +17,8 @@ Pegasus::CIMClass asTopClass(Pegasus::CIMClass declared);
 /// propagated. A property keeps the origin of the class that declared it first.
 Pegasus::CIMClass inherit(Pegasus::CIMClass super, Pegasus::CIMClass declared);
 
-/// Where `declared` changes the type of a property of `super`, or the value of a qualifier whose
-/// flavor is DisableOverride.
+/// Whether `super` is terminal, and where `declared` changes the type or the fixed size of a
+/// property of `super`, or the value of a qualifier whose flavor is DisableOverride.
 RepositoryErrors checkOverrides(const Pegasus::CIMConstClass& super,
                                 const Pegasus::CIMConstClass& declared);
 

@@ -3,6 +3,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <string>
 #include <utility>
 
 #include "repository/QualifierInheritance.h"
@@ -44,7 +45,10 @@ QualifierList inheritQualifiers(const QualifierList& super, const QualifierList&
         if (goesToSubclasses(qualifier) && findQualifier(declared, qualifier.getName()) == nullptr)
             out.push_back(propagated(qualifier));
     }
-    out.insert(out.end(), declared.begin(), declared.end());
+    for (const CIMConstQualifier& qualifier : declared) {
+        const CIMConstQualifier* before = findQualifier(super, qualifier.getName());
+        out.push_back(before == nullptr ? qualifier : overriding(*before, qualifier));
+    }
     return out;
 }
 
@@ -72,16 +76,70 @@ std::shared_ptr<const MethodDeclaration> overriding(const MethodDeclaration& sup
     return std::make_shared<const MethodDeclaration>(std::move(declared));
 }
 
-void checkQualifiers(const MethodDeclaration& super, const MethodDeclaration& declared,
+void checkQualifiers(const QualifierList& super, const QualifierList& declared,
                      RepositoryErrors& errors) {
-    const std::size_t first = errors.size();
-    for (const CIMConstQualifier& qualifier : declared.qualifiers) {
-        const CIMConstQualifier* before = findQualifier(super.qualifiers, qualifier.getName());
+    for (const CIMConstQualifier& qualifier : declared) {
+        const CIMConstQualifier* before = findQualifier(super, qualifier.getName());
         if (before != nullptr)
             checkOverride(*before, qualifier, errors);
     }
+}
+
+std::string typeText(const ParameterDeclaration& parameter) {
+    return fmt::format("{}{}", Pegasus::cimTypeToString(parameter.type),
+                       parameter.isArray ? "[]" : "");
+}
+
+/// In and Out say how this one declaration is called.
+QualifierList withoutDirection(const QualifierList& qualifiers) {
+    static const CIMName kIn("In");
+    static const CIMName kOut("Out");
+    QualifierList out;
+    for (const CIMConstQualifier& qualifier : qualifiers) {
+        if (!qualifier.getName().equal(kIn) && !qualifier.getName().equal(kOut))
+            out.push_back(qualifier);
+    }
+    return out;
+}
+
+void checkParameter(const ParameterDeclaration& super, const ParameterDeclaration& declared,
+                    RepositoryErrors& errors) {
+    const std::size_t first = errors.size();
+    if (super.type != declared.type || super.isArray != declared.isArray) {
+        RepositoryError error;
+        error.found = fmt::format("{} {}", typeText(declared), utf8Of(declared.name.getString()));
+        error.expected = fmt::format("the inherited type {}", typeText(super));
+        errors.push_back(std::move(error));
+    }
+    checkQualifiers(super.qualifiers, withoutDirection(declared.qualifiers), errors);
     for (std::size_t i = first; i < errors.size(); ++i)
-        errors[i].method = declared.name;
+        errors[i].parameter = declared.name;
+}
+
+/// Schemas also use a name again for a method of its own, with other parameters: only what says
+/// that it is an override has to fit.
+void checkParameters(const MethodDeclaration& super, const MethodDeclaration& declared,
+                     RepositoryErrors& errors) {
+    static const CIMName kOverride("Override");
+    if (findQualifier(declared.qualifiers, kOverride) == nullptr)
+        return;
+    for (const ParameterDeclaration& parameter : declared.parameters) {
+        const auto before = findNamed(super.parameters, parameter.name);
+        if (before != super.parameters.end())
+            checkParameter(*before, parameter, errors);
+    }
+}
+
+void checkReturnType(const MethodDeclaration& super, const MethodDeclaration& declared,
+                     RepositoryErrors& errors) {
+    if (super.returnType == declared.returnType)
+        return;
+    RepositoryError error;
+    error.found = fmt::format("{} {}()", Pegasus::cimTypeToString(declared.returnType),
+                              utf8Of(declared.name.getString()));
+    error.expected =
+        fmt::format("the inherited return type {}", Pegasus::cimTypeToString(super.returnType));
+    errors.push_back(std::move(error));
 }
 
 }  // namespace
@@ -109,16 +167,12 @@ void checkMethodOverrides(const MethodList& super, const std::vector<MethodDecla
         const MethodDeclaration* before = findMethod(super, method.name);
         if (before == nullptr)
             continue;
-        checkQualifiers(*before, method, errors);
-        if (before->returnType == method.returnType)
-            continue;
-        RepositoryError error;
-        error.method = method.name;
-        error.found = fmt::format("{} {}()", Pegasus::cimTypeToString(method.returnType),
-                                  utf8Of(method.name.getString()));
-        error.expected = fmt::format("the inherited return type {}",
-                                     Pegasus::cimTypeToString(before->returnType));
-        errors.push_back(std::move(error));
+        const std::size_t first = errors.size();
+        checkQualifiers(before->qualifiers, method.qualifiers, errors);
+        checkReturnType(*before, method, errors);
+        checkParameters(*before, method, errors);
+        for (std::size_t i = first; i < errors.size(); ++i)
+            errors[i].method = method.name;
     }
 }
 

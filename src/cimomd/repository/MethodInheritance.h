@@ -13,8 +13,9 @@ namespace cimomd {
 MethodList inheritMethods(const MethodList& super, std::vector<MethodDeclaration> declared,
                           const Pegasus::CIMName& className);
 
-/// Appends to `errors` where `declared` changes the return type of a method of `super`, or the
-/// value of a qualifier of one whose flavor is DisableOverride.
+/// Appends to `errors` where `declared` changes the return type of a method of `super`, the type of
+/// a parameter that both have (in methods with the qualifier Override), or the value of a qualifier
+/// of either whose flavor is DisableOverride. What is new in `declared` always fits.
 void checkMethodOverrides(const MethodList& super, const std::vector<MethodDeclaration>& declared,
                           RepositoryErrors& errors);
 

@@ -13,22 +13,32 @@ namespace {
 using Pegasus::CIMConstQualifier;
 using Pegasus::CIMFlavor;
 
-bool sameValue(const CIMConstQualifier& a, const CIMConstQualifier& b) {
+}  // namespace
+
+bool haveSameValue(const CIMConstQualifier& a, const CIMConstQualifier& b) {
     return a.getValue().isNull() == b.getValue().isNull() &&
            a.getValue().toString() == b.getValue().toString();
 }
-
-}  // namespace
 
 bool goesToSubclasses(const CIMConstQualifier& qualifier) {
     return qualifier.getFlavor().has(CIMFlavor::TOSUBCLASS);
 }
 
+bool isTrue(const CIMConstQualifier& qualifier) {
+    const Pegasus::CIMValue value = qualifier.getValue();
+    Pegasus::Boolean isTrue = false;
+    if (value.getType() == Pegasus::CIMTYPE_BOOLEAN && !value.isArray() && !value.isNull())
+        value.get(isTrue);
+    return isTrue;
+}
+
+bool isBinding(const CIMConstQualifier& qualifier) {
+    return goesToSubclasses(qualifier) && !qualifier.getFlavor().has(CIMFlavor::OVERRIDABLE);
+}
+
 void checkOverride(const CIMConstQualifier& inherited, const CIMConstQualifier& declared,
                    RepositoryErrors& errors) {
-    const bool bound =
-        goesToSubclasses(inherited) && !inherited.getFlavor().has(CIMFlavor::OVERRIDABLE);
-    if (!bound || sameValue(inherited, declared))
+    if (!isBinding(inherited) || haveSameValue(inherited, declared))
         return;
     RepositoryError error;
     error.qualifier = declared.getName();

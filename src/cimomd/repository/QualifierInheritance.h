@@ -21,6 +21,23 @@ Qualifier propagated(const Qualifier& qualifier) {
 
 bool goesToSubclasses(const Pegasus::CIMConstQualifier& qualifier);
 
+/// Whether the value is the boolean true.
+bool isTrue(const Pegasus::CIMConstQualifier& qualifier);
+
+/// Whether subclasses have to keep the value of the qualifier.
+bool isBinding(const Pegasus::CIMConstQualifier& qualifier);
+
+bool haveSameValue(const Pegasus::CIMConstQualifier& a, const Pegasus::CIMConstQualifier& b);
+
+/// `declared` as it stands in the subclass, in the place of `inherited`. A qualifier that may not
+/// be overridden keeps its flavor as well: no step on the way down sets it free.
+template <typename Qualifier>
+Qualifier overriding(const Pegasus::CIMConstQualifier& inherited, const Qualifier& declared) {
+    if (!isBinding(inherited))
+        return declared;
+    return Pegasus::CIMQualifier(declared.getName(), declared.getValue(), inherited.getFlavor());
+}
+
 /// Appends to `errors` when `inherited` may not be overridden and `declared`, the qualifier of the
 /// same name, has another value.
 void checkOverride(const Pegasus::CIMConstQualifier& inherited,

@@ -15,6 +15,8 @@ struct RepositoryError {
     /// fault.
     Pegasus::CIMName property;
     Pegasus::CIMName method;
+    /// Null unless a parameter of `method` is at fault.
+    Pegasus::CIMName parameter;
     /// Null when no qualifier of the part is at fault.
     Pegasus::CIMName qualifier;
     std::string found;
