@@ -5,11 +5,13 @@
 namespace cimomd {
 namespace {
 
-void checkAlone(const std::vector<std::filesystem::path>& files,
+void checkAlone(const std::vector<std::filesystem::path>& files, const ClassRepository& shipped,
                 const Pegasus::CIMNamespaceName& nameSpace, const MofErrors& errorsOnTop) {
     ClassRepository empty;
     try {
-        MofCompiler(empty, nameSpace).compileFiles(files);
+        MofCompiler compiler(empty, nameSpace);
+        compiler.useQualifiersOf(shipped);
+        compiler.compileFiles(files);
     } catch (const MofErrors& errors) {
         if (errors.errors().size() > errorsOnTop.errors().size())
             throw MofErrors(errorsOnTop);
@@ -28,7 +30,7 @@ void checkMofFiles(const std::vector<std::filesystem::path>& files, const ClassR
     } catch (const MofErrors& errors) {
         if (!compiler.redeclaredQualifiers())
             throw;
-        checkAlone(files, nameSpace, errors);
+        checkAlone(files, shipped, nameSpace, errors);
     }
 }
 

@@ -14,8 +14,9 @@ namespace cimomd {
 
 /// Raises MofErrors with the mistakes of `files`, which are compiled together. They are read as
 /// what an administrator adds to `shipped`. When that fails and they declare qualifiers of
-/// `shipped` themselves, they are read as a schema of their own too; the mistakes told are those
-/// of the reading that has fewer.
+/// `shipped` themselves, they are read as a schema of their own too, which takes from `shipped`
+/// only the qualifiers that it does not declare; the mistakes told are those of the reading that
+/// has fewer.
 void checkMofFiles(const std::vector<std::filesystem::path>& files, const ClassRepository& shipped,
                    const Pegasus::CIMNamespaceName& nameSpace);
 

@@ -6,6 +6,7 @@
 #include "mof/MofQualifiers.h"
 #include "mof/MofToken.h"
 #include "mof/MofValue.h"
+#include "repository/QualifierInheritance.h"
 #include "text/Utf8.h"
 
 namespace cimomd {
@@ -26,17 +27,27 @@ QualifierScopes inheritedScopes(const MofClass& declaration, const MofContext& c
     if (super == nullptr)
         return kScopeAssociation | kScopeIndication;
     QualifierScopes scopes = super->isAssociation() ? kScopeAssociation : 0;
-    if (super->findQualifier(CIMName("Indication")) != Pegasus::PEG_NOT_FOUND)
+    const Pegasus::Uint32 indication = super->findQualifier(CIMName("Indication"));
+    if (indication != Pegasus::PEG_NOT_FOUND && isTrue(super->getQualifier(indication)))
         scopes |= kScopeIndication;
     return scopes;
+}
+
+bool isSetTo(const MofQualifier& qualifier, std::string_view name) {
+    if (!equalsIgnoringCase(qualifier.name.text, name))
+        return false;
+    if (!qualifier.value || qualifier.value->elements.empty())
+        return true;
+    const bool* value = std::get_if<bool>(&qualifier.value->elements.front().value);
+    return value == nullptr || *value;
 }
 
 QualifierScopes scopesOf(const MofClass& declaration, const MofContext& context) {
     QualifierScopes scopes = kScopeClass | inheritedScopes(declaration, context);
     for (const MofQualifier& qualifier : declaration.qualifiers) {
-        if (equalsIgnoringCase(qualifier.name.text, "association"))
+        if (isSetTo(qualifier, "association"))
             scopes |= kScopeAssociation;
-        if (equalsIgnoringCase(qualifier.name.text, "indication"))
+        if (isSetTo(qualifier, "indication"))
             scopes |= kScopeIndication;
     }
     return scopes;
@@ -90,7 +101,7 @@ bool isNew(std::set<CIMName, NameOrder>& names, const MofName& name, const MofCo
            std::string_view expected) {
     if (names.insert(nameOf(name)).second)
         return true;
-    context.report(name.position, shownText(name.text), expected);
+    context.report(name.position, quotedText(name.text), expected);
     return false;
 }
 
@@ -149,8 +160,11 @@ MofPosition positionOf(const RepositoryError& error, const MofClass& declaration
         return declaration.superClass->position;
     if (const MofProperty* property = findNamed(declaration.properties, error.property))
         return positionIn(property->name, property->qualifiers, error.qualifier);
-    if (const MofMethod* method = findNamed(declaration.methods, error.method))
+    if (const MofMethod* method = findNamed(declaration.methods, error.method)) {
+        if (const MofParameter* parameter = findNamed(method->parameters, error.parameter))
+            return positionIn(parameter->name, parameter->qualifiers, error.qualifier);
         return positionIn(method->name, method->qualifiers, error.qualifier);
+    }
     return positionIn(declaration.name, declaration.qualifiers, error.qualifier);
 }
 

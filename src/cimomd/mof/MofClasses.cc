@@ -6,6 +6,7 @@
 
 #include "mof/MofClassBuilder.h"
 #include "mof/MofToken.h"
+#include "text/CimText.h"
 
 namespace cimomd {
 namespace {
@@ -17,9 +18,20 @@ void reportSuperClass(const MofName& superClass, const MofContext& context) {
                    "a class that is declared");
 }
 
+/// Whether one of the classes of two references is the other or below it. Hierarchies change from
+/// version to version of a schema, so that an override may have become the wider one.
+bool areRelated(const CIMName& a, const CIMName& b, const MofContext& context) {
+    return context.repository.isSameOrSubclass(context.nameSpace, a, b) ||
+           context.repository.isSameOrSubclass(context.nameSpace, b, a);
+}
+
 }  // namespace
 
 void MofClasses::declare(MofClass declaration, const MofContextPointer& context) {
+    if (declaration.superClass && nameOf(*declaration.superClass).equal(nameOf(declaration.name))) {
+        refuseOwnSuperClass(declaration, *context);
+        return;
+    }
     const bool hasSuperClass =
         !declaration.superClass ||
         context->repository.findClass(context->nameSpace, nameOf(*declaration.superClass));
@@ -27,6 +39,15 @@ void MofClasses::declare(MofClass declaration, const MofContextPointer& context)
         add(declaration, context);
     else
         keepWaiting(std::move(declaration), context);
+}
+
+/// What is wrong in the class itself is told nevertheless.
+void MofClasses::refuseOwnSuperClass(const MofClass& declaration, const MofContext& context) {
+    context.report(declaration.superClass->position,
+                   fmt::format("class {} as its own superclass", shownText(declaration.name.text)),
+                   "another class");
+    buildClass(declaration, context);
+    faulty.insert(keyOf(context.nameSpace, nameOf(declaration.name)));
 }
 
 /// Adds those that wait for the class too. The repository bounds how deep this goes.
@@ -39,6 +60,10 @@ void MofClasses::add(const MofClass& declaration, const MofContextPointer& conte
         context->nameSpace, std::move(built.cimClass), std::move(built.methods));
     for (const RepositoryError& error : errors)
         context->report(positionOf(error, declaration), error.found, error.expected);
+    if (errors.empty()) {
+        noteOverrides(declaration, context);
+        checkAsAssociation(declaration, *context);
+    }
     if (!declaration.isComplete || context->log.count() != before)
         faulty.insert(key);
     if (!errors.empty())
@@ -74,6 +99,54 @@ void MofClasses::noteReferences(const MofClass& declaration, const MofContextPoi
     }
 }
 
+void MofClasses::noteOverrides(const MofClass& declaration, const MofContextPointer& context) {
+    const auto* super =
+        declaration.superClass
+            ? context->repository.findClass(context->nameSpace, nameOf(*declaration.superClass))
+            : nullptr;
+    for (const MofProperty& property : declaration.properties) {
+        const MofName& name = property.type.referenceClass;
+        const Pegasus::Uint32 index = super == nullptr || name.text.empty()
+                                          ? Pegasus::PEG_NOT_FOUND
+                                          : super->findProperty(nameOf(property.name));
+        if (index == Pegasus::PEG_NOT_FOUND)
+            continue;
+        const CIMName inherited = super->getProperty(index).getReferenceClassName();
+        if (!areRelated(nameOf(name), inherited, *context) &&
+            overriddenReferences.size() < kMaxOpen)
+            overriddenReferences.push_back({name, inherited, context});
+    }
+}
+
+void MofClasses::reportOverrides() const {
+    for (const OverriddenReference& reference : overriddenReferences) {
+        const MofContext& context = *reference.context;
+        const CIMName given = nameOf(reference.name);
+        const bool areKnown =
+            context.repository.findClass(context.nameSpace, given) != nullptr &&
+            context.repository.findClass(context.nameSpace, reference.inherited) != nullptr;
+        if (areKnown && !areRelated(given, reference.inherited, context))
+            context.report(reference.name.position,
+                           fmt::format("class {}", shownText(reference.name.text)),
+                           fmt::format("the inherited class {} or one below it",
+                                       utf8Of(reference.inherited.getString())));
+    }
+}
+
+void MofClasses::checkAsAssociation(const MofClass& declaration, const MofContext& context) const {
+    const auto* built = context.repository.findClass(context.nameSpace, nameOf(declaration.name));
+    if (!declaration.isComplete || !built->isAssociation() || built->isAbstract())
+        return;
+    for (Pegasus::Uint32 i = 0; i < built->getPropertyCount(); ++i) {
+        if (built->getProperty(i).getType() == Pegasus::CIMTYPE_REFERENCE)
+            return;
+    }
+    context.report(
+        declaration.name.position,
+        fmt::format("association {} without references", shownText(declaration.name.text)),
+        "references to the classes that it connects");
+}
+
 void MofClasses::finish() {
     std::vector<std::string> undeclared;
     for (const auto& [superKey, entries] : waiting) {
@@ -86,6 +159,7 @@ void MofClasses::finish() {
     while (!waiting.empty())
         giveUpWaitingFor(std::string(waiting.begin()->first));
     reportReferences();
+    reportOverrides();
 }
 
 void MofClasses::giveUpWaitingFor(const std::string& superKey) {

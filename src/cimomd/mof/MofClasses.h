@@ -20,7 +20,7 @@ class MofClasses {
     void declare(MofClass declaration, const MofContextPointer& context);
 
     /// To be called once after the last class: reports superclasses and classes of references that
-    /// nobody declared.
+    /// nobody declared, and references that do not fit to those they override.
     void finish();
 
     /// Whether the class waits for its superclass or did so in vain.
@@ -41,8 +41,19 @@ class MofClasses {
         MofContextPointer context;
     };
 
+    /// A reference whose class takes the place of another one in a subclass.
+    struct OverriddenReference {
+        MofName name;
+        Pegasus::CIMName inherited;
+        MofContextPointer context;
+    };
+
     void add(const MofClass& declaration, const MofContextPointer& context);
     void keepWaiting(MofClass declaration, const MofContextPointer& context);
+    void refuseOwnSuperClass(const MofClass& declaration, const MofContext& context);
+    void noteOverrides(const MofClass& declaration, const MofContextPointer& context);
+    void checkAsAssociation(const MofClass& declaration, const MofContext& context) const;
+    void reportOverrides() const;
     void noteReferences(const MofClass& declaration, const MofContextPointer& context);
     void giveUpWaitingFor(const std::string& superKey);
     void giveUp(const Waiting& entry, bool isSuperFaulty);
@@ -53,6 +64,8 @@ class MofClasses {
     std::set<std::string> heldBack;
     /// By key; the first place of each.
     std::map<std::string, Referenced> referenced;
+    /// Those whose classes are not known yet, or do not fit.
+    std::vector<OverriddenReference> overriddenReferences;
     std::set<std::string> faulty;
 };
 

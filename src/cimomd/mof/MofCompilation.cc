@@ -8,6 +8,7 @@
 
 #include "files/BoundedFile.h"
 #include "mof/MofParser.h"
+#include "mof/MofPaths.h"
 #include "mof/MofQualifiers.h"
 #include "mof/MofToken.h"
 #include "text/CimText.h"
@@ -34,16 +35,14 @@ std::string_view describe(FileStatus status) {
     }
 }
 
-/// Windows writes paths with backslashes.
-std::string withSlashes(std::string path) {
-    std::replace(path.begin(), path.end(), '\\', '/');
-    return path;
-}
-
 }  // namespace
 
-MofCompilation::MofCompilation(const ClassRepository& base, CIMNamespaceName defaultNamespace)
-    : base(base), firstNamespace(std::move(defaultNamespace)), draft(base) {}
+MofCompilation::MofCompilation(const ClassRepository& base, CIMNamespaceName defaultNamespace,
+                               const ClassRepository* others)
+    : base(base),
+      firstNamespace(std::move(defaultNamespace)),
+      furtherQualifiers(others),
+      draft(base) {}
 
 void MofCompilation::addFile(const std::filesystem::path& path) {
     try {
@@ -70,40 +69,44 @@ ClassRepository MofCompilation::finish() {
 void MofCompilation::compile(std::string text, const std::filesystem::path& path) {
     const auto source =
         std::make_shared<const MofSource>(MofSource{path.string(), std::move(text)});
-    enter(source, context ? context->nameSpace : firstNamespace);
+    enter(source, context ? context->nameSpace : firstNamespace, !context || context->isPlaceKnown);
     openFiles.push_back(path);
     MofParser parser(source->text, source->file, log);
     while (std::optional<MofDeclaration> declaration = parser.next()) {
         std::visit([&](auto& alternative) { declare(alternative); }, *declaration);
         if (context->source != source)
-            enter(source, context->nameSpace);
+            enter(source, context->nameSpace, context->isPlaceKnown);
     }
     openFiles.pop_back();
 }
 
-void MofCompilation::enter(std::shared_ptr<const MofSource> source, const CIMNamespaceName& name) {
-    context = std::make_shared<const MofContext>(
-        MofContext{draft, log, name, firstNamespace, std::move(source)});
+void MofCompilation::enter(std::shared_ptr<const MofSource> source, const CIMNamespaceName& name,
+                           bool isPlaceKnown) {
+    context = std::make_shared<const MofContext>(MofContext{
+        draft, log, name, firstNamespace, std::move(source), furtherQualifiers, isPlaceKnown});
 }
 
 void MofCompilation::declare(const MofQualifierDeclaration& declaration) {
     if (base.findQualifier(context->nameSpace, nameOf(declaration.name)) != nullptr)
         hasRedeclaredQualifiers = true;
-    declareQualifier(declaration, *context);
+    if (context->isPlaceKnown)
+        declareQualifier(declaration, *context);
 }
 
 void MofCompilation::declare(MofClass& declaration) {
-    classes.declare(std::move(declaration), context);
+    if (context->isPlaceKnown)
+        classes.declare(std::move(declaration), context);
 }
 
 void MofCompilation::declare(MofInstance& declaration) {
-    instances.declare(std::move(declaration), context);
+    if (context->isPlaceKnown)
+        instances.declare(std::move(declaration), context);
 }
 
 void MofCompilation::declare(const MofInclude& include) {
     const MofContextPointer includer = context;
     const std::filesystem::path path =
-        (openFiles.back().parent_path() / withSlashes(include.file.text)).lexically_normal();
+        includedFile(openFiles.back().parent_path(), include.file.text);
     try {
         checkInclude(path);
         compile(readFile(path), path);
@@ -139,10 +142,11 @@ std::string MofCompilation::readFile(const std::filesystem::path& path) {
 
 void MofCompilation::declare(const MofNamespace& pragma) {
     try {
-        const CIMNamespaceName name(cimString(withSlashes(pragma.name.text)));
+        const CIMNamespaceName name(cimString(namespaceIn(pragma.name.text)));
         draft.addNamespace(name);
-        enter(context->source, name);
+        enter(context->source, name, true);
     } catch (const Pegasus::Exception&) {
+        enter(context->source, context->nameSpace, false);
         context->report(pragma.name.position, fmt::format("\"{}\"", shownText(pragma.name.text)),
                         "a namespace such as root/cimv2");
     }

@@ -21,8 +21,10 @@ class MofCompilation {
     static constexpr std::size_t kMaxIncludeDepth = 16;
     static constexpr std::size_t kMaxFiles = 10'000;
 
-    /// Adds to a copy of `base`.
-    MofCompilation(const ClassRepository& base, Pegasus::CIMNamespaceName defaultNamespace);
+    /// Adds to a copy of `base`. Qualifiers that it does not have are taken from `others`, which
+    /// may be null.
+    MofCompilation(const ClassRepository& base, Pegasus::CIMNamespaceName defaultNamespace,
+                   const ClassRepository* others);
 
     // What is being compiled refers to the draft.
     MofCompilation(const MofCompilation&) = delete;
@@ -41,7 +43,8 @@ class MofCompilation {
 
   private:
     void compile(std::string text, const std::filesystem::path& path);
-    void enter(std::shared_ptr<const MofSource> source, const Pegasus::CIMNamespaceName& name);
+    void enter(std::shared_ptr<const MofSource> source, const Pegasus::CIMNamespaceName& name,
+               bool isPlaceKnown);
     void declare(const MofQualifierDeclaration& declaration);
     void declare(MofClass& declaration);
     void declare(MofInstance& declaration);
@@ -52,6 +55,7 @@ class MofCompilation {
 
     const ClassRepository& base;
     Pegasus::CIMNamespaceName firstNamespace;
+    const ClassRepository* furtherQualifiers;
     ClassRepository draft;
     MofErrorLog log;
     MofClasses classes;

@@ -26,7 +26,7 @@ void MofCompiler::compileText(std::string_view text, const std::filesystem::path
 
 template <typename AddFiles>
 void MofCompiler::run(AddFiles addFiles) {
-    MofCompilation compilation(target, firstNamespace);
+    MofCompilation compilation(target, firstNamespace, furtherQualifiers);
     try {
         addFiles(compilation);
         target = compilation.finish();

@@ -20,6 +20,10 @@ class MofCompiler {
     /// names another one. A namespace that does not declare a qualifier takes it from that one.
     MofCompiler(ClassRepository& repository, Pegasus::CIMNamespaceName defaultNamespace);
 
+    /// Qualifiers that neither the files nor the repository declare are taken from the default
+    /// namespace of `others`, which must outlive the compiler.
+    void useQualifiersOf(const ClassRepository& others) { furtherQualifiers = &others; }
+
     /// Raises MofErrors with all mistakes, and leaves the repository as it was, when anything is
     /// wrong.
     void compileFile(const std::filesystem::path& path);
@@ -39,6 +43,7 @@ class MofCompiler {
 
     ClassRepository& target;
     Pegasus::CIMNamespaceName firstNamespace;
+    const ClassRepository* furtherQualifiers = nullptr;
     bool hasRedeclaredQualifiers = false;
 };
 

@@ -24,6 +24,10 @@ struct MofContext {
     /// Where qualifiers are looked for that `nameSpace` does not declare.
     Pegasus::CIMNamespaceName qualifierNamespace;
     std::shared_ptr<const MofSource> source;
+    /// Where qualifiers are looked for after that; null for nowhere.
+    const ClassRepository* furtherQualifiers = nullptr;
+    /// False behind a pragma that names no namespace: nobody knows what the declarations belong to.
+    bool isPlaceKnown = true;
 
     const std::string& file() const { return source->file; }
     void report(MofPosition position, std::string_view found, std::string_view expected) const {

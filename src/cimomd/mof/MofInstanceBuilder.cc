@@ -106,7 +106,7 @@ class ValueFiller {
     }
 
     void fail(const MofName& name, std::string_view expected) const {
-        context.report(name.position, shownText(name.text), expected);
+        context.report(name.position, quotedText(name.text), expected);
     }
 
     const MofInstanceClass& instanceClass;

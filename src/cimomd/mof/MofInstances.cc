@@ -175,7 +175,7 @@ bool MofInstances::resolve(const MofAliasUse& use, Entry& entry, std::size_t dep
     if (found == nullptr || !fits(use, entry, *found))
         return false;
     if (found->state == PathState::InProgress || depth == kMaxKeyDepth) {
-        context.report(use.alias.position, aliasText(use.alias),
+        context.report(use.alias.position, fmt::format("alias {}", aliasText(use.alias)),
                        fmt::format("an instance with keys of its own, at most {} instances away",
                                    kMaxKeyDepth));
         return false;
@@ -208,7 +208,7 @@ bool MofInstances::fits(const MofAliasUse& use, const Entry& entry, const Entry&
         return true;
     context.report(
         use.alias.position,
-        fmt::format("{}, an instance of {}", aliasText(use.alias), utf8Of(given.getString())),
+        fmt::format("alias {}, an instance of {}", aliasText(use.alias), utf8Of(given.getString())),
         fmt::format("an instance of {}", utf8Of(wanted.getString())));
     return false;
 }

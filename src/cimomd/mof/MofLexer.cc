@@ -2,6 +2,8 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
+
 #include "mof/MofNumber.h"
 #include "text/Utf8.h"
 #include "utf8/Utf8.h"
@@ -10,7 +12,10 @@ namespace cimomd {
 namespace {
 
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+constexpr std::string_view kNoBreakSpace = "\xC2\xA0";
 constexpr std::string_view kPunctuation = "[]{}(),;:=";
+/// What may follow a text.
+constexpr std::string_view kClosingMarks = ";,)]}";
 constexpr std::size_t kMaxHexDigits = 4;
 
 bool isDigit(char c) {
@@ -23,7 +28,26 @@ bool isNameStart(char c) {
 }
 
 bool isBlank(char c) {
-    return c == ' ' || c == '\t' || c == '\r' || c == '\n' || c == '\f';
+    return c == ' ' || c == '\t' || c == '\r' || c == '\n' || c == '\f' || c == '\v';
+}
+
+bool isControl(char c) {
+    return static_cast<unsigned char>(c) < 0x20 && c != '\t';
+}
+
+/// The no-break space at the front of `rest`, in UTF-8 or as the single byte of Latin-1.
+std::size_t noBreakSpaceLength(std::string_view rest) {
+    if (rest.substr(0, kNoBreakSpace.size()) == kNoBreakSpace)
+        return kNoBreakSpace.size();
+    return !rest.empty() && rest.front() == kNoBreakSpace.back() ? 1 : 0;
+}
+
+/// Editors of old end a file with the byte 0x1A, and some fill up what is behind it.
+std::string_view withoutEndMark(std::string_view text) {
+    static constexpr std::string_view kFilling("\x1A\0 \t\r\n", 6);
+    const std::size_t last = text.find_last_not_of(kFilling);
+    const std::size_t mark = text.find('\x1A', last == std::string_view::npos ? 0 : last);
+    return text.substr(0, mark);
 }
 
 bool isContinuationByte(char c) {
@@ -50,7 +74,7 @@ std::string describe(char c) {
 }  // namespace
 
 MofLexer::MofLexer(std::string_view mofText, std::string_view fileName, MofErrorLog& errorLog)
-    : text(mofText), file(fileName), log(errorLog) {
+    : text(withoutEndMark(mofText)), file(fileName), log(errorLog) {
     if (text.substr(0, kByteOrderMark.size()) == kByteOrderMark)
         offset = kByteOrderMark.size();
 }
@@ -98,6 +122,25 @@ void MofLexer::advance() {
     }
 }
 
+void MofLexer::advanceBy(std::size_t bytes) {
+    for (std::size_t i = 0; i < bytes; ++i)
+        advance();
+}
+
+std::size_t MofLexer::blankLength() const {
+    return isBlank(current()) ? 1 : noBreakSpaceLength(text.substr(offset));
+}
+
+/// The length of the character here when names may have it, else 0.
+std::size_t MofLexer::nameCharacterLength() const {
+    if (atEnd() || (!isNameStart(current()) && !isDigit(current())))
+        return 0;
+    const std::string_view rest = text.substr(offset);
+    if (noBreakSpaceLength(rest) != 0)
+        return 0;
+    return std::max<std::size_t>(1, utf8::characterLength(rest));
+}
+
 void MofLexer::skipLine() {
     while (!atEnd() && current() != '\n' && current() != '\r')
         advance();
@@ -105,8 +148,8 @@ void MofLexer::skipLine() {
 
 void MofLexer::skipBlanksAndComments() {
     while (!atEnd()) {
-        if (isBlank(current())) {
-            advance();
+        if (const std::size_t length = blankLength(); length != 0) {
+            advanceBy(length);
         } else if (current() == '/' && peek(1) == '/') {
             skipLine();
         } else if (current() == '/' && peek(1) == '*') {
@@ -129,14 +172,14 @@ void MofLexer::skipBlockComment() {
         }
         advance();
     }
-    report(start, "a comment without an end", "*/");
+    report(start, "a comment without an end", "'*/'");
 }
 
 MofToken MofLexer::identifier() {
     const MofPosition start = position;
     const std::size_t startOffset = offset;
-    while (!atEnd() && (isNameStart(current()) || isDigit(current())))
-        advance();
+    while (const std::size_t length = nameCharacterLength())
+        advanceBy(length);
     return tokenFrom(MofTokenKind::Identifier, startOffset, start);
 }
 
@@ -160,13 +203,14 @@ MofToken MofLexer::number() {
         const char before = text[offset - 1];
         const bool exponentSign =
             (c == '+' || c == '-') && !isHex && (before == 'e' || before == 'E');
-        if (!isNameStart(c) && !isDigit(c) && c != '.' && !exponentSign)
+        const std::size_t length = c == '.' || exponentSign ? 1 : nameCharacterLength();
+        if (length == 0)
             break;
-        advance();
+        advanceBy(length);
     }
     MofToken token = tokenFrom(MofTokenKind::Integer, startOffset, start);
-    if (!parseMofNumber(token)) {
-        report(start, shownText(token.text), "a number within 64 bits");
+    if (const std::string_view expected = parseMofNumber(token); !expected.empty()) {
+        report(start, quotedText(token.text), expected);
         token.magnitude = 1;  // fits every type, so that the value is not told again
     }
     return token;
@@ -182,7 +226,7 @@ bool MofLexer::startsPragma() {
     const std::string_view word = text.substr(startOffset, offset - startOffset);
     if (equalsIgnoringCase(word, "#pragma"))
         return true;
-    report(start, shownText(word), "#pragma");
+    report(start, quotedText(word), "'#pragma'");
     skipLine();
     return false;
 }
@@ -214,21 +258,25 @@ MofToken MofLexer::quoted(char quote, MofTokenKind kind) {
     bool isClosed = false;
     while (!isClosed) {
         if (atEnd()) {
-            report(start, "a text without an end", fmt::format("a closing {}", quote));
+            reportBrokenText(start, "a text without an end", quote);
             break;
         }
-        if (current() == '\n' || current() == '\r') {
-            report(position, "the end of the line", fmt::format("a closing {}", quote));
-            stepBackToMarks(startOffset + 1);
-            break;
-        }
-        if (current() == quote) {
+        const char c = current();
+        if (c == '\n' || c == '\r') {
+            reportBrokenText(position, "the end of the line", quote);
+            if (!continuesOnNextLine(quote)) {
+                stepBackToMarks(startOffset + 1);
+                break;
+            }
+            skipToMark(quote);
+        } else if (c == quote) {
             isClosed = true;
             advance();
-        } else if (current() == '\\') {
+        } else if (c == '\\') {
             readEscape(characters);
         } else {
-            characters += current();
+            // Nobody means these, and no answer could carry them.
+            characters += isControl(c) ? utf8::kReplacement : text.substr(offset, 1);
             advance();
         }
     }
@@ -239,11 +287,39 @@ MofToken MofLexer::quoted(char quote, MofTokenKind kind) {
     return token;
 }
 
+void MofLexer::reportBrokenText(MofPosition where, std::string_view found, char quote) {
+    if (!hasBrokenText)
+        report(where, found, fmt::format("a closing {}", quote));
+    hasBrokenText = true;
+}
+
+/// At the end of a line: whether the text was broken over lines rather than its quote forgotten.
+/// The next quote ends it then, and marks or another text follow.
+bool MofLexer::continuesOnNextLine(char quote) const {
+    const std::string_view rest = text.substr(offset);
+    const std::size_t end = rest.find(quote);
+    if (end == std::string_view::npos)
+        return false;
+    const std::string_view between = rest.substr(0, end);
+    if (between.find_first_not_of(" \t\r\n") == std::string_view::npos)
+        return false;
+    const std::size_t next = rest.find_first_not_of(" \t\r\n", end + 1);
+    if (next == std::string_view::npos)
+        return false;
+    const bool isNextText = rest[next] == quote && next != end + 1;
+    return isNextText || kClosingMarks.find(rest[next]) != std::string_view::npos;
+}
+
+void MofLexer::skipToMark(char mark) {
+    while (!atEnd() && current() != mark)
+        advance();
+}
+
 /// A forgotten quote would swallow the marks at the end of its line, and their absence would be
 /// told as further mistakes.
 void MofLexer::stepBackToMarks(std::size_t firstOffset) {
     const std::string_view inside = text.substr(firstOffset, offset - firstOffset);
-    const std::size_t lastOther = inside.find_last_not_of(";,)]} \t");
+    const std::size_t lastOther = inside.find_last_not_of(fmt::format("{} \t", kClosingMarks));
     const std::size_t marks = lastOther == std::string_view::npos ? 0 : lastOther + 1;
     const auto distance = static_cast<unsigned>(inside.size() - marks);
     offset -= distance;
@@ -269,6 +345,31 @@ void MofLexer::readEscape(std::string& out) {
 }
 
 void MofLexer::readHexEscape(std::string& out, MofPosition start) {
+    const std::optional<char32_t> code = readHexDigits();
+    if (!code)
+        report(start, "'\\x'", "\\x with one to four hexadecimal digits, not 0");
+    else
+        utf8::append(out, utf8::isHighSurrogate(*code) ? joinedWithNextEscape(*code) : *code);
+}
+
+/// Characters beyond U+FFFF are written as two escapes, the halves of UTF-16. Passes the second
+/// when it is one.
+char32_t MofLexer::joinedWithNextEscape(char32_t high) {
+    const std::size_t highEnd = offset;
+    const MofPosition highEndPosition = position;
+    if (current() == '\\' && (peek(1) == 'x' || peek(1) == 'X')) {
+        advance();
+        const std::optional<char32_t> low = readHexDigits();
+        if (low && utf8::isLowSurrogate(*low))
+            return utf8::joinSurrogates(high, *low);
+    }
+    offset = highEnd;
+    position = highEndPosition;
+    return high;
+}
+
+/// Passes the x and the digits behind it. Nothing when there are none, or for 0.
+std::optional<char32_t> MofLexer::readHexDigits() {
     advance();
     char32_t code = 0;
     std::size_t digits = 0;
@@ -278,11 +379,7 @@ void MofLexer::readHexEscape(std::string& out, MofPosition start) {
         ++digits;
         advance();
     }
-    if (digits == 0 || code == 0) {
-        report(start, "\\x", "\\x with one to four hexadecimal digits, not 0");
-        return;
-    }
-    utf8::append(out, code);
+    return code == 0 ? std::nullopt : std::optional(code);
 }
 
 MofToken MofLexer::tokenFrom(MofTokenKind kind, std::size_t start,

@@ -6,8 +6,8 @@
 
 namespace cimomd {
 
-/// Reads `token.text` as a number and sets kind (Integer or Real) and value. False when the text
-/// is no number, or an integer of more than 64 bits, or a real beyond the range of a double.
-bool parseMofNumber(MofToken& token);
+/// Reads `token.text` as a number and sets kind (Integer or Real) and value. Empty on success, else
+/// what was expected in the place of the text.
+std::string_view parseMofNumber(MofToken& token);
 
 }  // namespace cimomd

@@ -15,11 +15,14 @@ MofParser::MofParser(std::string_view text, std::string_view fileName, MofErrorL
 
 std::optional<MofDeclaration> MofParser::next() {
     while (!tokens.atEnd()) {
+        tokens.forgetBrokenText();
+        if (tokens.accept(";"))
+            continue;
         try {
             if (std::optional<MofDeclaration> declaration = parseDeclaration())
                 return declaration;
         } catch (const MofError& error) {
-            log.add(file, error);
+            report(error);
             skipDeclaration();
         }
     }
@@ -36,7 +39,8 @@ std::optional<MofDeclaration> MofParser::parseDeclaration() {
         return parseInstance(std::move(qualifiers));
     if (tokens.atWord("class"))
         return parseClass(std::move(qualifiers));
-    tokens.fail(qualifiers.empty() ? "class, instance, qualifier or #pragma" : "class or instance");
+    tokens.fail(qualifiers.empty() ? "'class', 'instance', 'qualifier' or '#pragma'"
+                                   : "'class' or 'instance'");
 }
 
 /// A mistake ends with its line: pragmas have no semicolon to skip to.
@@ -44,7 +48,7 @@ std::optional<MofDeclaration> MofParser::parsePragma() {
     try {
         return parseDirective();
     } catch (const MofError& error) {
-        log.add(file, error);
+        report(error);
         while (!tokens.atEnd() && !tokens.atNewLine())
             tokens.take();
         return std::nullopt;
@@ -56,6 +60,9 @@ std::optional<MofDeclaration> MofParser::parseDirective() {
     const MofName directive = parseName("a directive");
     const bool isInclude = equalsIgnoringCase(directive.text, "include");
     const bool isNamespace = equalsIgnoringCase(directive.text, "namespace");
+    // Pragmas of other compilers need not have a parameter.
+    if (!isInclude && !isNamespace && !tokens.atMark("("))
+        return std::nullopt;
     tokens.expect("(");
     if (!isInclude && !isNamespace) {
         while (!tokens.atEnd() && !tokens.atMark(")") && !tokens.at(MofTokenKind::Pragma))
@@ -84,7 +91,7 @@ MofQualifierDeclaration MofParser::parseQualifierDeclaration() {
         declaration.defaultValue = parseLiteral();
     tokens.expect(",");
     if (!tokens.atWord("scope"))
-        tokens.fail("Scope");
+        tokens.fail("'Scope'");
     declaration.scopes = parseScopes();
     if (tokens.accept(","))
         declaration.flavors = parseFlavorClause();
@@ -112,7 +119,7 @@ QualifierScopes MofParser::parseScope() {
 
 std::vector<MofFlavor> MofParser::parseFlavorClause() {
     if (!tokens.atWord("flavor"))
-        tokens.fail("Flavor");
+        tokens.fail("'Flavor'");
     tokens.take();
     tokens.expect("(");
     std::vector<MofFlavor> flavors{parseFlavor()};
@@ -184,7 +191,7 @@ MofInstance MofParser::parseInstance(std::vector<MofQualifier> qualifiers) {
     out.qualifiers = std::move(qualifiers);
     tokens.take();
     if (!tokens.atWord("of"))
-        tokens.fail("of");
+        tokens.fail("'of'");
     tokens.take();
     out.className = parseName("a class name");
     out.alias = parseAlias();
@@ -218,12 +225,15 @@ bool MofParser::parseBody(const std::function<void()>& parseOne) {
     bool isComplete = true;
     tokens.expect("{");
     while (!tokens.atMark("}")) {
+        tokens.forgetBrokenText();
+        if (tokens.accept(";"))
+            continue;
         try {
             if (tokens.atEnd() || startsDeclaration())
                 tokens.fail("'}'");
             parseOne();
         } catch (const MofError& error) {
-            log.add(file, error);
+            report(error);
             isComplete = false;
             skipFeature();
             if (tokens.atEnd() || startsDeclaration())
@@ -241,7 +251,7 @@ void MofParser::parseEndOfDeclaration() {
         return;
     if (!tokens.atNewLine() && !tokens.atMark("}") && !tokens.atEnd() && !startsDeclaration())
         tokens.fail("';'");
-    log.add(file, tokens.current().position, tokens.shown(), "';'");
+    report(MofError(file, tokens.current().position, tokens.shown(), "';'"));
 }
 
 std::vector<MofQualifier> MofParser::parseQualifierList() {
@@ -252,7 +262,7 @@ std::vector<MofQualifier> MofParser::parseQualifierList() {
     } catch (const MofError& error) {
         if (!skipTo("]"))
             throw;
-        log.add(file, error);
+        report(error);
         return {};
     }
 }
@@ -318,7 +328,7 @@ MofType MofParser::parseType() {
     }
     const MofToken className = tokens.take();
     if (!tokens.atWord("ref"))
-        throw MofError(file, className.position, shownText(className.text), "a type");
+        throw MofError(file, className.position, quotedText(className.text), "a type");
     tokens.take();
     type.type = Pegasus::CIMTYPE_REFERENCE;
     type.referenceClass = {utf8::clean(className.text), className.position};
@@ -352,7 +362,7 @@ MofLiteral MofParser::parseLiteral() {
     } catch (const MofError& error) {
         if (!skipTo("}"))
             throw;
-        log.add(file, error);
+        report(error);
     }
     return literal;
 }
@@ -364,6 +374,9 @@ void MofParser::parseElements(MofLiteral& literal) {
     while (tokens.accept(",")) {
         if (literal.elements.size() == kMaxArrayElements)
             tokens.fail(fmt::format("at most {} elements", kMaxArrayElements));
+        // Some write a comma behind the last element too.
+        if (tokens.atMark("}"))
+            break;
         literal.elements.push_back(parseElement());
     }
     if (!tokens.accept("}"))
@@ -407,6 +420,12 @@ MofName MofParser::parseName(std::string_view expected) {
         tokens.fail(expected);
     const MofToken name = tokens.take();
     return {utf8::clean(name.text), name.position};
+}
+
+/// Behind a text without an end nothing fits, and only the text is at fault.
+void MofParser::report(const MofError& error) {
+    if (!tokens.isBehindBrokenText())
+        log.add(file, error);
 }
 
 /// Whether a declaration begins here for certain, whatever braces are still open.

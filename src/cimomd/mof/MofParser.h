@@ -59,6 +59,7 @@ class MofParser {
     void parseString(MofElement& element);
     MofName parseName(std::string_view expected);
 
+    void report(const MofError& error);
     bool startsDeclaration() const;
     void skipDeclaration();
     void skipFeature();

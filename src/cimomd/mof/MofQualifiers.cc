@@ -2,11 +2,11 @@
 
 #include <fmt/format.h>
 
-#include <set>
 #include <utility>
 
 #include "mof/MofToken.h"
 #include "mof/MofValue.h"
+#include "repository/QualifierInheritance.h"
 #include "text/CimText.h"
 
 namespace cimomd {
@@ -44,6 +44,8 @@ const QualifierDeclaration* declarationOf(const CIMName& name, const MofContext&
         context.repository.findQualifier(context.nameSpace, name);
     if (declaration == nullptr)
         declaration = context.repository.findQualifier(context.qualifierNamespace, name);
+    if (declaration == nullptr && context.furtherQualifiers != nullptr)
+        declaration = context.furtherQualifiers->findQualifier(context.qualifierNamespace, name);
     return declaration;
 }
 
@@ -51,10 +53,10 @@ CIMQualifier qualifierOf(const MofQualifier& use, QualifierScopes scopes, std::s
                          const MofContext& context) {
     const QualifierDeclaration* declaration = declarationOf(nameOf(use.name), context);
     if (declaration == nullptr)
-        throw MofError(context.file(), use.name.position, shownText(use.name.text),
+        throw MofError(context.file(), use.name.position, quotedText(use.name.text),
                        "a declared qualifier");
     if ((declaration->scopes & scopes) == 0)
-        throw MofError(context.file(), use.name.position, shownText(use.name.text),
+        throw MofError(context.file(), use.name.position, quotedText(use.name.text),
                        fmt::format("a qualifier for {}", element));
     Pegasus::CIMFlavor flavor = declaration->flavor;
     for (const MofFlavor& word : use.flavors)
@@ -76,6 +78,20 @@ QualifierDeclaration declarationFrom(const MofQualifierDeclaration& declaration,
     return out;
 }
 
+/// The same once more says nothing new.
+void addOnce(const CIMQualifier& qualifier, const MofQualifier& use, const MofContext& context,
+             std::vector<CIMQualifier>& out) {
+    for (const CIMQualifier& before : out) {
+        if (!before.getName().equal(qualifier.getName()))
+            continue;
+        if (!haveSameValue(before, qualifier))
+            throw MofError(context.file(), use.name.position, quotedText(use.name.text),
+                           "each qualifier once, or with the same value");
+        return;
+    }
+    out.push_back(qualifier);
+}
+
 }  // namespace
 
 void declareQualifier(const MofQualifierDeclaration& declaration, const MofContext& context) {
@@ -95,14 +111,9 @@ std::vector<CIMQualifier> qualifiersOf(const std::vector<MofQualifier>& uses,
                                        QualifierScopes scopes, std::string_view element,
                                        const MofContext& context) {
     std::vector<CIMQualifier> out;
-    std::set<CIMName, NameOrder> names;
     for (const MofQualifier& use : uses) {
-        if (!names.insert(nameOf(use.name)).second) {
-            context.report(use.name.position, shownText(use.name.text), "each qualifier once");
-            continue;
-        }
         try {
-            out.push_back(qualifierOf(use, scopes, element, context));
+            addOnce(qualifierOf(use, scopes, element, context), use, context, out);
         } catch (const MofError& error) {
             context.log.add(context.file(), error);
         }

@@ -15,4 +15,9 @@ std::string shownText(std::string_view text) {
     return cleanText(text);
 }
 
+std::string quotedText(std::string_view text) {
+    const bool isQuoted = !text.empty() && (text.front() == '"' || text.front() == '\'');
+    return isQuoted ? shownText(text) : "'" + shownText(text) + "'";
+}
+
 }  // namespace cimomd

@@ -40,4 +40,7 @@ struct MofToken {
 /// A token's text as messages show it: cut when it is long, without bytes that are no UTF-8.
 std::string shownText(std::string_view text);
 
+/// The same between single quotes, unless quotes begin it already.
+std::string quotedText(std::string_view text);
+
 }  // namespace cimomd

@@ -41,7 +41,7 @@ void MofTokens::fail(std::string_view expected) const {
 }
 
 std::string MofTokens::shown() const {
-    return atEnd() ? "the end of the file" : shownText(token.text);
+    return atEnd() ? "the end of the file" : quotedText(token.text);
 }
 
 }  // namespace cimomd

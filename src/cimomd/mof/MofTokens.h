@@ -29,6 +29,10 @@ class MofTokens {
     /// The same, but raises MofError when it is not.
     void expect(std::string_view mark);
 
+    /// As for MofLexer.
+    bool isBehindBrokenText() const { return lexer.isBehindBrokenText(); }
+    void forgetBrokenText() { lexer.forgetBrokenText(); }
+
     /// Raises the MofError that the current token is not what was expected.
     [[noreturn]] void fail(std::string_view expected) const;
     /// What the current token is called in messages.

@@ -40,7 +40,7 @@ class ElementReader {
     }
 
     [[noreturn]] void fail(const MofElement& element) const {
-        throw MofError(file, element.position, shownText(element.text), expectation());
+        throw MofError(file, element.position, quotedText(element.text), expectation());
     }
 
     std::string expectation() const {
@@ -100,11 +100,11 @@ T readParsed(const MofElement& element, const MofType& type, std::string_view fi
         try {
             return T(cimString(*text));
         } catch (const Pegasus::Exception&) {
-            throw MofError(file, element.position, shownText(element.text),
+            throw MofError(file, element.position, quotedText(element.text),
                            fmt::format("a {}", Pegasus::cimTypeToString(type.type)));
         }
     }
-    throw MofError(file, element.position, shownText(element.text),
+    throw MofError(file, element.position, quotedText(element.text),
                    fmt::format("a {} in quotes", Pegasus::cimTypeToString(type.type)));
 }
 
@@ -145,12 +145,12 @@ CIMValue cimValueOf(const MofLiteral& literal, const MofType& type, std::string_
         return nullOf(type);
     if (literal.isArray != type.isArray)
         throw MofError(file, literal.position,
-                       literal.isArray ? "{" : shownText(literal.elements[0].text),
+                       literal.isArray ? "'{'" : quotedText(literal.elements[0].text),
                        fmt::format("{} {}", type.isArray ? "an array of" : "one",
                                    Pegasus::cimTypeToString(type.type)));
     if (type.arraySize != 0 && literal.elements.size() > type.arraySize)
         throw MofError(file, literal.elements[type.arraySize].position,
-                       shownText(literal.elements[type.arraySize].text),
+                       quotedText(literal.elements[type.arraySize].text),
                        fmt::format("at most {} elements", type.arraySize));
     switch (type.type) {
         case Pegasus::CIMTYPE_BOOLEAN:

@@ -60,6 +60,15 @@ TEST_F(MofCheckTest, takesFilesWithQualifiersOfTheirOwnAsASchema) {
               "d.mof:1:44: found uint8 Number, expected the inherited type uint64");
 }
 
+TEST_F(MofCheckTest, lendsTheShippedQualifiersToASchema) {
+    tree.file("q.mof", "Qualifier Key : boolean = false, Scope(any);\n")
+        .file("c.mof", "class CIM_ManagedElement { [Key, MaxLen(8)] string Name; };\n")
+        .file("n.mof", "class CIM_LogicalDevice { [Nope] string Name; };\n");
+    EXPECT_EQ(mistakesIn({"q.mof", "c.mof"}), "none");
+    EXPECT_EQ(mistakesIn({"q.mof", "c.mof", "n.mof"}),
+              "n.mof:1:28: found 'Nope', expected a declared qualifier");
+}
+
 TEST_F(MofCheckTest, tellsAllMistakesOfAFile) {
     tree.file("ten.mof",
               "class T_Base {\n"
@@ -71,24 +80,24 @@ TEST_F(MofCheckTest, tellsAllMistakesOfAFile) {
               "    string D = \"open;\n"
               "    [Description(\"a\" \"b\"] string E;\n"
               "};\n"
-              "class T_Sub : T_Missing { [Key, Key] uint16 X; };\n"
+              "class T_Sub : T_Missing { [Key, Key(false)] uint16 X; };\n"
               "class T_Two : T_Base { uint16 Level; };\n"
               "class T_Links { [Key] T_Nowhere REF Left; };\n"
               "class T_Good { [Key] string Id; };\n"
               "instance of T_Good { Ids = \"x\"; Id = \"a\"; };\n");
     EXPECT_EQ(mistakesIn({"ten.mof"}),
-              "ten.mof:3:19: found 300, expected a uint8 (0 to 255)\n"
-              "ten.mof:4:6: found Nope, expected a declared qualifier\n"
-              "ten.mof:5:5: found strin, expected a type\n"
+              "ten.mof:3:19: found '300', expected a uint8 (0 to 255)\n"
+              "ten.mof:4:6: found 'Nope', expected a declared qualifier\n"
+              "ten.mof:5:5: found 'strin', expected a type\n"
               "ten.mof:6:13: found \"x\", expected a uint32 (0 to 4294967295)\n"
-              "ten.mof:7:5: found string, expected ';'\n"
+              "ten.mof:7:5: found 'string', expected ';'\n"
               "ten.mof:7:22: found the end of the line, expected a closing \"\n"
-              "ten.mof:8:25: found ], expected ')'\n"
+              "ten.mof:8:25: found ']', expected ')'\n"
               "ten.mof:10:15: found superclass T_Missing, expected a class that is declared\n"
-              "ten.mof:10:33: found Key, expected each qualifier once\n"
+              "ten.mof:10:33: found 'Key', expected each qualifier once, or with the same value\n"
               "ten.mof:11:31: found uint16 Level, expected the inherited type uint8\n"
               "ten.mof:12:23: found class T_Nowhere, expected a class that is declared\n"
-              "ten.mof:14:22: found Ids, expected a property of the class");
+              "ten.mof:14:22: found 'Ids', expected a property of the class");
 }
 
 TEST_F(MofCheckTest, namesAFileThatIsNotThere) {

@@ -135,35 +135,38 @@ TEST_F(MofCompilerTest, saysWhatIsWrongAndWhere) {
         const char* message;
     };
     const std::vector<Case> cases{
-        {"klass X {};", "1:1: found klass, expected class, instance, qualifier or #pragma"},
-        {"class {};", "1:7: found {, expected a class name"},
+        {"klass X {};",
+         "1:1: found 'klass', expected 'class', 'instance', 'qualifier' or '#pragma'"},
+        {"class {};", "1:7: found '{', expected a class name"},
         {"class X {}", "1:11: found the end of the file, expected ';'"},
-        {"class X {\n string a\n};", "3:1: found }, expected ';'"},
-        {"class X { strin a; };", "1:11: found strin, expected a type"},
-        {"class X { string 7; };", "1:18: found 7, expected a property name"},
-        {"class X { uint32 a[0]; };", "1:20: found 0, expected an array size from 1 to 4294967295"},
-        {"class X { uint32 a[; };", "1:20: found ;, expected ']'"},
-        {"class X { uint8 a = 256; };", "1:21: found 256, expected a uint8 (0 to 255)"},
-        {"class X { uint8 a = -1; };", "1:21: found -1, expected a uint8 (0 to 255)"},
-        {"class X { sint8 a = 128; };", "1:21: found 128, expected a sint8 (-128 to 127)"},
-        {"class X { uint16 a = 1.5; };", "1:22: found 1.5, expected a uint16 (0 to 65535)"},
+        {"class X {\n string a\n};", "3:1: found '}', expected ';'"},
+        {"class X { strin a; };", "1:11: found 'strin', expected a type"},
+        {"class X { string 7; };", "1:18: found '7', expected a property name"},
+        {"class X { uint32 a[0]; };",
+         "1:20: found '0', expected an array size from 1 to 4294967295"},
+        {"class X { uint32 a[; };", "1:20: found ';', expected ']'"},
+        {"class X { uint8 a = 256; };", "1:21: found '256', expected a uint8 (0 to 255)"},
+        {"class X { uint8 a = -1; };", "1:21: found '-1', expected a uint8 (0 to 255)"},
+        {"class X { sint8 a = 128; };", "1:21: found '128', expected a sint8 (-128 to 127)"},
+        {"class X { uint16 a = 1.5; };", "1:22: found '1.5', expected a uint16 (0 to 65535)"},
         {"class X { uint16 a = \"1\"; };", "1:22: found \"1\", expected a uint16 (0 to 65535)"},
-        {"class X { boolean a = 1; };", "1:23: found 1, expected a boolean"},
-        {"class X { string a = 1; };", "1:22: found 1, expected a string"},
+        {"class X { boolean a = 1; };", "1:23: found '1', expected a boolean"},
+        {"class X { string a = 1; };", "1:22: found '1', expected a string"},
         {"class X { char16 a = 'ab'; };", "1:22: found 'ab', expected a char16"},
         {"class X { datetime a = \"now\"; };", "1:24: found \"now\", expected a datetime"},
-        {"class X { real32 a = 1.0e39; };", "1:22: found 1.0e39, expected a real32"},
-        {"class X { uint8 a = {1}; };", "1:21: found {, expected one uint8"},
-        {"class X { uint8 a[] = 1; };", "1:23: found 1, expected an array of uint8"},
-        {"class X { uint8 a[] = {1, null}; };", "1:27: found null, expected a uint8 (0 to 255)"},
-        {"class X { uint8 a[] = {1 2}; };", "1:26: found 2, expected ',' or '}'"},
-        {"class X { [Nope] string a; };", "1:12: found Nope, expected a declared qualifier"},
-        {"class X { [Key, KEY] string a; };", "1:17: found KEY, expected each qualifier once"},
-        {"[Key] class X {};", "1:2: found Key, expected a qualifier for a class"},
-        {"class X { [Key Key] string a; };", "1:16: found Key, expected ',' or ']'"},
+        {"class X { real32 a = 1.0e39; };", "1:22: found '1.0e39', expected a real32"},
+        {"class X { uint8 a = {1}; };", "1:21: found '{', expected one uint8"},
+        {"class X { uint8 a[] = 1; };", "1:23: found '1', expected an array of uint8"},
+        {"class X { uint8 a[] = {1, null}; };", "1:27: found 'null', expected a uint8 (0 to 255)"},
+        {"class X { uint8 a[] = {1 2}; };", "1:26: found '2', expected ',' or '}'"},
+        {"class X { [Nope] string a; };", "1:12: found 'Nope', expected a declared qualifier"},
+        {"class X { [Key, KEY(false)] string a; };",
+         "1:17: found 'KEY', expected each qualifier once, or with the same value"},
+        {"[Key] class X {};", "1:2: found 'Key', expected a qualifier for a class"},
+        {"class X { [Key Key] string a; };", "1:16: found 'Key', expected ',' or ']'"},
         {"class X { [Key : Often] string a; };",
-         "1:18: found Often, expected a flavor such as ToSubclass"},
-        {"class X { string a; string A; };", "1:28: found A, expected each property once"},
+         "1:18: found 'Often', expected a flavor such as ToSubclass"},
+        {"class X { string a; string A; };", "1:28: found 'A', expected each property once"},
         {"class X : Y {};", "1:11: found superclass Y, expected a class that is declared"},
         {"class X {};\nclass x {};",
          "2:7: found class x again, expected a class that is not declared yet"},
@@ -178,21 +181,39 @@ TEST_F(MofCompilerTest, saysWhatIsWrongAndWhere) {
          "1:11: found another declaration of qualifier Key, expected one that says the same as the "
          "first"},
         {"Qualifier Q : boolean, Scope(classes);",
-         "1:30: found classes, expected a scope such as class or property"},
-        {"Qualifier Q : boolean;", "1:22: found ;, expected ','"},
+         "1:30: found 'classes', expected a scope such as class or property"},
+        {"Qualifier Q : boolean;", "1:22: found ';', expected ','"},
         {"#pragma namespace (\"a-b\")",
          "1:20: found \"a-b\", expected a namespace such as root/cimv2"},
         {"#pragma include (\"absent.mof\")",
          "1:18: found no such file (absent.mof), expected the name of a MOF file"},
-        {"#pragma include (absent)", "1:18: found absent, expected a text in quotes"},
+        {"#pragma include (absent)", "1:18: found 'absent', expected a text in quotes"},
     };
     for (const Case& expected : cases)
         EXPECT_EQ(errorOf(expected.text), expected.message) << expected.text;
 }
 
+TEST_F(MofCompilerTest, tellsAForgottenQuoteOnce) {
+    const std::string message = ": found the end of the line, expected a closing \"";
+    EXPECT_EQ(errorOf("class X { string a = \"b;\n string c = \"d\"; };"), "1:25" + message);
+    EXPECT_EQ(errorOf("class X { string a = \"b\n string c = \"d\"; };"), "1:24" + message);
+    EXPECT_EQ(errorOf("class X { [Description(\"b, Key] string c;\n string d; };"),
+              "1:42" + message);
+    EXPECT_EQ(errorOf("class X { [Description(\"b\n \"c\"), Key] string d; };"), "1:26" + message);
+    EXPECT_EQ(errorOf("class X { [Description(\"b; c\n d; e } f\"), Key] string d; };"),
+              "1:29" + message);
+    EXPECT_EQ(errorOf("class X { string a = \"b;\n strin c; };"),
+              "2 messages\n1:25" + message + "\n2:2: found 'strin', expected a type");
+}
+
+TEST_F(MofCompilerTest, refusesAClassThatIsItsOwnSuperclass) {
+    EXPECT_EQ(errorOf("class X : x {};\nclass Y : X {}; instance of X {};"),
+              "1:11: found class X as its own superclass, expected another class");
+}
+
 TEST_F(MofCompilerTest, loadsNothingOfAFileWithAMistake) {
     EXPECT_EQ(errorOf("class Good {}; class Bad { strin a; };"),
-              "1:28: found strin, expected a type");
+              "1:28: found 'strin', expected a type");
     EXPECT_EQ(repository.findClass(cimv2(), "Good"), nullptr);
     EXPECT_EQ(repository.findQualifier(cimv2(), "Key"), nullptr);
     compile("class Good {};");

@@ -148,10 +148,10 @@ TEST_F(MofInstancesTest, saysWhatIsWrongAndWhere) {
         {"instance of Disk { Id = null; };",
          "1:13: found an instance of Disk without its key Id, expected a value for each key"},
         {"instance of Disk { Id = \"x\"; Colour = 1; };",
-         "1:30: found Colour, expected a property of the class"},
+         "1:30: found 'Colour', expected a property of the class"},
         {"instance of Disk { Id = \"x\"; ID = \"y\"; };",
-         "1:30: found ID, expected each property once"},
-        {"instance of Disk { Id = 5; };", "1:25: found 5, expected a string"},
+         "1:30: found 'ID', expected each property once"},
+        {"instance of Disk { Id = 5; };", "1:25: found '5', expected a string"},
         {"instance of Disk { Id = \"x\"; Bought = \"then\"; };",
          "1:39: found \"then\", expected a datetime"},
         {"instance of Disk { Id = \"x\"; };\ninstance of Disk { Id = \"x\"; };",
@@ -164,14 +164,15 @@ TEST_F(MofInstancesTest, saysWhatIsWrongAndWhere) {
          "2:21: found alias $A again, expected an alias that no other instance has"},
         {"instance of Disk as $d { Id = \"d\"; };\n"
          "instance of Holds { Holder = $d; Held = $d; };",
-         "2:30: found $d, an instance of Disk, expected an instance of Rack"},
+         "2:30: found alias $d, an instance of Disk, expected an instance of Rack"},
         {"instance of Holds { Holder = \"Disk.Id=1\"; Held = \"Rack.Id=1\"; };",
          "1:30: found a path of class Disk, expected one of class Rack"},
-        {"instance Disk {};", "1:10: found Disk, expected of"},
-        {"instance of Disk as d {};", "1:21: found d, expected an alias such as $name"},
+        {"instance Disk {};", "1:10: found 'Disk', expected 'of'"},
+        {"instance of Disk as d {};", "1:21: found 'd', expected an alias such as $name"},
         {"class Loop { [Key] Loop REF Next; };\n"
          "instance of Loop as $a { Next = $b; };\ninstance of Loop as $b { Next = $a; };",
-         "3:33: found $a, expected an instance with keys of its own, at most 64 instances away"},
+         "3:33: found alias $a, expected an instance with keys of its own, at most 64 instances "
+         "away"},
         {"class Real { [Key] real32 R; };\ninstance of Real { R = 1.5; };",
          "2:13: found an instance with the real32 R as a key, expected keys that are neither "
          "arrays nor reals"},

@@ -135,21 +135,54 @@ TEST(MofLexer, replacesBytesThatAreNotUtf8InTexts) {
     EXPECT_EQ(tokensOf("\"a\xE9z\"")[0].characters, "a\xEF\xBF\xBDz");
 }
 
+TEST(MofLexer, joinsTheHalvesOfCharactersBeyond16Bits) {
+    EXPECT_EQ(tokensOf(R"("\xD83D\xDE00")")[0].characters, "\xF0\x9F\x98\x80");
+    EXPECT_EQ(tokensOf(R"("\xD83D\x41")")[0].characters,
+              "\xEF\xBF\xBD"
+              "A");
+    EXPECT_EQ(tokensOf(R"("\xD83D\n")")[0].characters, "\xEF\xBF\xBD\n");
+    EXPECT_EQ(tokensOf(R"("\xDE00\xD83D")")[0].characters, "\xEF\xBF\xBD\xEF\xBF\xBD");
+}
+
+TEST(MofLexer, replacesControlCharactersInTexts) {
+    EXPECT_EQ(tokensOf(std::string_view("\"a\0b\x01\tc\"", 8))[0].characters,
+              "a\xEF\xBF\xBD"
+              "b\xEF\xBF\xBD\tc");
+}
+
+TEST(MofLexer, tellsATextThatIsBrokenOverLinesOnce) {
+    MofErrorLog log;
+    const auto tokens = tokensOf("a \"one\n two; three\n four\" ) \"five", log);
+    EXPECT_EQ(log.count(), 1U);
+    ASSERT_EQ(tokens.size(), 4U);
+    EXPECT_EQ(tokens[1].kind, MofTokenKind::String);
+    EXPECT_EQ(tokens[2].text, ")");
+    EXPECT_EQ(tokens[2].position.line, 3U);
+}
+
 TEST(MofLexer, saysWhereAWordIsWrong) {
-    EXPECT_EQ(errorOf("a\n /* x"), "t.mof:2:2: found a comment without an end, expected */");
+    EXPECT_EQ(errorOf("a\n /* x"), "t.mof:2:2: found a comment without an end, expected '*/'");
     EXPECT_EQ(errorOf("\"abc"), "t.mof:1:1: found a text without an end, expected a closing \"");
     EXPECT_EQ(errorOf("\"abc\nd"), "t.mof:1:5: found the end of the line, expected a closing \"");
     EXPECT_EQ(
         errorOf("\"a\\q\""),
         "t.mof:1:3: found a backslash, expected one of \\b \\t \\n \\f \\r \\\" \\' \\\\ \\x");
     EXPECT_EQ(errorOf("\"\\x0\""),
-              "t.mof:1:2: found \\x, expected \\x with one to four hexadecimal digits, not 0");
-    EXPECT_EQ(errorOf("  12ab"), "t.mof:1:3: found 12ab, expected a number within 64 bits");
+              "t.mof:1:2: found '\\x', expected \\x with one to four hexadecimal digits, not 0");
+    EXPECT_EQ(errorOf("  12ab"), "t.mof:1:3: found '12ab', expected a number");
     EXPECT_EQ(errorOf("18446744073709551616"),
-              "t.mof:1:1: found 18446744073709551616, expected a number within 64 bits");
-    EXPECT_EQ(errorOf("089"), "t.mof:1:1: found 089, expected a number within 64 bits");
-    EXPECT_EQ(errorOf("1."), "t.mof:1:1: found 1., expected a number within 64 bits");
-    EXPECT_EQ(errorOf("#define"), "t.mof:1:1: found #define, expected #pragma");
+              "t.mof:1:1: found '18446744073709551616', expected a number within 64 bits");
+    EXPECT_EQ(errorOf("089"),
+              "t.mof:1:1: found '089', expected digits from 0 to 7 after the leading 0");
+    EXPECT_EQ(errorOf("1."), "t.mof:1:1: found '1.', expected a real number such as 1.5");
+    EXPECT_EQ(errorOf("08b"), "t.mof:1:1: found '08b', expected a number");
+    EXPECT_EQ(errorOf("0x"), "t.mof:1:1: found '0x', expected a number");
+    EXPECT_EQ(errorOf("0x10000000000000000"),
+              "t.mof:1:1: found '0x10000000000000000', expected a number within 64 bits");
+    EXPECT_EQ(errorOf("1.5e999"),
+              "t.mof:1:1: found '1.5e999', expected a number within the range of real64");
+    EXPECT_EQ(errorOf("1.5x"), "t.mof:1:1: found '1.5x', expected a real number such as 1.5");
+    EXPECT_EQ(errorOf("#define"), "t.mof:1:1: found '#define', expected '#pragma'");
     EXPECT_EQ(errorOf("a @"), "t.mof:1:3: found '@', expected a declaration");
     EXPECT_EQ(errorOf(std::string_view("\0", 1)),
               "t.mof:1:1: found the byte 0x00, expected a declaration");

@@ -97,15 +97,15 @@ TEST_F(MofMethodsTest, saysWhatIsWrongAndWhere) {
               "u.mof:1:18: found qualifier Static with another value than the superclass gives it, "
               "expected its value to stay TRUE");
     EXPECT_EQ(errorOf("class X { uint8 M(); uint8 m(); };"),
-              "u.mof:1:28: found m, expected each method once");
+              "u.mof:1:28: found 'm', expected each method once");
     EXPECT_EQ(errorOf("class X { uint8 M(uint8 a, uint8 A); };"),
-              "u.mof:1:34: found A, expected each parameter once");
+              "u.mof:1:34: found 'A', expected each parameter once");
     EXPECT_EQ(errorOf("class X { uint8 M(uint8 a uint8 b); };"),
-              "u.mof:1:27: found uint8, expected ',' or ')'");
+              "u.mof:1:27: found 'uint8', expected ',' or ')'");
     EXPECT_EQ(errorOf("class X { uint8 M([Static] uint8 a); };"),
-              "u.mof:1:20: found Static, expected a qualifier for a parameter");
+              "u.mof:1:20: found 'Static', expected a qualifier for a parameter");
     EXPECT_EQ(errorOf("class X { [In] uint8 M(); };"),
-              "u.mof:1:12: found In, expected a qualifier for a method");
+              "u.mof:1:12: found 'In', expected a qualifier for a method");
 }
 
 }  // namespace

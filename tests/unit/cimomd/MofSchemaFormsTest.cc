@@ -51,7 +51,7 @@ TEST_F(MofSchemaFormsTest, takesAClassWithTheQualifiersOfASchema) {
                          "  MinValue(-5), Max \t (  3) : tosubclass, Propagated(\"S_Top.Key\"),\n"
                          "  PropertyConstraint { \"inv: \\\"x\\\"\" }, Static] uint8 Key[];\n"
                          "};"),
-              "t.mof:15:17: found Max, expected a qualifier for a property");
+              "t.mof:15:17: found 'Max', expected a qualifier for a property");
     EXPECT_EQ(mistakesIn("[Association, Aggregation, Composition, Version(\"2.7.0\")]\n"
                          "class S_Link {\n"
                          "  [Aggregate, Key, Min ( 1 ), Max ( 1 ), Weak]\n  S_Late REF Whole;\n"
@@ -118,13 +118,13 @@ TEST_F(MofSchemaFormsTest, knowsASubclassOfAnAssociationForOne) {
                          "[Aggregation] class Y : X { [Aggregate, Override(\"a\")] A REF a; };\n"),
               "none");
     EXPECT_EQ(mistakesIn("class P { [Key] string k; };\n[Aggregation] class Q : P { };\n"),
-              "t.mof:2:2: found Aggregation, expected a qualifier for a class");
+              "t.mof:2:2: found 'Aggregation', expected a qualifier for a class");
 }
 
 TEST_F(MofSchemaFormsTest, countsLinesThatEndInACarriageReturn) {
     EXPECT_EQ(mistakesIn("class A { };\r// a comment\rclass B : Missing { };\r\nwrong\r"),
               "t.mof:3:11: found superclass Missing, expected a class that is declared\n"
-              "t.mof:4:1: found wrong, expected class, instance, qualifier or #pragma");
+              "t.mof:4:1: found 'wrong', expected 'class', 'instance', 'qualifier' or '#pragma'");
 }
 
 TEST_F(MofSchemaFormsTest, takesQualifiersOfTheDefaultNamespaceEverywhere) {
