@@ -7,6 +7,7 @@
 #include <utility>
 
 #include "files/BoundedFile.h"
+#include "mof/MofEncoding.h"
 #include "mof/MofParser.h"
 #include "mof/MofPaths.h"
 #include "mof/MofQualifiers.h"
@@ -137,7 +138,7 @@ std::string MofCompilation::readFile(const std::filesystem::path& path) {
         throw IncludeError{std::string(describe(content.status)), "the name of a MOF file"};
     byteCount += content.bytes.size();
     ++fileCount;
-    return std::move(content.bytes);
+    return utf8TextOf(std::move(content.bytes));
 }
 
 void MofCompilation::declare(const MofNamespace& pragma) {

@@ -128,6 +128,16 @@ TEST_F(MofToleranceTest, tellsAWrongNamespaceOnly) {
               "t.mof:6:11: found superclass Lost, expected a class that is declared");
 }
 
+TEST_F(MofToleranceTest, takesFilesInUtf16) {
+    RecordedTree tree;
+    std::string wide = "\xFE\xFF";
+    for (const char c : std::string_view("class T { uint8 p; };\r\n"))
+        wide += std::string(1, '\0') + c;
+    tree.file("wide.mof", wide);
+    EXPECT_EQ(mistakesInFile(tree.root / "wide.mof"), "none");
+    EXPECT_NE(repository.findClass(kNamespace, "T"), nullptr);
+}
+
 TEST_F(MofToleranceTest, findsIncludedFilesWhateverTheirCase) {
     RecordedTree tree;
     tree.file("main.mof", "#pragma include (\"CORE\\\\a.MOF\")\nclass Main : A {};\n")
