@@ -34,7 +34,7 @@ std::filesystem::path entryNamed(const std::filesystem::path& directory,
 
 std::filesystem::path includedFile(const std::filesystem::path& directory, std::string_view text) {
     const std::filesystem::path named = withSlashes(text);
-    const std::filesystem::path exact = (directory / named).lexically_normal();
+    std::filesystem::path exact = (directory / named).lexically_normal();
     std::error_code error;
     if (named.is_absolute() || std::filesystem::exists(exact, error))
         return exact;

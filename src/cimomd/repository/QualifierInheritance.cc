@@ -25,7 +25,7 @@ bool goesToSubclasses(const CIMConstQualifier& qualifier) {
 }
 
 bool isTrue(const CIMConstQualifier& qualifier) {
-    const Pegasus::CIMValue value = qualifier.getValue();
+    const Pegasus::CIMValue& value = qualifier.getValue();
     Pegasus::Boolean isTrue = false;
     if (value.getType() == Pegasus::CIMTYPE_BOOLEAN && !value.isArray() && !value.isNull())
         value.get(isTrue);
