@@ -18,8 +18,8 @@ constexpr std::size_t kLargestPiece = std::size_t{1} << 20;
 class Descriptor {
   public:
     // Not blocking, so that a named pipe in place of a file does not hold the reader up.
-    explicit Descriptor(const std::filesystem::path& path)
-        : number(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY)) {}
+    explicit Descriptor(const char* path)
+        : number(::open(path, O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY)) {}
     ~Descriptor() {
         if (number >= 0)
             ::close(number);
@@ -84,7 +84,7 @@ using ReadDescriptor = std::function<FileStatus(int descriptor, std::string& byt
 
 FileContent readWith(const std::filesystem::path& path, const ReadDescriptor& readDescriptor) {
     FileContent content;
-    const Descriptor descriptor(path);
+    const Descriptor descriptor(path.c_str());
     if (descriptor.get() < 0) {
         content.status = failureOf(errno);
         return content;
@@ -112,6 +112,29 @@ FileContent readFilePart(const std::filesystem::path& path, std::uint64_t offset
     return readWith(path, [=](int descriptor, std::string& bytes) {
         return readPart(descriptor, offset, maxBytes, bytes);
     });
+}
+
+FileStatus readFileStart(const char* path, char* buffer, std::size_t capacity,
+                         std::size_t& length) {
+    length = 0;
+    const Descriptor descriptor(path);
+    if (descriptor.get() < 0)
+        return failureOf(errno);
+    if (!descriptor.isRegularFile())
+        return FileStatus::Unreadable;
+    std::size_t end = 0;
+    while (end < capacity) {
+        const ssize_t count = ::read(descriptor.get(), buffer + end, capacity - end);
+        if (count < 0 && errno == EINTR)
+            continue;
+        if (count < 0)
+            return failureOf(errno);
+        if (count == 0)
+            break;
+        end += static_cast<std::size_t>(count);
+    }
+    length = end;
+    return FileStatus::Read;
 }
 
 }  // namespace cimomd

@@ -28,4 +28,9 @@ FileContent readBoundedFile(const std::filesystem::path& path, std::size_t maxBy
 FileContent readFilePart(const std::filesystem::path& path, std::uint64_t offset,
                          std::size_t maxBytes);
 
+/// The same from the beginning on, without memory of its own: at most `capacity` bytes go to
+/// `buffer`, their number to `length`, which is 0 unless the file was read. Safe between fork and
+/// exec of a process with threads.
+FileStatus readFileStart(const char* path, char* buffer, std::size_t capacity, std::size_t& length);
+
 }  // namespace cimomd

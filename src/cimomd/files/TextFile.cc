@@ -34,20 +34,32 @@ Fact<std::string> readText(const std::filesystem::path& path, std::size_t maxByt
 }
 
 Fact<std::string> readFact(const std::filesystem::path& path) {
-    return readText(path).then(
-        [](const std::string& text) {
-            const std::string_view fact = trimmed(text);
+    return factIn(readText(path));
+}
+
+Fact<std::uint64_t> readNumber(const std::filesystem::path& path) {
+    return numberIn(readFact(path));
+}
+
+Fact<std::int64_t> readSignedNumber(const std::filesystem::path& path) {
+    return signedNumberIn(readFact(path));
+}
+
+Fact<std::string> factIn(const Fact<std::string>& text) {
+    return text.then(
+        [](const std::string& bytes) {
+            const std::string_view fact = trimmed(bytes);
             return fact.empty() ? std::nullopt : std::optional<std::string>(fact);
         },
         Absence::Absent);
 }
 
-Fact<std::uint64_t> readNumber(const std::filesystem::path& path) {
-    return readFact(path).then([](const std::string& text) { return parseUnsigned(text); });
+Fact<std::uint64_t> numberIn(const Fact<std::string>& fact) {
+    return fact.then([](const std::string& digits) { return parseUnsigned(digits); });
 }
 
-Fact<std::int64_t> readSignedNumber(const std::filesystem::path& path) {
-    return readFact(path).then([](const std::string& text) { return parseSigned(text); });
+Fact<std::int64_t> signedNumberIn(const Fact<std::string>& fact) {
+    return fact.then([](const std::string& digits) { return parseSigned(digits); });
 }
 
 Fact<std::vector<std::string>> listDirectory(const std::filesystem::path& path,

@@ -35,6 +35,11 @@ Fact<std::uint64_t> readNumber(const std::filesystem::path& path);
 /// The same, negative numbers included.
 Fact<std::int64_t> readSignedNumber(const std::filesystem::path& path);
 
+// The same of a text that was read before.
+Fact<std::string> factIn(const Fact<std::string>& text);
+Fact<std::uint64_t> numberIn(const Fact<std::string>& fact);
+Fact<std::int64_t> signedNumberIn(const Fact<std::string>& fact);
+
 /// The names in a directory in byte order; nothing when it cannot be read to its end, or has more
 /// than `maxEntries`: what would be missing from a part of the names could not be told.
 Fact<std::vector<std::string>> listDirectory(const std::filesystem::path& path,

@@ -65,12 +65,12 @@ ProviderList makeProviders(const SystemPaths& paths, const SystemCalls& calls) {
     providers.push_back(std::make_unique<UsbDeviceProvider>(paths));
     providers.push_back(std::make_unique<VideoControllerProvider>(paths));
     providers.push_back(std::make_unique<DesktopMonitorProvider>(paths));
-    providers.push_back(std::make_unique<BatteryProvider>(paths));
-    providers.push_back(std::make_unique<NumericSensorProvider>(paths));
-    providers.push_back(std::make_unique<FanProvider>(paths));
+    providers.push_back(std::make_unique<BatteryProvider>(paths, calls));
+    providers.push_back(std::make_unique<NumericSensorProvider>(paths, calls));
+    providers.push_back(std::make_unique<FanProvider>(paths, calls));
     providers.push_back(std::make_unique<EthernetPortProvider>(paths, calls));
     providers.push_back(std::make_unique<WiFiPortProvider>(paths, calls));
-    providers.push_back(std::make_unique<LanEndpointProvider>(paths));
+    providers.push_back(std::make_unique<LanEndpointProvider>(paths, calls));
     providers.push_back(std::make_unique<IpProtocolEndpointProvider>(paths, calls));
     providers.push_back(std::make_unique<NextHopIpRouteProvider>(paths));
     providers.push_back(std::make_unique<DnsSettingDataProvider>(paths));

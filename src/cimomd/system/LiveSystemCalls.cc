@@ -30,7 +30,12 @@ Fact<FileSystemSize> LiveSystemCalls::fileSystemSize(const std::string& mountPoi
 
 Fact<FileSystemSize> LiveSystemCalls::fileSystemSizeInTime(const std::string& mountPoint,
                                                            const std::string& device) const {
-    return guard.ask(device, mountPoint);
+    return sizes.ask(device, mountPoint);
+}
+
+std::vector<Fact<std::string>> LiveSystemCalls::textsInTime(
+    const std::vector<std::filesystem::path>& wanted) const {
+    return files.read(wanted);
 }
 
 std::optional<std::string> LiveSystemCalls::machine() const {
@@ -45,7 +50,7 @@ Fact<std::vector<InterfaceAddress>> LiveSystemCalls::interfaceAddresses() const 
 }
 
 LinkSettings LiveSystemCalls::linkSettings(const std::string& interfaceName) const {
-    return askLinkSettings(interfaceName);
+    return links.ask(interfaceName);
 }
 
 }  // namespace cimomd

@@ -3,6 +3,7 @@
 // What only a system call tells, behind an interface, so that tests need no live machine.
 
 #include <cstdint>
+#include <filesystem>
 #include <optional>
 #include <string>
 #include <vector>
@@ -10,8 +11,6 @@
 #include "system/Fact.h"
 #include "system/network/InterfaceAddress.h"
 #include "system/network/LinkSettings.h"
-
-#include "system/Fact.h"
 
 namespace cimomd {
 
@@ -25,6 +24,8 @@ struct FileSystemSize {
 
     bool operator==(const FileSystemSize&) const = default;
 };
+
+inline constexpr std::size_t kMaxGuardedBytes = std::size_t{32} << 10;
 
 class SystemCalls {
   public:
@@ -45,13 +46,17 @@ class SystemCalls {
         static_cast<void>(device);
         return fileSystemSize(mountPoint);
     }
+    /// The texts of small files behind which a driver or another process stands, in their order,
+    /// of each the first kMaxGuardedBytes. TimedOut: that one did not answer within some seconds.
+    virtual std::vector<Fact<std::string>> textsInTime(
+        const std::vector<std::filesystem::path>& files) const;
     /// The machine's name as uname has it, for example "x86_64".
     virtual std::optional<std::string> machine() const = 0;
     /// The internet addresses of all network interfaces, in any order.
     virtual Fact<std::vector<InterfaceAddress>> interfaceAddresses() const {
         return Absence::Absent;
     }
-    /// What the driver of a network interface tells.
+    /// What the driver of a network interface tells, within some seconds.
     virtual LinkSettings linkSettings(const std::string& /*interfaceName*/) const { return {}; }
 
   protected:

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "FixedSystemCalls.h"
 #include "InstanceText.h"
 #include "RecordedTree.h"
 
@@ -67,9 +68,9 @@ TEST(BatteryProvider, keepsTheReasonOfWhatIsMissing) {
 TEST(BatteryProvider, hasNothingOnAMachineThatIsPluggedIn) {
     RecordedTree tree;
     tree.directory("sys/class/power_supply");
-    const auto stream = BatteryProvider(tree.paths()).enumerate();
+    const auto stream = BatteryProvider(tree.paths(), FixedSystemCalls()).enumerate();
     EXPECT_EQ(stream->absence(), std::nullopt);
-    EXPECT_TRUE(all(BatteryProvider(tree.paths()).enumerate()).empty());
+    EXPECT_TRUE(all(BatteryProvider(tree.paths(), FixedSystemCalls()).enumerate()).empty());
 }
 
 }  // namespace

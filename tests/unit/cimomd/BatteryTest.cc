@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "RecordedTree.h"
+#include "WatchedSystemCalls.h"
 
 namespace cimomd {
 namespace {
@@ -15,9 +16,10 @@ class BatteryTest : public testing::Test {
         tree.file("power/BAT0/" + name, text + "\n");
         return *this;
     }
-    Battery read() { return readBatteries(tree.root / "power")->at(0); }
+    Battery read() { return readBatteries(tree.root / "power", calls)->at(0); }
 
     RecordedTree tree;
+    WatchedSystemCalls calls;
 };
 
 TEST_F(BatteryTest, takesEnergyAsItIs) {
@@ -87,6 +89,19 @@ TEST_F(BatteryTest, readsWhatTheKernelSays) {
     EXPECT_FALSE(battery.serialNumber);
 }
 
+// The controller of a battery may hang.
+TEST_F(BatteryTest, isListedWhenItDoesNotAnswer) {
+    says("present", "1").says("cycle_count", "7");
+    calls.silent = tree.root / "power/BAT0/present";
+    const Battery battery = read();
+    EXPECT_EQ(battery.name, "BAT0");
+    EXPECT_EQ(battery.chargeCycles, 7U);
+    EXPECT_TRUE(calls.wasAskedFor("BAT0/cycle_count"));
+    calls.silent = tree.root / "power/BAT0/cycle_count";
+    EXPECT_FALSE(read().chargeCycles);
+    EXPECT_EQ(read().chargeCycles.reason(), Absence::TimedOut);
+}
+
 TEST_F(BatteryTest, leavesOutWhatDoesNotFeedTheComputer) {
     tree.file("power/AC/type", "Mains\n")
         .file("power/mouse/type", "Battery\n")
@@ -98,7 +113,7 @@ TEST_F(BatteryTest, leavesOutWhatDoesNotFeedTheComputer) {
         .file("power/BAT2/type", "Battery\n")
         .file("power/BAT2/present", "1\n")
         .directory("power/silent");
-    const auto batteries = readBatteries(tree.root / "power");
+    const auto batteries = readBatteries(tree.root / "power", calls);
     ASSERT_EQ(batteries->size(), 3U);
     EXPECT_EQ((*batteries)[0].name, "BAT0");
     EXPECT_EQ((*batteries)[1].name, "BAT2");
@@ -106,7 +121,7 @@ TEST_F(BatteryTest, leavesOutWhatDoesNotFeedTheComputer) {
 }
 
 TEST_F(BatteryTest, saysThatTheKernelKnowsNoPower) {
-    EXPECT_EQ(readBatteries(tree.root / "none").reason(), Absence::Absent);
+    EXPECT_EQ(readBatteries(tree.root / "none", calls).reason(), Absence::Absent);
 }
 
 }  // namespace

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "RecordedTree.h"
+#include "WatchedSystemCalls.h"
 
 namespace cimomd {
 namespace {
@@ -27,7 +28,7 @@ TEST(HardwareSensor, knowsTheFilesThatHoldReadings) {
 
 std::vector<std::string> idsIn(const RecordedTree& tree) {
     std::vector<std::string> ids;
-    const auto sensors = readHardwareSensors(tree.root / "hwmon");
+    const auto sensors = readHardwareSensors(tree.root / "hwmon", FixedSystemCalls());
     for (const HardwareSensor& sensor : *sensors)
         ids.push_back(sensor.id);
     return ids;
@@ -82,7 +83,7 @@ TEST(HardwareSensor, namesAChipWithoutANameByItsNumber) {
 Fact<std::int64_t> readingOf(const char* file, std::string_view text) {
     RecordedTree tree;
     tree.file(std::string("hwmon/hwmon0/") + file, text);
-    return readHardwareSensors(tree.root / "hwmon")->at(0).reading;
+    return readHardwareSensors(tree.root / "hwmon", FixedSystemCalls())->at(0).reading;
 }
 
 TEST(HardwareSensor, filtersTemperaturesThatCannotBe) {
@@ -116,7 +117,7 @@ TEST(HardwareSensor, readsLimitsAndMarks) {
         .file("hwmon/hwmon0/temp2_crit", "90000\n")
         .file("hwmon/hwmon0/temp2_emergency", "100000\n")
         .file("hwmon/hwmon0/pwm2", "128\n");
-    const auto sensors = readHardwareSensors(tree.root / "hwmon");
+    const auto sensors = readHardwareSensors(tree.root / "hwmon", FixedSystemCalls());
     ASSERT_EQ(sensors->size(), 3U);
     const HardwareSensor& temperature = (*sensors)[0];
     EXPECT_EQ(temperature.lowerCritical, std::int64_t{-10000});
@@ -136,9 +137,42 @@ TEST(HardwareSensor, readsLimitsAndMarks) {
     EXPECT_FALSE((*sensors)[2].fault);
 }
 
+// Sensors are slow, and a chip that hangs held the whole answer up.
+TEST(HardwareSensor, asksInTimeForWhatIsThereOnly) {
+    RecordedTree tree;
+    tree.file("hwmon/hwmon0/name", "x\n")
+        .file("hwmon/hwmon0/fan1_input", "900\n")
+        .file("hwmon/hwmon0/fan1_alarm", "1\n")
+        .file("hwmon/hwmon0/temp1_input", "1000\n");
+    WatchedSystemCalls calls;
+    calls.silent = tree.root / "hwmon/hwmon0/temp1_input";
+    const auto sensors = readHardwareSensors(tree.root / "hwmon", calls);
+    ASSERT_EQ(sensors->size(), 2U);
+    EXPECT_FALSE((*sensors)[0].reading);
+    EXPECT_EQ((*sensors)[0].reading.reason(), Absence::TimedOut);
+    EXPECT_EQ((*sensors)[1].reading, std::int64_t{900});
+    EXPECT_EQ((*sensors)[1].min.reason(), Absence::Absent);
+    EXPECT_EQ(calls.asked.size(), 3U);
+}
+
+TEST(HardwareSensor, asksFansAloneForFans) {
+    RecordedTree tree;
+    tree.file("hwmon/hwmon0/name", "x\n")
+        .file("hwmon/hwmon0/fan1_input", "900\n")
+        .file("hwmon/hwmon0/temp1_input", "1000\n");
+    WatchedSystemCalls calls;
+    const auto fans = readFans(tree.root / "hwmon", calls);
+    ASSERT_EQ(fans->size(), 1U);
+    EXPECT_EQ((*fans)[0].id, "x/fan1");
+    EXPECT_EQ((*fans)[0].reading, std::int64_t{900});
+    EXPECT_TRUE(calls.wasAskedFor("fan1_input"));
+    EXPECT_FALSE(calls.wasAskedFor("temp1_input"));
+}
+
 TEST(HardwareSensor, saysThatThereIsNoneToAsk) {
     RecordedTree tree;
-    EXPECT_EQ(readHardwareSensors(tree.root / "hwmon").reason(), Absence::Absent);
+    EXPECT_EQ(readHardwareSensors(tree.root / "hwmon", FixedSystemCalls()).reason(),
+              Absence::Absent);
 }
 
 }  // namespace

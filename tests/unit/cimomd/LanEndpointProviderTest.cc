@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "FixedSystemCalls.h"
 #include "InstanceText.h"
 #include "RecordedTree.h"
 
@@ -51,11 +52,12 @@ TEST(LanEndpointProvider, dropsWhatDoesNotFit) {
 
 TEST(LanEndpointProvider, takesInterfacesWithAnAddress) {
     RecordedTree tree;
-    EXPECT_EQ(LanEndpointProvider(tree.paths()).enumerate()->absence(), Absence::Absent);
+    EXPECT_EQ(LanEndpointProvider(tree.paths(), FixedSystemCalls()).enumerate()->absence(),
+              Absence::Absent);
     tree.file("sys/class/net/lo/address", "00:00:00:00:00:00\n")
         .file("sys/class/net/tun0/type", "65534\n")
         .file("sys/class/net/br0/address", "52:54:00:12:34:56\n");
-    const auto instances = all(LanEndpointProvider(tree.paths()).enumerate());
+    const auto instances = all(LanEndpointProvider(tree.paths(), FixedSystemCalls()).enumerate());
     ASSERT_EQ(instances.size(), 1U);
     EXPECT_EQ(textOf(instances[0], "Name"), "br0");
     EXPECT_EQ(textOf(instances[0], "CreationClassName"), "Velmira_LANEndpoint");

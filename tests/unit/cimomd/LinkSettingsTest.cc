@@ -38,14 +38,5 @@ TEST(LinkSettings, writesHardwareAddresses) {
     EXPECT_EQ(hardwareAddressText(""), std::nullopt);
 }
 
-TEST(LinkSettings, knowsNothingAboutInterfacesThatDoNotExist) {
-    for (const char* name : {"no-such-port", "a-name-longer-than-any-interface-has", ""}) {
-        const LinkSettings settings = askLinkSettings(name);
-        EXPECT_FALSE(settings.permanentAddress.has_value()) << name;
-        EXPECT_FALSE(settings.connector.has_value()) << name;
-        EXPECT_EQ(settings.permanentAddress.reason(), Absence::Absent) << name;
-    }
-}
-
 }  // namespace
 }  // namespace cimomd

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "RecordedTree.h"
+#include "WatchedSystemCalls.h"
 
 namespace cimomd {
 namespace {
@@ -21,7 +22,7 @@ TEST(NetworkInterface, readsAPort) {
         .file("net/enp1s0/uevent", "INTERFACE=enp1s0\nIFINDEX=2\n")
         .file("net/enp1s0/device/uevent",
               "DRIVER=ixgbe\nPCI_CLASS=20000\nPCI_SLOT_NAME=0000:01:00.0\n");
-    const auto interfaces = readNetworkInterfaces(tree.root / "net");
+    const auto interfaces = readNetworkInterfaces(tree.root / "net", FixedSystemCalls());
     ASSERT_TRUE(interfaces);
     ASSERT_EQ(interfaces->size(), 1U);
     const NetworkInterface& port = interfaces->front();
@@ -55,7 +56,7 @@ TEST(NetworkInterface, findsThePciAddressOfItsParent) {
                                               tree.root / "net/eth0/device");
     std::filesystem::create_directory_symlink("../../devices/0000:00:14.0/usb1/1-1:1.0",
                                               tree.root / "net/eth1/device");
-    const auto interfaces = readNetworkInterfaces(tree.root / "net");
+    const auto interfaces = readNetworkInterfaces(tree.root / "net", FixedSystemCalls());
     ASSERT_EQ(interfaces->size(), 2U);
     EXPECT_EQ((*interfaces)[0].driver, "virtio_net");
     EXPECT_EQ((*interfaces)[0].busAddress, "0000:00:03.0");
@@ -76,7 +77,7 @@ TEST(NetworkInterface, readsOddTexts) {
         .file("net/eth0/duplex", "both\n")
         .file("net/eth0/uevent", std::string(100000, 'x'))
         .file("net/eth0/device/uevent", "DRIVER\n=x\nDRIVER=\n");
-    const auto interfaces = readNetworkInterfaces(tree.root / "net");
+    const auto interfaces = readNetworkInterfaces(tree.root / "net", FixedSystemCalls());
     ASSERT_EQ(interfaces->size(), 1U);
     const NetworkInterface& port = interfaces->front();
     EXPECT_EQ(port.address, std::nullopt);
@@ -96,7 +97,7 @@ TEST(NetworkInterface, ordersByTheNumbersInNames) {
     RecordedTree tree;
     for (const char* name : {"eth10", "eth2", "bond0", "eth1"})
         tree.directory(std::string("net/") + name);
-    const auto interfaces = readNetworkInterfaces(tree.root / "net");
+    const auto interfaces = readNetworkInterfaces(tree.root / "net", FixedSystemCalls());
     ASSERT_EQ(interfaces->size(), 4U);
     EXPECT_EQ((*interfaces)[0].name, "bond0");
     EXPECT_EQ((*interfaces)[1].name, "eth1");
@@ -109,7 +110,7 @@ TEST(NetworkInterface, takesAnUnknownSpeedAsNothing) {
     tree.file("net/a/speed", "-1\n").file("net/b/speed", "4294967295\n").file("net/c/speed", "0\n");
     tree.file("net/d/speed", "2147483648\n").file("net/e/speed", "2147483647\n");
     tree.file("net/a/duplex", "unknown\n").file("net/b/duplex", "half\n");
-    const auto interfaces = readNetworkInterfaces(tree.root / "net");
+    const auto interfaces = readNetworkInterfaces(tree.root / "net", FixedSystemCalls());
     ASSERT_EQ(interfaces->size(), 5U);
     // The kernel has no speeds above what a signed number holds.
     EXPECT_EQ((*interfaces)[3].speedMbps, std::nullopt);
@@ -119,6 +120,21 @@ TEST(NetworkInterface, takesAnUnknownSpeedAsNothing) {
     EXPECT_EQ((*interfaces)[2].speedMbps, std::nullopt);
     EXPECT_EQ((*interfaces)[0].fullDuplex, std::nullopt);
     EXPECT_EQ((*interfaces)[1].fullDuplex, false);
+}
+
+// The kernel asks the driver for these, and waits for it.
+TEST(NetworkInterface, hasNoSpeedWhenTheDriverHangs) {
+    RecordedTree tree;
+    tree.file("net/a/speed", "1000\n").file("net/a/mtu", "1500\n").file("net/a/carrier", "1\n");
+    WatchedSystemCalls calls;
+    calls.silent = tree.root / "net/a/speed";
+    const auto interfaces = readNetworkInterfaces(tree.root / "net", calls);
+    ASSERT_EQ(interfaces->size(), 1U);
+    EXPECT_FALSE((*interfaces)[0].speedMbps);
+    EXPECT_EQ((*interfaces)[0].speedMbps.reason(), Absence::TimedOut);
+    EXPECT_EQ((*interfaces)[0].hasCarrier, true);
+    EXPECT_EQ((*interfaces)[0].mtuBytes, 1500U);
+    EXPECT_TRUE(calls.wasAskedFor("net/a/duplex"));
 }
 
 TEST(NetworkInterface, takesOnlyWiredHardwareAsEthernetPorts) {
@@ -132,12 +148,13 @@ TEST(NetworkInterface, takesOnlyWiredHardwareAsEthernetPorts) {
         .file("net/bnep0/uevent", "DEVTYPE=bluetooth\n")
         .directory("net/bnep0/device");
     tree.file("net/bonding_masters", "bond0\n");
-    const auto interfaces = readNetworkInterfaces(tree.root / "net");
+    const auto interfaces = readNetworkInterfaces(tree.root / "net", FixedSystemCalls());
     ASSERT_EQ(interfaces->size(), 4U);
     for (const NetworkInterface& interface : *interfaces)
         EXPECT_FALSE(interface.isEthernetPort()) << interface.name;
     EXPECT_TRUE((*interfaces)[3].isWifiPort());
-    EXPECT_EQ(readNetworkInterfaces(tree.root / "none").reason(), Absence::Absent);
+    EXPECT_EQ(readNetworkInterfaces(tree.root / "none", FixedSystemCalls()).reason(),
+              Absence::Absent);
 }
 
 }  // namespace

@@ -78,18 +78,20 @@ TEST(ProcessTable, listsProcessesInTheOrderOfTheirNumbers) {
 
 TEST(ProcessTable, readsAProcess) {
     RecordedTree tree;
-    const std::string longWord(100000, 'x');
-    tree.file("7/stat", "7 (bash)" + kNumbers).file("7/cmdline", longWord);
+    tree.file("7/stat", "7 (bash)" + kNumbers);
     std::filesystem::create_symlink("/usr/bin/bash", tree.root / "7/exe");
-    const auto process = readProcess(tree.root, 7);
+    const auto process = readProcess(tree.root, 7, std::string("bash\0-l\0", 8));
     ASSERT_TRUE(process);
     EXPECT_EQ(process->status.name, "bash");
     EXPECT_EQ(process->executable, "/usr/bin/bash");
-    EXPECT_EQ(process->commandLine->at(0), std::string(32768, 'x'));
+    EXPECT_EQ(*process->commandLine, (Words{"bash", "-l"}));
+    EXPECT_EQ(readProcess(tree.root, 7, Absence::TimedOut)->commandLine.reason(),
+              Absence::TimedOut);
+    EXPECT_EQ(commandLineFile(tree.root, 7), tree.root / "7/cmdline");
     EXPECT_EQ(process->ownership.realUserId, std::nullopt);
-    EXPECT_FALSE(readProcess(tree.root, 8));
+    EXPECT_FALSE(readProcess(tree.root, 8, Absence::Absent));
     tree.file("9/stat", "9 (bash) Z");
-    EXPECT_FALSE(readProcess(tree.root, 9));
+    EXPECT_FALSE(readProcess(tree.root, 9, Absence::Absent));
 }
 
 }  // namespace

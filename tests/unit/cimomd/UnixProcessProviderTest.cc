@@ -6,6 +6,7 @@
 #include "InstanceText.h"
 #include "RecordedTree.h"
 #include "SchemaConformance.h"
+#include "WatchedSystemCalls.h"
 
 namespace cimomd {
 namespace {
@@ -29,6 +30,23 @@ class UnixProcessProviderTest : public testing::Test {
     FixedSystemCalls calls;
     const UnixProcessProvider provider{tree.paths(), calls};
 };
+
+// One that hangs while it changes its memory held the whole list up.
+TEST_F(UnixProcessProviderTest, listsProcessesWhoseCommandLineIsKeptBack) {
+    WatchedSystemCalls watched;
+    watched.silent = tree.root / "proc/101/cmdline";
+    for (int id = 1; id <= 150; ++id) {
+        process(std::to_string(id), "(p) S 1 1 1 0 -1 0 0 0 0 0 0 0 0 0 20 0 1 0 0 0");
+        tree.file("proc/" + std::to_string(id) + "/cmdline", "p" + std::to_string(id));
+    }
+    const auto instances = all(UnixProcessProvider(tree.paths(), watched).enumerate());
+    ASSERT_EQ(instances.size(), 150U);
+    for (std::size_t i = 0; i < instances.size(); ++i) {
+        const std::string id = std::to_string(i + 1);
+        EXPECT_EQ(textOf(instances[i], "Handle"), id);
+        EXPECT_EQ(textOf(instances[i], "Parameters"), id == "101" ? "null" : "p" + id + " ");
+    }
+}
 
 TEST_F(UnixProcessProviderTest, publishesAnOrdinaryProcess) {
     // 34817 is terminal 136:1; it was started 100 seconds after the machine.

@@ -77,7 +77,7 @@ Fact<Uint16> chemistryOf(const Battery& battery) {
 }  // namespace
 
 std::unique_ptr<InstanceStream> BatteryProvider::enumerate() const {
-    auto batteries = readBatteries(paths.powerSupplies());
+    auto batteries = readBatteries(paths.powerSupplies(), calls);
     if (!batteries)
         return std::make_unique<EmptyStream>(batteries.reason());
     const std::string hostName = readHostName(paths);

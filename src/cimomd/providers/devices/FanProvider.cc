@@ -1,8 +1,5 @@
 #include "providers/devices/FanProvider.h"
 
-#include <algorithm>
-#include <iterator>
-
 #include "providers/EnumeratedValues.h"
 #include "providers/InstanceBuilder.h"
 #include "providers/RecordStream.h"
@@ -16,14 +13,6 @@ using Pegasus::Boolean;
 using Pegasus::Uint16;
 using Pegasus::Uint32;
 using Pegasus::Uint64;
-
-std::vector<HardwareSensor> fansAmong(const std::vector<HardwareSensor>& sensors) {
-    std::vector<HardwareSensor> fans;
-    std::copy_if(
-        sensors.begin(), sensors.end(), std::back_inserter(fans),
-        [](const HardwareSensor& sensor) { return sensor.kind == HardwareSensor::Kind::Fan; });
-    return fans;
-}
 
 Fact<std::vector<Uint16>> statusOf(const HardwareSensor& fan) {
     if (fan.fault == true)
@@ -44,13 +33,12 @@ Fact<Boolean> variableSpeedOf(const HardwareSensor& fan) {
 }  // namespace
 
 std::unique_ptr<InstanceStream> FanProvider::enumerate() const {
-    auto sensors = readHardwareSensors(paths.hardwareMonitors());
-    if (!sensors)
-        return std::make_unique<EmptyStream>(sensors.reason());
+    const auto fans = readFans(paths.hardwareMonitors(), calls);
+    if (!fans)
+        return std::make_unique<EmptyStream>(fans.reason());
     const std::string hostName = readHostName(paths);
     return std::make_unique<RecordStream<HardwareSensor>>(
-        fansAmong(*sensors),
-        [hostName](const HardwareSensor& fan) { return publish(hostName, fan); });
+        *fans, [hostName](const HardwareSensor& fan) { return publish(hostName, fan); });
 }
 
 ProvidedInstance FanProvider::publish(const std::string& hostName, const HardwareSensor& fan) {

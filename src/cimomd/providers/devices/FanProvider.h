@@ -12,7 +12,9 @@ class FanProvider : public Provider {
   public:
     static constexpr const char* kClassName = "Velmira_Fan";
 
-    explicit FanProvider(SystemPaths systemPaths) : paths(std::move(systemPaths)) {}
+    /// `systemCalls` must outlive the provider.
+    FanProvider(SystemPaths systemPaths, const SystemCalls& systemCalls)
+        : paths(std::move(systemPaths)), calls(systemCalls) {}
 
     const char* className() const override { return kClassName; }
     std::unique_ptr<InstanceStream> enumerate() const override;
@@ -21,6 +23,7 @@ class FanProvider : public Provider {
 
   private:
     SystemPaths paths;
+    const SystemCalls& calls;
 };
 
 }  // namespace cimomd

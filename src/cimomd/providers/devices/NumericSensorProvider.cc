@@ -70,7 +70,7 @@ Fact<std::vector<Uint16>> statusOf(const HardwareSensor& sensor) {
 }  // namespace
 
 std::unique_ptr<InstanceStream> NumericSensorProvider::enumerate() const {
-    auto sensors = readHardwareSensors(paths.hardwareMonitors());
+    auto sensors = readHardwareSensors(paths.hardwareMonitors(), calls);
     if (!sensors)
         return std::make_unique<EmptyStream>(sensors.reason());
     const std::string hostName = readHostName(paths);

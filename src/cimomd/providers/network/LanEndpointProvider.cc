@@ -64,7 +64,7 @@ std::unique_ptr<InstanceStream> LanEndpointProvider::enumerate() const {
     const auto isWanted = [](const NetworkInterface& interface) {
         return addressDigits(interface.address).has_value();
     };
-    return streamInterfaces(paths, isWanted, &LanEndpointProvider::publish);
+    return streamInterfaces(paths, calls, isWanted, &LanEndpointProvider::publish);
 }
 
 ProvidedInstance LanEndpointProvider::publish(const std::string& hostName,

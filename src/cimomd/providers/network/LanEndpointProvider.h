@@ -13,7 +13,9 @@ class LanEndpointProvider : public Provider {
   public:
     static constexpr const char* kClassName = "Velmira_LANEndpoint";
 
-    explicit LanEndpointProvider(SystemPaths systemPaths) : paths(std::move(systemPaths)) {}
+    /// `systemCalls` must outlive the provider.
+    LanEndpointProvider(SystemPaths systemPaths, const SystemCalls& systemCalls)
+        : paths(std::move(systemPaths)), calls(systemCalls) {}
 
     const char* className() const override { return kClassName; }
     std::unique_ptr<InstanceStream> enumerate() const override;
@@ -22,6 +24,7 @@ class LanEndpointProvider : public Provider {
 
   private:
     SystemPaths paths;
+    const SystemCalls& calls;
 };
 
 }  // namespace cimomd

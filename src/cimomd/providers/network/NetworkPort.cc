@@ -71,9 +71,10 @@ Fact<Uint16> enabledStateOf(const NetworkInterface& interface) {
 }
 
 std::unique_ptr<InstanceStream> streamInterfaces(
-    const SystemPaths& paths, const std::function<bool(const NetworkInterface&)>& isWanted,
+    const SystemPaths& paths, const SystemCalls& calls,
+    const std::function<bool(const NetworkInterface&)>& isWanted,
     const std::function<ProvidedInstance(const std::string&, const NetworkInterface&)>& publish) {
-    const auto interfaces = readNetworkInterfaces(paths.networkInterfaces());
+    const auto interfaces = readNetworkInterfaces(paths.networkInterfaces(), calls);
     if (!interfaces)
         return std::make_unique<EmptyStream>(interfaces.reason());
     std::vector<NetworkInterface> wanted;

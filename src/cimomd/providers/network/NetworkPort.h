@@ -27,7 +27,8 @@ Fact<Pegasus::Uint16> enabledStateOf(const NetworkInterface& interface);
 
 /// The instances of those interfaces that `isWanted` takes; none when the kernel shows none.
 std::unique_ptr<InstanceStream> streamInterfaces(
-    const SystemPaths& paths, const std::function<bool(const NetworkInterface&)>& isWanted,
+    const SystemPaths& paths, const SystemCalls& calls,
+    const std::function<bool(const NetworkInterface&)>& isWanted,
     const std::function<ProvidedInstance(const std::string& hostName, const NetworkInterface&)>&
         publish);
 

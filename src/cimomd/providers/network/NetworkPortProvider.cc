@@ -6,7 +6,7 @@ namespace cimomd {
 
 std::unique_ptr<InstanceStream> NetworkPortProvider::enumerate() const {
     return streamInterfaces(
-        paths, choice,
+        paths, calls, choice,
         [&systemCalls = calls, publish = publisher](const auto& hostName, const auto& interface) {
             return publish(hostName, interface, systemCalls.linkSettings(interface.name));
         });

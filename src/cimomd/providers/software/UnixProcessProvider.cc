@@ -135,27 +135,43 @@ UserNames userNames(const SystemPaths& paths) {
     return names;
 }
 
+/// How many command lines are read, and held, at a time.
+constexpr std::size_t kProcessesAtOnce = 64;
+
 class ProcessStream : public InstanceStream {
   public:
+    /// `systemCalls` must outlive the stream.
     ProcessStream(std::filesystem::path processDirectory, std::vector<std::uint64_t> processIds,
-                  ProcessSurroundings shared, UserNames userNames)
+                  const SystemCalls& systemCalls, ProcessSurroundings shared, UserNames userNames)
         : directory(std::move(processDirectory)),
           ids(std::move(processIds)),
+          calls(systemCalls),
           surroundings(std::move(shared)),
           names(std::move(userNames)) {}
 
     bool next(ProvidedInstance& out) override {
-        while (position < ids.size()) {
-            const auto process = readProcess(directory, ids[position++]);
+        for (; position < ids.size(); ++position) {
+            if (position % kProcessesAtOnce == 0)
+                readCommandLines();
+            const auto process =
+                readProcess(directory, ids[position], commandLines[position % kProcessesAtOnce]);
             if (!process)
                 continue;
             out = UnixProcessProvider::publish(surroundings, *process, userNameOf(*process));
+            ++position;
             return true;
         }
         return false;
     }
 
   private:
+    void readCommandLines() {
+        std::vector<std::filesystem::path> files;
+        for (std::size_t i = position; i < ids.size() && files.size() < kProcessesAtOnce; ++i)
+            files.push_back(commandLineFile(directory, ids[i]));
+        commandLines = calls.textsInTime(files);
+    }
+
     Fact<std::string> userNameOf(const Process& process) const {
         const Fact<std::uint64_t>& user = process.ownership.realUserId;
         if (!user)
@@ -166,6 +182,9 @@ class ProcessStream : public InstanceStream {
 
     std::filesystem::path directory;
     std::vector<std::uint64_t> ids;
+    const SystemCalls& calls;
+    /// Of the processes that `position` is among.
+    std::vector<Fact<std::string>> commandLines;
     ProcessSurroundings surroundings;
     UserNames names;
     std::size_t position = 0;
@@ -182,7 +201,7 @@ std::unique_ptr<InstanceStream> UnixProcessProvider::enumerate() const {
     surroundings.osName = nameOf(readOsRelease(paths));
     surroundings.bootTime = readBootTime(paths);
     surroundings.utcOffsetMinutes = calls.utcOffsetMinutes(calls.now());
-    return std::make_unique<ProcessStream>(paths.processes(), std::move(*ids),
+    return std::make_unique<ProcessStream>(paths.processes(), std::move(*ids), calls,
                                            std::move(surroundings), userNames(paths));
 }
 

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "system/Fact.h"
+#include "system/SystemCalls.h"
 
 namespace cimomd {
 
@@ -32,6 +33,7 @@ struct Battery {
 
 /// In the order of their names, without those of mice and other devices and without empty bays;
 /// missing when the directory cannot be read.
-Fact<std::vector<Battery>> readBatteries(const std::filesystem::path& directory);
+Fact<std::vector<Battery>> readBatteries(const std::filesystem::path& directory,
+                                         const SystemCalls& calls);
 
 }  // namespace cimomd

@@ -23,9 +23,12 @@ template Fact<std::uint16_t> readHexNumber(const std::filesystem::path& path);
 template Fact<std::uint32_t> readHexNumber(const std::filesystem::path& path);
 
 Fact<bool> readSwitch(const std::filesystem::path& path) {
-    return readNumber(path).then([](std::uint64_t number) {
-        return number <= 1 ? std::optional(number == 1) : std::nullopt;
-    });
+    return switchIn(readNumber(path));
+}
+
+Fact<bool> switchIn(const Fact<std::uint64_t>& number) {
+    return number.then(
+        [](std::uint64_t state) { return state <= 1 ? std::optional(state == 1) : std::nullopt; });
 }
 
 Fact<std::string> ueventValue(std::string_view uevent, std::string_view key) {

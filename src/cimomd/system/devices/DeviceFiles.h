@@ -23,6 +23,9 @@ extern template Fact<std::uint32_t> readHexNumber(const std::filesystem::path& p
 /// A file that holds 0 or 1.
 Fact<bool> readSwitch(const std::filesystem::path& path);
 
+/// The same of a number that was read before.
+Fact<bool> switchIn(const Fact<std::uint64_t>& number);
+
 /// The value of a `key=value` line in the text of a device's uevent file.
 Fact<std::string> ueventValue(std::string_view uevent, std::string_view key);
 

@@ -10,6 +10,7 @@
 #include <vector>
 
 #include "system/Fact.h"
+#include "system/SystemCalls.h"
 
 namespace cimomd {
 
@@ -51,6 +52,11 @@ struct SensorChannel {
 std::optional<SensorChannel> parseSensorFile(std::string_view fileName);
 
 /// Chip by chip, in the order of the ids of the chips; missing when the directory cannot be read.
-Fact<std::vector<HardwareSensor>> readHardwareSensors(const std::filesystem::path& directory);
+Fact<std::vector<HardwareSensor>> readHardwareSensors(const std::filesystem::path& directory,
+                                                      const SystemCalls& calls);
+
+/// The fans alone; no other sensor is asked.
+Fact<std::vector<HardwareSensor>> readFans(const std::filesystem::path& directory,
+                                           const SystemCalls& calls);
 
 }  // namespace cimomd

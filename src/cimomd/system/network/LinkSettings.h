@@ -31,7 +31,4 @@ std::optional<std::string> hardwareAddressText(std::string_view bytes);
 /// are dropped.
 std::map<std::string, LinkSettings> parseRecordedLinks(std::string_view text);
 
-/// Asks the driver of an interface of the machine this runs on. What it does not know is Absent.
-LinkSettings askLinkSettings(const std::string& interfaceName);
-
 }  // namespace cimomd

@@ -5,6 +5,7 @@
 
 #include "files/TextFields.h"
 #include "files/TextFile.h"
+#include "system/FileTexts.h"
 #include "text/NaturalOrder.h"
 
 namespace cimomd {
@@ -33,14 +34,13 @@ Fact<T> ofLink(const Fact<T>& fact) {
 }
 
 /// An unknown speed is -1, which some drivers show as the largest unsigned number.
-Fact<std::uint64_t> readSpeed(const std::filesystem::path& path) {
-    return ofLink(readSignedNumber(path))
-        .then(
-            [](std::int64_t speed) {
-                const bool isKnown = speed > 0 && speed <= std::numeric_limits<std::int32_t>::max();
-                return isKnown ? std::optional(static_cast<std::uint64_t>(speed)) : std::nullopt;
-            },
-            Absence::Absent);
+Fact<std::uint64_t> speedOf(const Fact<std::int64_t>& number) {
+    return ofLink(number).then(
+        [](std::int64_t speed) {
+            const bool isKnown = speed > 0 && speed <= std::numeric_limits<std::int32_t>::max();
+            return isKnown ? std::optional(static_cast<std::uint64_t>(speed)) : std::nullopt;
+        },
+        Absence::Absent);
 }
 
 /// The value of a line `key=value` of a uevent file.
@@ -57,7 +57,8 @@ Fact<std::string> eventValue(const Fact<std::string>& event, std::string_view ke
         Absence::Absent);
 }
 
-NetworkInterface readInterface(const std::filesystem::path& directory, const std::string& name) {
+NetworkInterface readInterface(const std::filesystem::path& directory, const std::string& name,
+                               const FileTexts& link) {
     NetworkInterface out;
     out.name = name;
     out.address = readFact(directory / "address");
@@ -69,11 +70,11 @@ NetworkInterface readInterface(const std::filesystem::path& directory, const std
     out.flags = readFact(directory / "flags").then([](const std::string& text) {
         return parseHexadecimal(text);
     });
-    out.hasCarrier = ofLink(readNumber(directory / "carrier")).then([](std::uint64_t carrier) {
+    out.hasCarrier = ofLink(link.number(directory / "carrier")).then([](std::uint64_t carrier) {
         return carrier != 0;
     });
-    out.speedMbps = readSpeed(directory / "speed");
-    out.fullDuplex = duplexOf(ofLink(readFact(directory / "duplex")));
+    out.speedMbps = speedOf(link.signedNumber(directory / "speed"));
+    out.fullDuplex = duplexOf(ofLink(link.fact(directory / "duplex")));
     out.kind = eventValue(readFact(directory / "uevent"), "DEVTYPE");
     const Fact<std::string> deviceEvent = readFact(directory / "device" / "uevent");
     out.driver = eventValue(deviceEvent, "DRIVER");
@@ -87,6 +88,17 @@ NetworkInterface readInterface(const std::filesystem::path& directory, const std
     return out;
 }
 
+/// The files for which the kernel asks the driver.
+FileTexts readLinks(const std::vector<std::filesystem::path>& interfaces,
+                    const SystemCalls& calls) {
+    std::vector<std::filesystem::path> files;
+    for (const std::filesystem::path& directory : interfaces) {
+        for (const char* name : {"carrier", "speed", "duplex"})
+            files.push_back(directory / name);
+    }
+    return {files, calls};
+}
+
 }  // namespace
 
 bool NetworkInterface::isEthernetPort() const {
@@ -98,16 +110,21 @@ bool NetworkInterface::isWifiPort() const {
     return hasDevice && (isWireless || kind == "wlan") && linkType == kEthernet;
 }
 
-Fact<std::vector<NetworkInterface>> readNetworkInterfaces(const std::filesystem::path& directory) {
+Fact<std::vector<NetworkInterface>> readNetworkInterfaces(const std::filesystem::path& directory,
+                                                          const SystemCalls& calls) {
     const auto names = listDirectory(directory);
     if (!names)
         return names.reason();
-    std::vector<NetworkInterface> out;
+    std::vector<std::filesystem::path> places;
     for (const std::string& name : *names) {
         std::error_code error;
         if (std::filesystem::is_directory(directory / name, error))
-            out.push_back(readInterface(directory / name, name));
+            places.push_back(directory / name);
     }
+    const FileTexts links = readLinks(places, calls);
+    std::vector<NetworkInterface> out;
+    for (const std::filesystem::path& place : places)
+        out.push_back(readInterface(place, place.filename().string(), links));
     std::sort(out.begin(), out.end(),
               [](const auto& a, const auto& b) { return naturallyBefore(a.name, b.name); });
     return out;

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "system/Fact.h"
+#include "system/SystemCalls.h"
 
 namespace cimomd {
 
@@ -44,6 +45,7 @@ struct NetworkInterface {
 };
 
 /// In natural order of the names; missing for the reason that the directory cannot be read.
-Fact<std::vector<NetworkInterface>> readNetworkInterfaces(const std::filesystem::path& directory);
+Fact<std::vector<NetworkInterface>> readNetworkInterfaces(const std::filesystem::path& directory,
+                                                          const SystemCalls& calls);
 
 }  // namespace cimomd

@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <array>
 
-#include "files/BoundedFile.h"
 #include "files/LinkTarget.h"
 #include "files/TextFields.h"
 #include "files/TextFile.h"
@@ -11,8 +10,6 @@
 
 namespace cimomd {
 namespace {
-
-constexpr std::size_t kMaxCommandLineBytes = std::size_t{32} << 10;
 
 // Places of the fields behind the name.
 enum Field : std::size_t {
@@ -54,13 +51,6 @@ class NumberFields {
     std::vector<std::string_view> fields;
     bool isComplete = false;
 };
-
-Fact<std::vector<std::string>> readCommandLine(const std::filesystem::path& path) {
-    const FileContent content = readFilePart(path, 0, kMaxCommandLineBytes);
-    if (content.status != FileStatus::Read)
-        return absenceOf(content.status);
-    return parseCommandLine(content.bytes);
-}
 
 }  // namespace
 
@@ -120,7 +110,12 @@ Fact<std::vector<std::uint64_t>> listProcesses(const std::filesystem::path& dire
     });
 }
 
-std::optional<Process> readProcess(const std::filesystem::path& directory, std::uint64_t id) {
+std::filesystem::path commandLineFile(const std::filesystem::path& directory, std::uint64_t id) {
+    return directory / std::to_string(id) / "cmdline";
+}
+
+std::optional<Process> readProcess(const std::filesystem::path& directory, std::uint64_t id,
+                                   const Fact<std::string>& commandLine) {
     const std::filesystem::path place = directory / std::to_string(id);
     const Fact<std::string> statusLine = readText(place / "stat");
     const auto status = statusLine ? parseProcessStatus(*statusLine) : std::nullopt;
@@ -134,7 +129,7 @@ std::optional<Process> readProcess(const std::filesystem::path& directory, std::
         out.ownership = parseProcessOwnership(*ownership);
     else
         out.ownership = {ownership.reason(), ownership.reason()};
-    out.commandLine = readCommandLine(place / "cmdline");
+    out.commandLine = commandLine.then(parseCommandLine);
     out.executable = linkTargetOf(place / "exe");
     return out;
 }

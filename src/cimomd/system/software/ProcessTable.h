@@ -61,7 +61,12 @@ struct Process {
 /// The numbers of the processes below `directory`, ascending.
 Fact<std::vector<std::uint64_t>> listProcesses(const std::filesystem::path& directory);
 
-/// Nothing when there is no such process, or no longer.
-std::optional<Process> readProcess(const std::filesystem::path& directory, std::uint64_t id);
+/// The file of a process's command line. It takes a lock of the process, which one that hangs may
+/// hold for ever.
+std::filesystem::path commandLineFile(const std::filesystem::path& directory, std::uint64_t id);
+
+/// Nothing when there is no such process, or no longer. `commandLine` is the text of its file.
+std::optional<Process> readProcess(const std::filesystem::path& directory, std::uint64_t id,
+                                   const Fact<std::string>& commandLine);
 
 }  // namespace cimomd

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "FixedSystemCalls.h"
 #include "InstanceText.h"
 #include "SchemaConformance.h"
 #include "machines/Machine.h"
@@ -20,8 +21,17 @@ using Pegasus::CIMInstance;
 using Expected = std::vector<std::pair<const char*, const char*>>;
 
 template <typename Provider>
+Provider providerOn(const char* machineName) {
+    static const FixedSystemCalls calls;
+    if constexpr (std::is_constructible_v<Provider, SystemPaths, const SystemCalls&>)
+        return Provider(machine(machineName), calls);
+    else
+        return Provider(machine(machineName));
+}
+
+template <typename Provider>
 std::vector<CIMInstance> instancesOf(const char* machineName) {
-    return all(Provider(machine(machineName)).enumerate());
+    return all(providerOn<Provider>(machineName).enumerate());
 }
 
 template <typename Provider>
@@ -39,7 +49,7 @@ void expectValues(const CIMInstance& instance, const Expected& expected) {
 
 template <typename Provider>
 std::optional<Absence> absenceOn(const char* machineName) {
-    const auto stream = Provider(machine(machineName)).enumerate();
+    const auto stream = providerOn<Provider>(machineName).enumerate();
     ProvidedInstance provided;
     EXPECT_FALSE(stream->next(provided));
     return stream->absence();
@@ -403,11 +413,11 @@ TEST(DevicesMachines, serveWhatTheSchemaDeclares) {
     for (const char* name : {"laptop", "server", "virtual"})
         expectServesItsClass(PciDeviceProvider(machine(name)));
     for (const char* name : {"laptop", "server"}) {
-        expectServesItsClass(FanProvider(machine(name)));
-        expectServesItsClass(NumericSensorProvider(machine(name)));
+        expectServesItsClass(providerOn<FanProvider>(name));
+        expectServesItsClass(providerOn<NumericSensorProvider>(name));
     }
-    expectServesItsClass(NumericSensorProvider(machine("arm")));
-    expectServesItsClass(BatteryProvider(machine("laptop")));
+    expectServesItsClass(providerOn<NumericSensorProvider>("arm"));
+    expectServesItsClass(providerOn<BatteryProvider>("laptop"));
 }
 
 }  // namespace

@@ -40,7 +40,7 @@ class NetworkMachine {
 
     const EthernetPortProvider ethernet{paths, calls};
     const WiFiPortProvider wifi{paths, calls};
-    const LanEndpointProvider lan{paths};
+    const LanEndpointProvider lan{paths, calls};
     const IpProtocolEndpointProvider addresses{paths, calls};
     const NextHopIpRouteProvider routes{paths};
     const DnsSettingDataProvider resolver{paths};

@@ -1,0 +1,104 @@
+#include "system/GuardedChild.h"
+
+#include <fcntl.h>
+#include <poll.h>
+#include <sys/prctl.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <array>
+#include <cerrno>
+#include <csignal>
+
+namespace cimomd {
+namespace {
+
+using std::chrono::milliseconds;
+using Clock = std::chrono::steady_clock;
+
+// From here to childMain: only calls that are safe between fork and exec of a threaded program.
+
+void closeRange(unsigned int first, unsigned int last) {
+    if (::close_range(first, last, 0) == 0)
+        return;
+    constexpr unsigned int kUsualLimit = 65536;
+    for (unsigned int number = first; number <= std::min(last, kUsualLimit); ++number)
+        ::close(static_cast<int>(number));
+}
+
+/// A child that hangs must keep nobody waiting for the end of a connection or of an output.
+void closeAllBut(unsigned int kept) {
+    if (kept > 0)
+        closeRange(0, kept - 1);
+    closeRange(kept + 1, ~0U);
+}
+
+[[noreturn]] void childMain(GuardedChild::Task task, const void* question, int answers) {
+    ::prctl(PR_SET_PDEATHSIG, SIGKILL);
+    closeAllBut(static_cast<unsigned int>(answers));
+    task(question, answers);
+    ::_exit(0);
+}
+
+/// Waits until an answer, or the end of the child, can be read; false when the time is over.
+bool waitReadable(int descriptor, Clock::time_point end) {
+    while (true) {
+        const auto left = std::chrono::ceil<milliseconds>(end - Clock::now());
+        pollfd entry{descriptor, POLLIN, 0};
+        const int count =
+            ::poll(&entry, 1, static_cast<int>(std::max(left, milliseconds(0)).count()));
+        if (count >= 0 || errno != EINTR)
+            return count > 0;
+    }
+}
+
+}  // namespace
+
+GuardedChild::GuardedChild(SilentSources& silentSources, Task task, const void* question)
+    : sources(silentSources) {
+    std::array<int, 2> ends{};
+    if (::pipe2(ends.data(), O_CLOEXEC) != 0)
+        return;
+    answers = ends[0];
+    child = ::fork();
+    if (child == 0)
+        childMain(task, question, ends[1]);
+    ::close(ends[1]);
+}
+
+GuardedChild::~GuardedChild() {
+    if (child > 0)
+        sources.end(child);
+    if (answers >= 0)
+        ::close(answers);
+}
+
+GuardedChild::Reading GuardedChild::read(void* bytes, std::size_t size) const {
+    if (child <= 0)
+        return Reading::Ended;
+    const auto end = Clock::now() + sources.deadline();
+    std::size_t length = 0;
+    while (length < size) {
+        if (!waitReadable(answers, end))
+            return Reading::Silent;
+        const ssize_t count = ::read(answers, static_cast<char*>(bytes) + length, size - length);
+        if (count == 0 || (count < 0 && errno != EINTR))
+            return Reading::Ended;
+        length += static_cast<std::size_t>(std::max<ssize_t>(count, 0));
+    }
+    return Reading::Complete;
+}
+
+bool writeAnswer(int answers, const void* bytes, std::size_t size) {
+    std::size_t length = 0;
+    while (length < size) {
+        const ssize_t count =
+            ::write(answers, static_cast<const char*>(bytes) + length, size - length);
+        if (count < 0 && errno != EINTR)
+            return false;
+        length += static_cast<std::size_t>(std::max<ssize_t>(count, 0));
+    }
+    return true;
+}
+
+}  // namespace cimomd
