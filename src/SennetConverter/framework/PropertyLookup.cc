@@ -4,18 +4,27 @@
 
 namespace Pegasus {
 
-ResolvedProperty resolveProperty(CIMClass& cimClass, CIMInstance* instance, const CIMName& name) {
-    ResolvedProperty resolved;
-    const Uint32 inClass = cimClass.findProperty(name);
-    const Uint32 inInstance = instance != nullptr ? instance->findProperty(name) : PEG_NOT_FOUND;
-    if (inClass == PEG_NOT_FOUND && inInstance == PEG_NOT_FOUND) {
-        return resolved;
+PropertyLookup::PropertyLookup(CIMClass& cimClass, const CIMName& theName) : name(theName) {
+    const Uint32 position = cimClass.findProperty(name);
+    declared = position != PEG_NOT_FOUND;
+    if (declared) {
+        inClass = cimClass.getProperty(position);
     }
-    const CIMProperty holder = inInstance != PEG_NOT_FOUND ? instance->getProperty(inInstance)
-                                                           : cimClass.getProperty(inClass);
-    resolved.type = holder.getType();
-    resolved.value = holder.getValue();
-    resolved.property = inClass != PEG_NOT_FOUND ? cimClass.getProperty(inClass) : holder;
+}
+
+ResolvedProperty PropertyLookup::in(const CIMInstance* instance) const {
+    ResolvedProperty resolved;
+    const Uint32 position = instance != nullptr ? instance->findProperty(name) : PEG_NOT_FOUND;
+    if (position != PEG_NOT_FOUND) {
+        const CIMConstProperty holder = instance->getProperty(position);
+        resolved.type = holder.getType();
+        resolved.value = holder.getValue();
+        resolved.property = declared ? inClass : CIMInstance(*instance).getProperty(position);
+    } else if (declared) {
+        resolved.type = inClass.getType();
+        resolved.value = inClass.getValue();
+        resolved.property = inClass;
+    }
     return resolved;
 }
 

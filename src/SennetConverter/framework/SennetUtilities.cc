@@ -1,7 +1,7 @@
 #include "SennetConverter/framework/SennetUtilities.h"
 
+#include <charconv>
 #include <cstdlib>
-#include <string>
 
 namespace Pegasus {
 
@@ -63,6 +63,13 @@ bool startsWith(const String& text, const String& prefix) {
 
 bool isWhiteSpace(Uint16 character) {
     return character == ' ' || character == '\r' || character == '\t' || character == '\n';
+}
+
+template <typename Integer>
+String decimalText(Integer number) {
+    char digits[24];
+    const char* const end = std::to_chars(digits, digits + sizeof digits, number).ptr;
+    return String(digits, static_cast<Uint32>(end - digits));
 }
 
 void dropLast(String& text, char character) {
@@ -145,11 +152,11 @@ void SennetUtilities::itoa(int value, char* buffer, int radix) {
 }
 
 String SennetUtilities::toDecimal(Sint64 number) {
-    return String(std::to_string(number).c_str());
+    return decimalText(number);
 }
 
 String SennetUtilities::toUnsignedDecimal(Uint64 number) {
-    return String(std::to_string(number).c_str());
+    return decimalText(number);
 }
 
 String SennetUtilities::limitLength(const String& length) {

@@ -7,10 +7,11 @@ namespace Pegasus {
 
 void CaSennetConverter::printOutput(CimScriptParser& parser, Array<CIMClass>& classes,
                                     CimInstanceLists& instanceLists) {
+    GroupAttributes attributes;
     const Uint32 groups = largestListSize(instanceLists);
     for (Uint32 i = 0; i < groups; ++i) {
         openFileIfNeeded();
-        printClass(parser, classes, instanceLists, i);
+        printGroup(parser, classes, instanceLists, i, attributes);
         ++nextGroupId;
     }
 }

@@ -1,5 +1,7 @@
 #include "SennetConverter/mif/QveSennetConverter.h"
 
+#include <utility>
+
 #include "SennetConverter/framework/SennetUtilities.h"
 
 namespace Pegasus {
@@ -39,8 +41,8 @@ String QveSennetConverter::formatString(String text) {
 
 String QveSennetConverter::formatEnumArray(CIMValue value, CIMType type, CIMProperty property) {
     const String text = SennetConverter::formatEnumArray(value, type, property);
-    const bool bareNumber =
-        !value.isArray() && property.findQualifier(CIMName("Values")) == PEG_NOT_FOUND;
+    static const CIMName kValues("Values");
+    const bool bareNumber = !value.isArray() && property.findQualifier(kValues) == PEG_NOT_FOUND;
     return bareNumber ? quote(text) : text;
 }
 
@@ -49,7 +51,7 @@ String QveSennetConverter::getValueString(CIMValue value, CIMType type, CIMPrope
         return "\"null\"";
     }
     if (type != CIMTYPE_DATETIME) {
-        return SennetConverter::getValueString(value, type, property);
+        return SennetConverter::getValueString(std::move(value), type, std::move(property));
     }
     CIMDateTime time;
     value.get(time);

@@ -1,8 +1,10 @@
 #include "SennetConverter/mif/SennetConverter.h"
 
+#include <utility>
+#include <vector>
+
 #include "CimScriptParser/CimScriptParser.h"
 #include "SennetConverter/framework/CimInstanceLists.h"
-#include "SennetConverter/framework/PropertyLookup.h"
 #include "SennetConverter/framework/SennetUtilities.h"
 
 namespace Pegasus {
@@ -13,18 +15,18 @@ constexpr Sint32 kFirstGroupId = 2;
 constexpr char kClassPrefix[] = "Corvane-Velt|KWX MIF ";
 constexpr char kValueLine[] = "\r\n         Value = ";
 
-// The instance of a list at a position, in storage; null when the list is shorter.
-CIMInstance* instanceAt(const CimInstanceLists& lists, Uint32 list, Uint32 position,
-                        CIMInstance& storage) {
-    const Array<CIMInstance> instances = lists.getInstanceList(static_cast<int>(list));
-    if (position >= instances.size()) {
-        return nullptr;
-    }
-    storage = instances[position];
-    return &storage;
+// The instance at a position; null when the list is shorter.
+const CIMInstance* instanceAt(const Array<CIMInstance>& instances, Uint32 position) {
+    return position < instances.size() ? &instances[position] : nullptr;
 }
 
 }  // namespace
+
+// The cells of one class: its instances and the columns that show them.
+struct SennetConverter::ClassRows {
+    Array<CIMInstance> instances;
+    std::vector<PropertyLookup> columns;
+};
 
 SennetConverter::SennetConverter(const String& fileName, const Velm::Properties& theProperties,
                                  unsigned int theMaxNameLength)
@@ -69,43 +71,59 @@ void SennetConverter::printTable(CimScriptParser& parser, Array<CIMClass>& class
     Output(header.getCString());
     ++nextGroupId;
 
-    const auto rows = static_cast<int>(largestListSize(instanceLists));
-    for (int row = style.firstRowLast ? 1 : 0; row < rows; ++row) {
-        Output(formatRow(parser, classes, instanceLists, row, style).getCString());
+    std::vector<ClassRows> cells;
+    for (Uint32 k = 0; k < classes.size(); ++k) {
+        cells.push_back({instanceLists.getInstanceList(static_cast<int>(k)), {}});
+        const Array<CIMName> names = scriptProperties(parser, classes[k]);
+        for (Uint32 i = 0; i < names.size(); ++i) {
+            cells.back().columns.emplace_back(classes[k], names[i]);
+        }
+    }
+    const Uint32 rows = largestListSize(instanceLists);
+    for (Uint32 row = style.firstRowLast ? 1 : 0; row < rows; ++row) {
+        printRow(cells, row, style);
     }
     if (style.firstRowLast) {
-        Output(formatRow(parser, classes, instanceLists, 0, style).getCString());
+        printRow(cells, 0, style);
     }
     Output("\r\n   End Table\r\n");
 }
 
-String SennetConverter::formatRow(CimScriptParser& parser, Array<CIMClass>& classes,
-                                  CimInstanceLists& instanceLists, int rowIndex,
-                                  const TableStyle& style) {
-    String row("      { ");
-    row.append(style.rowNumberCell(rowIndex + 1));
+void SennetConverter::printRow(const std::vector<ClassRows>& classes, Uint32 rowIndex,
+                               const TableStyle& style) {
+    String& row = rowText;
+    row.remove(0);
+    row.append("      { ");
+    row.append(style.rowNumberCell(static_cast<int>(rowIndex + 1)));
     row.append(", ");
-    for (Uint32 k = 0; k < classes.size(); ++k) {
-        const Array<CIMName> names = scriptProperties(parser, classes[k]);
-        CIMInstance storage;
-        CIMInstance* instance =
-            instanceAt(instanceLists, k, static_cast<Uint32>(rowIndex), storage);
-        for (Uint32 i = 0; i < names.size(); ++i) {
-            if (i > 0) {
+    for (const ClassRows& each : classes) {
+        if (&each != &classes.front()) {
+            row.append(Char16(','));
+        }
+        const CIMInstance* instance = instanceAt(each.instances, rowIndex);
+        for (const PropertyLookup& column : each.columns) {
+            if (&column != &each.columns.front()) {
                 row.append(Char16(','));
             }
             if (instance != nullptr) {
-                const ResolvedProperty cell = resolveProperty(classes[k], instance, names[i]);
-                row.append(formatValue(cell.value, cell.type, cell.property));
+                ResolvedProperty cell = column.in(instance);
+                row.append(formatValue(std::move(cell.value), cell.type, std::move(cell.property)));
             }
         }
-        row.append(k + 1 < classes.size() ? "," : "}\r\n");
     }
-    return row;
+    row.append("}\r\n");
+    Output(row.getCString());
 }
 
 void SennetConverter::printClass(CimScriptParser& parser, Array<CIMClass>& classes,
                                  CimInstanceLists& instanceLists, unsigned int n) {
+    GroupAttributes attributes;
+    printGroup(parser, classes, instanceLists, n, attributes);
+}
+
+void SennetConverter::printGroup(CimScriptParser& parser, Array<CIMClass>& classes,
+                                 CimInstanceLists& instanceLists, unsigned int n,
+                                 GroupAttributes& attributes) {
     bool hasInstances = false;
     int blankValues = 0;
     for (Uint32 k = 0; k < classes.size(); ++k) {
@@ -117,35 +135,62 @@ void SennetConverter::printClass(CimScriptParser& parser, Array<CIMClass>& class
         return;
     }
     Output(mifClassHeader(parser, static_cast<int>(n)).getCString());
-    printAttributes(parser, classes, instanceLists, n, blankValues);
+    printAttributes(parser, classes, instanceLists, n, blankValues, attributes);
     Output("   End Group\r\n");
 }
 
 void SennetConverter::printAttributes(CimScriptParser& parser, Array<CIMClass>& classes,
                                       CimInstanceLists& instanceLists, unsigned int n,
-                                      int blankValues) {
+                                      int blankValues, GroupAttributes& attributes) {
+    const auto print = [&](GroupAttributes::Attribute& attribute) {
+        const Array<CIMInstance> instances =
+            instanceLists.getInstanceList(static_cast<int>(attribute.classIndex));
+        printAttribute(classes[attribute.classIndex], attribute, instanceAt(instances, n),
+                       blankValues);
+    };
+    if (attributes.complete) {
+        for (GroupAttributes::Attribute& attribute : attributes.attributes) {
+            print(attribute);
+        }
+        return;
+    }
     const auto format = [this](const String& name) { return formatProperty(name); };
     forEachColumn(parser, classes, format, [&](const Column& column) {
-        CIMClass& cimClass = classes[column.classIndex];
-        const String propertyName = column.property.getString();
-        CIMInstance storage;
-        const ResolvedProperty shown = resolveProperty(
-            cimClass, instanceAt(instanceLists, column.classIndex, n, storage), column.property);
-        const String typeText = shown.value.isArray()
-                                    ? stringType("255")
-                                    : getTypeString(cimClass, propertyName, shown.type);
-
-        String attribute("\r\n      Start Attribute\r\n         Name = \"");
-        attribute.append(substituteValues(column.name));
-        attribute.append("\"\r\n         Id = ");
-        attribute.append(column.numberText);
-        attribute.append("\r\n");
-        attribute.append(typeText);
-        attribute.append(
-            getPropertyValueForClass(shown.property, shown.type, shown.value, blankValues));
-        attribute.append("\r\n      End Attribute\r\n");
-        Output(attribute.getCString());
+        const PropertyLookup lookup(classes[column.classIndex], column.property);
+        attributes.attributes.push_back(
+            {column.classIndex, lookup, column.name, column.numberText, {}});
+        print(attributes.attributes.back());
     });
+    attributes.complete = true;
+}
+
+void SennetConverter::printAttribute(CIMClass& cimClass, GroupAttributes::Attribute& attribute,
+                                     const CIMInstance* instance, int blankValues) {
+    const ResolvedProperty shown = attribute.lookup.in(instance);
+    if (attribute.head.empty() || attribute.type != shown.type ||
+        attribute.isArray != static_cast<bool>(shown.value.isArray())) {
+        writeHead(cimClass, attribute, shown);
+    }
+    const CString value =
+        getPropertyValueForClass(shown.property, shown.type, shown.value, blankValues).getCString();
+    Output(attribute.head.c_str());
+    Output(value);
+    Output("\r\n      End Attribute\r\n");
+}
+
+void SennetConverter::writeHead(CIMClass& cimClass, GroupAttributes::Attribute& attribute,
+                                const ResolvedProperty& shown) {
+    attribute.type = shown.type;
+    attribute.isArray = shown.value.isArray();
+    String head("\r\n      Start Attribute\r\n         Name = \"");
+    head.append(substituteValues(attribute.name));
+    head.append("\"\r\n         Id = ");
+    head.append(attribute.numberText);
+    head.append("\r\n");
+    head.append(attribute.isArray
+                    ? stringType("255")
+                    : getTypeString(cimClass, attribute.lookup.getName().getString(), shown.type));
+    attribute.head = head.getCString();
 }
 
 String SennetConverter::mifClassHeader(CimScriptParser& parser, int n) {

@@ -5,6 +5,8 @@
 // want differently is in the subclasses.
 
 #include "SennetConverter/framework/CimConverter.h"
+#include "SennetConverter/mif/GroupAttributes.h"
+#include "SennetConverter/mif/ValueNames.h"
 
 namespace Pegasus {
 
@@ -105,12 +107,26 @@ class SennetConverter : public CimConverter {
     /// Id that the next table, or numbered group, receives; 2 while nothing has been numbered.
     Sint32 nextGroupId = 2;
 
+    /// printClass for one of several groups of a script, which share `attributes`.
+    void printGroup(CimScriptParser& parser, Array<CIMClass>& classes,
+                    CimInstanceLists& instanceLists, unsigned int n, GroupAttributes& attributes);
+
   private:
+    struct ClassRows;
+
     String groupName(CimScriptParser& parser);
-    String formatRow(CimScriptParser& parser, Array<CIMClass>& classes,
-                     CimInstanceLists& instanceLists, int rowIndex, const TableStyle& style);
+    void printRow(const std::vector<ClassRows>& classes, Uint32 rowIndex, const TableStyle& style);
     void printAttributes(CimScriptParser& parser, Array<CIMClass>& classes,
-                         CimInstanceLists& instanceLists, unsigned int n, int blankValues);
+                         CimInstanceLists& instanceLists, unsigned int n, int blankValues,
+                         GroupAttributes& attributes);
+    void printAttribute(CIMClass& cimClass, GroupAttributes::Attribute& attribute,
+                        const CIMInstance* instance, int blankValues);
+    void writeHead(CIMClass& cimClass, GroupAttributes::Attribute& attribute,
+                   const ResolvedProperty& shown);
+
+    ValueNamesCache valueNames;
+    // Kept from row to row for its capacity.
+    String rowText;
 };
 
 }  // namespace Pegasus

@@ -1,7 +1,8 @@
 // The part of SennetConverter that renders types and values.
 
+#include <algorithm>
 #include <cstdio>
-#include <cstring>
+#include <utility>
 
 #include "SennetConverter/framework/SennetUtilities.h"
 #include "SennetConverter/mif/SennetConverter.h"
@@ -20,8 +21,27 @@ bool isPrintableAscii(Uint16 character) {
     return character >= ' ' && character <= '~';
 }
 
-bool isOneOf(Uint16 character, const char* characters) {
-    return character != 0 && character <= '~' && std::strchr(characters, character) != nullptr;
+// Whether escaping changes nothing. Without a branch in the loop, so that the compiler makes vector
+// code of it; of the characters to escape, those that are not printable need no look of their own.
+bool isPlain(const Char16* text, Uint32 size, const char* escapedCharacters) {
+    Uint16 printable[2] = {};
+    Uint32 count = 0;
+    for (; *escapedCharacters != '\0'; ++escapedCharacters) {
+        const auto character = static_cast<unsigned char>(*escapedCharacters);
+        if (isPrintableAscii(character)) {
+            if (count == 2) {
+                return false;
+            }
+            printable[count++] = character;
+        }
+    }
+    Uint16 odd = 0;
+    for (Uint32 i = 0; i < size; ++i) {
+        const Uint16 character = text[i];
+        odd |= static_cast<Uint16>((static_cast<Uint16>(character - ' ') > '~' - ' ') |
+                                   (character == printable[0]) | (character == printable[1]));
+    }
+    return odd == 0;
 }
 
 String cut(const String& text, Uint32 limit) {
@@ -90,51 +110,6 @@ String joinNonIntegers(CIMValue& value, CIMType type) {
     }
 }
 
-// The strings of a qualifier; none when its value is no array of strings or null.
-Array<String> qualifierTexts(const CIMValue& value) {
-    Array<String> texts;
-    if (value.getType() == CIMTYPE_STRING && value.isArray()) {
-        value.get(texts);
-    }
-    return texts;
-}
-
-Uint32 findText(const Array<String>& texts, const String& text) {
-    for (Uint32 i = 0; i < texts.size(); ++i) {
-        if (String::equal(texts[i], text)) {
-            return i;
-        }
-    }
-    return PEG_NOT_FOUND;
-}
-
-// Names of the numbers of an enumerated property.
-class ValueNames {
-  public:
-    ValueNames(CIMProperty& property, const CIMValue& theNames) : names(qualifierTexts(theNames)) {
-        const Uint32 position = property.findQualifier(CIMName("ValueMap"));
-        if (position == PEG_NOT_FOUND) {
-            return;
-        }
-        const CIMValue map = property.getQualifier(position).getValue();
-        if (map.getType() == CIMTYPE_STRING) {
-            mapped = true;
-            numbers = qualifierTexts(map);
-        }
-    }
-
-    String nameOf(Uint64 number) const {
-        const String decimal = SennetUtilities::toUnsignedDecimal(number);
-        const Uint64 position = mapped ? findText(numbers, decimal) : number;
-        return position < names.size() ? names[static_cast<Uint32>(position)] : decimal;
-    }
-
-  private:
-    Array<String> names;
-    Array<String> numbers;
-    bool mapped = false;
-};
-
 }  // namespace
 
 String SennetConverter::getTypeString(CIMClass cimClass, String propertyName, CIMType type) {
@@ -150,7 +125,8 @@ String SennetConverter::getTypeString(CIMClass cimClass, String propertyName, CI
 
 String SennetConverter::getValueString(CIMValue value, CIMType type, CIMProperty property) {
     if (isInteger(type)) {
-        return value.isNull() ? String("0") : formatEnumArray(value, type, property);
+        return value.isNull() ? String("0")
+                              : formatEnumArray(std::move(value), type, std::move(property));
     }
     if (type == CIMTYPE_DATETIME) {
         CIMDateTime time;
@@ -171,8 +147,8 @@ String SennetConverter::getValueString(CIMValue value, CIMType type, CIMProperty
 }
 
 String SennetConverter::formatValue(CIMValue value, CIMType type, CIMProperty property) {
-    return value.isArray() ? formatArray(value, type, property)
-                           : getValueString(value, type, property);
+    return value.isArray() ? formatArray(std::move(value), type, std::move(property))
+                           : getValueString(std::move(value), type, std::move(property));
 }
 
 String SennetConverter::formatArray(CIMValue value, CIMType type, CIMProperty property) {
@@ -183,10 +159,11 @@ String SennetConverter::formatArray(CIMValue value, CIMType type, CIMProperty pr
 }
 
 String SennetConverter::formatEnumArray(CIMValue value, CIMType type, CIMProperty property) {
-    const Uint32 values = property.findQualifier(CIMName("Values"));
+    static const CIMName kValues("Values");
+    const Uint32 values = property.findQualifier(kValues);
     String text;
     if (values != PEG_NOT_FOUND) {
-        const ValueNames names(property, property.getQualifier(values).getValue());
+        const ValueNames& names = valueNames.of(property, values);
         if (value.isArray()) {
             const Array<Uint64> numbers = getUint64Array(value, type);
             text = join(numbers.size(), [&](Uint32 i) { return names.nameOf(numbers[i]); });
@@ -229,16 +206,30 @@ String SennetConverter::formatString(String text) {
 }
 
 String SennetConverter::escape(const String& text, const char* escapedCharacters) {
+    constexpr Uint32 kPiece = 256;
+    Char16 piece[2 * kPiece];
+    bool isEscaped[128] = {};
+    for (const char* character = escapedCharacters; *character != '\0'; ++character) {
+        isEscaped[static_cast<unsigned char>(*character)] = true;
+    }
+    const Char16* const data = text.getChar16Data();
+    if (isPlain(data, text.size(), escapedCharacters)) {
+        return text;
+    }
     String escaped;
-    escaped.reserveCapacity(2 * text.size());
-    for (Uint32 i = 0; i < text.size(); ++i) {
-        const Uint16 character = text[i];
-        if (isOneOf(character, escapedCharacters)) {
-            escaped.append(Char16('\\'));
-            escaped.append(Char16(character));
-        } else {
-            escaped.append(Char16(isPrintableAscii(character) ? character : Uint16(' ')));
+    for (Uint32 begin = 0; begin < text.size(); begin += kPiece) {
+        const Uint32 end = std::min(text.size(), begin + kPiece);
+        Uint32 size = 0;
+        for (Uint32 i = begin; i < end; ++i) {
+            const Uint16 character = data[i];
+            if (character < 128 && isEscaped[character]) {
+                piece[size++] = Char16('\\');
+                piece[size++] = Char16(character);
+            } else {
+                piece[size++] = Char16(isPrintableAscii(character) ? character : Uint16(' '));
+            }
         }
+        escaped.append(piece, size);
     }
     return escaped;
 }
@@ -251,12 +242,18 @@ bool SennetConverter::isCalendarDateTime(const String& text) {
     if (text.size() != kDateTimeLength || Uint16(text[kMicrosecondsPoint]) != '.') {
         return false;
     }
-    const String century = text.subString(0, 2);
-    return String::equal(century, "19") || String::equal(century, "20");
+    const Uint16 first = text[0];
+    const Uint16 second = text[1];
+    return (first == '1' && second == '9') || (first == '2' && second == '0');
 }
 
 String SennetConverter::quote(const String& text) {
-    return String("\"") + text + "\"";
+    String quoted;
+    quoted.reserveCapacity(text.size() + 2);
+    quoted.append(Char16('"'));
+    quoted.append(text.getChar16Data(), text.size());
+    quoted.append(Char16('"'));
+    return quoted;
 }
 
 }  // namespace Pegasus

@@ -106,7 +106,7 @@ CIMQualifier CIMClass::getQualifier(Uint32 index) {
 }
 
 CIMProperty CIMClass::getProperty(Uint32 index) {
-    return access().properties.at(index);
+    return access().properties.changeable(index);
 }
 
 }  // namespace Pegasus

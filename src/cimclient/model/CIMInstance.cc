@@ -66,6 +66,10 @@ CIMInstance CIMConstInstance::clone() const {
     return CIMInstance(static_cast<InstanceBody*>(access().clone().release()));
 }
 
+CIMInstance makeInstance(std::unique_ptr<InstanceBody> body) {
+    return CIMInstance(body.release());
+}
+
 void CIMInstance::setPath(CIMObjectPath path) {
     access().path = std::move(path);
 }
@@ -85,7 +89,7 @@ CIMQualifier CIMInstance::getQualifier(Uint32 index) {
 }
 
 CIMProperty CIMInstance::getProperty(Uint32 index) {
-    return access().properties.at(index);
+    return access().properties.changeable(index);
 }
 
 }  // namespace Pegasus

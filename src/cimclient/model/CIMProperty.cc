@@ -4,6 +4,7 @@
 #include <utility>
 
 #include "Handle.h"
+#include "PackedProperties.h"
 #include "PropertyBody.h"
 
 namespace Pegasus {
@@ -27,61 +28,70 @@ CIMConstProperty::CIMConstProperty(CIMName name, CIMValue value, Uint32 arraySiz
     fresh->referenceClass = std::move(referenceClass);
     fresh->classOrigin = std::move(classOrigin);
     fresh->propagated = propagated;
-    body = BodyRef<PropertyBody>(fresh.release());
+    body = BodyRef<SharedBody>(fresh.release());
 }
 
 CIMConstProperty::CIMConstProperty(PropertyBody* newBody) : body(newBody) {}
 
+CIMConstProperty::CIMConstProperty(const BodyRef<PackedProperties>& properties, Uint32 index)
+    : body(properties.get()), index(index) {}
+
 PropertyBody& CIMConstProperty::access() const {
-    return requireBody(body, kHandleClass);
+    return static_cast<PropertyBody&>(requireBody(body, kHandleClass));
 }
 
-const CIMName& CIMConstProperty::getName() const {
-    return access().name;
+const PackedProperties* CIMConstProperty::packed() const {
+    return index == kNotPacked ? nullptr : static_cast<const PackedProperties*>(body.get());
 }
 
-const CIMValue& CIMConstProperty::getValue() const {
-    return access().value;
+CIMName CIMConstProperty::getName() const {
+    return packed() ? packed()->declaration(index).name : access().name;
+}
+
+CIMValue CIMConstProperty::getValue() const {
+    return packed() ? packed()->value(index) : access().value;
 }
 
 CIMType CIMConstProperty::getType() const {
-    return access().value.getType();
+    return packed() ? packed()->declaration(index).type : access().value.getType();
 }
 
 Boolean CIMConstProperty::isArray() const {
-    return access().value.isArray();
+    return packed() ? packed()->declaration(index).isArray : access().value.isArray();
 }
 
 Uint32 CIMConstProperty::getArraySize() const {
-    return access().arraySize;
+    return packed() ? packed()->declaration(index).arraySize : access().arraySize;
 }
 
-const CIMName& CIMConstProperty::getReferenceClassName() const {
-    return access().referenceClass;
+CIMName CIMConstProperty::getReferenceClassName() const {
+    return packed() ? CIMName() : access().referenceClass;
 }
 
-const CIMName& CIMConstProperty::getClassOrigin() const {
-    return access().classOrigin;
+CIMName CIMConstProperty::getClassOrigin() const {
+    return packed() ? packed()->declaration(index).classOrigin : access().classOrigin;
 }
 
 Boolean CIMConstProperty::getPropagated() const {
-    return access().propagated;
+    return packed() ? packed()->declaration(index).propagated : access().propagated;
 }
 
 Uint32 CIMConstProperty::findQualifier(const CIMName& name) const {
-    return access().qualifiers.find(name);
+    return packed() ? PEG_NOT_FOUND : access().qualifiers.find(name);
 }
 
-CIMConstQualifier CIMConstProperty::getQualifier(Uint32 index) const {
-    return access().qualifiers.at(index);
+CIMConstQualifier CIMConstProperty::getQualifier(Uint32 position) const {
+    if (packed())
+        throw IndexOutOfBoundsException(position, 0);
+    return access().qualifiers.at(position);
 }
 
 Uint32 CIMConstProperty::getQualifierCount() const {
-    return access().qualifiers.size();
+    return packed() ? 0 : access().qualifiers.size();
 }
 
 CIMProperty CIMConstProperty::clone() const {
-    return CIMProperty(new PropertyBody(access()));
+    return packed() ? packed()->at(index) : CIMProperty(new PropertyBody(access()));
 }
 
 void CIMProperty::setValue(CIMValue value) {

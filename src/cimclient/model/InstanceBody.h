@@ -1,6 +1,7 @@
 // What the copies of a CIMInstance share.
 #pragma once
 
+#include <Pegasus/Common/CIMInstance.h>
 #include <Pegasus/Common/CIMObjectPath.h>
 
 #include <memory>
@@ -22,5 +23,8 @@ class InstanceBody : public ObjectBody {
 
     CIMObjectPath path;
 };
+
+/// A handle on `body`, which it takes.
+CIMInstance makeInstance(std::unique_ptr<InstanceBody> body);
 
 }  // namespace Pegasus

@@ -10,6 +10,7 @@
 #include <utility>
 
 #include "NamedList.h"
+#include "PropertyStore.h"
 
 namespace Pegasus {
 
@@ -24,13 +25,11 @@ class ObjectBody : public SharedBody {
     void addQualifier(CIMQualifier qualifier) {
         qualifiers.add(std::move(qualifier), "qualifier", className);
     }
-    void addProperty(CIMProperty property) {
-        properties.add(std::move(property), "property", className);
-    }
+    void addProperty(CIMProperty property) { properties.add(std::move(property), className); }
 
     CIMName className;
     NamedList<CIMQualifier> qualifiers;
-    NamedList<CIMProperty> properties;
+    PropertyStore properties;
 
   protected:
     /// Copies deeply, unlike the handles' own copies.

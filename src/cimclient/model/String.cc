@@ -267,7 +267,8 @@ Boolean String::equal(const String& a, const String& b) {
 }
 
 Boolean String::equalNoCase(const String& a, const String& b) {
-    return a.body == b.body || (a.size() == b.size() && compareNoCase(a, b) == 0);
+    // Names are mostly spelled alike.
+    return equal(a, b) || (a.size() == b.size() && compareNoCase(a, b) == 0);
 }
 
 String operator+(const String& a, const String& b) {

@@ -7,6 +7,28 @@
 
 namespace Pegasus {
 
+namespace {
+
+/// Copies the characters at the front up to the first that is not ASCII; how many these were.
+std::size_t copyAscii(const Char16* text, std::size_t n, char* out) {
+    constexpr std::size_t kBlock = 16;
+    std::size_t i = 0;
+    for (; n - i >= kBlock; i += kBlock) {
+        Uint16 seen = 0;
+        for (std::size_t k = 0; k < kBlock; ++k)
+            seen |= text[i + k];
+        if (seen >= 0x80)
+            break;
+        for (std::size_t k = 0; k < kBlock; ++k)
+            out[i + k] = static_cast<char>(Uint16{text[i + k]});
+    }
+    for (; i < n && text[i] < 0x80; ++i)
+        out[i] = static_cast<char>(Uint16{text[i]});
+    return i;
+}
+
+}  // namespace
+
 Boolean isAscii(const char* bytes, std::size_t n) {
     std::size_t i = 0;
     for (Uint64 word = 0; n - i >= sizeof(word); i += sizeof(word)) {
@@ -48,9 +70,10 @@ std::size_t decodeUtf8(const char* bytes, std::size_t n, Char16* out) {
 }
 
 std::string encodeUtf8(const Char16* text, std::size_t n) {
-    std::string out;
-    out.reserve(n);
-    for (std::size_t i = 0; i < n; ++i) {
+    std::string out(n, '\0');
+    const std::size_t ascii = copyAscii(text, n, out.data());
+    out.resize(ascii);
+    for (std::size_t i = ascii; i < n; ++i) {
         const Uint32 unit = text[i];
         const Uint32 next = i + 1 < n ? Uint32{text[i + 1]} : 0;
         if (utf8::isHighSurrogate(unit) && utf8::isLowSurrogate(next)) {

@@ -22,13 +22,13 @@ CIMName DecodeContext::optionalName(const ElementReader& reader, std::string_vie
 
 std::string DecodeContext::place() const {
     std::string place;
-    if (!propertyName.isNull()) {
+    if (propertyName != nullptr) {
         place += "; in property ";
-        place += propertyName.getString().getCString();
+        place += propertyName->getString().getCString();
     }
-    if (!className.isNull()) {
+    if (className != nullptr) {
         place += place.empty() ? "; in class " : " of class ";
-        place += className.getString().getCString();
+        place += className->getString().getCString();
     }
     return place;
 }

@@ -18,7 +18,7 @@ struct DecodeContext {
         : names(names), embeddingLevel(embeddingLevel) {}
 
     /// The name in an attribute of the element that `reader` has just entered. Fails when there is
-    /// no such attribute, or its value is no CIM name.
+    /// no such attribute, or its value is no CIM name. Valid as long as `names`.
     const CIMName& requiredName(const ElementReader& reader, std::string_view attributeName);
 
     /// As requiredName, but null when the attribute is missing.
@@ -31,8 +31,8 @@ struct DecodeContext {
     /// How many embedded objects the text being read is inside of.
     unsigned embeddingLevel;
     /// Null while no class or instance, or none of its properties, is being read.
-    CIMName className;
-    CIMName propertyName;
+    const CIMName* className = nullptr;
+    const CIMName* propertyName = nullptr;
 };
 
 }  // namespace Pegasus

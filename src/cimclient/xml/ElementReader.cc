@@ -91,6 +91,12 @@ ElementText ElementReader::readText() {
     return collectText(first);
 }
 
+ElementText ElementReader::textOf(std::size_t index) {
+    const std::string_view text = tokenizer.texts()[index];
+    elementOffset = tokenizer.offsetOf(text) - textTagSize;
+    return {text, trimXmlSpace(text)};
+}
+
 // The general case: a text in pieces, between which stand comments and CDATA sections.
 ElementText ElementReader::collectText(Token token) {
     std::size_t literalBegin = std::string::npos;

@@ -51,6 +51,23 @@ class ElementReader {
     /// Leaves the current element, which holds text only, and gives its text.
     ElementText readText();
 
+    /// Reads the next child as a whole when its markup is that of `run`, an earlier child in this
+    /// place of the grammar; its texts are then textOf(0) and on. Otherwise false, and nothing
+    /// happens.
+    bool readLike(const MarkupRun& run) {
+        textTagSize = run.textTagSize;
+        return tokenizer.readLike(run);
+    }
+    std::size_t textCount() const { return tokenizer.texts().size(); }
+    /// A text inside the child that was read last; faults reported from now on are those of the
+    /// element that has it.
+    ElementText textOf(std::size_t index);
+
+    /// Octets of the document read so far.
+    std::uint64_t position() const { return tokenizer.position(); }
+    /// As XmlTokenizer::readSince().
+    std::string_view readSince(std::uint64_t from) const { return tokenizer.readSince(from); }
+
     /// The element just entered.
     std::string_view name() const { return tokenizer.name(); }
     bool is(std::string_view expected) const { return tokenizer.name() == expected; }
@@ -78,6 +95,7 @@ class ElementReader {
 
     XmlTokenizer tokenizer;
     std::uint64_t elementOffset = 0;
+    std::size_t textTagSize = 0;
     std::string collected;
 };
 

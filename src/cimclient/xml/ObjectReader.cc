@@ -6,6 +6,7 @@
 #include <string>
 #include <system_error>
 #include <utility>
+#include <vector>
 
 #include "xml/XmlCharacters.h"
 
@@ -22,92 +23,128 @@ CIMInstance ObjectReader::readNamedInstance() {
 }
 
 CIMInstance ObjectReader::readInstance() {
-    context.className = context.requiredName(reader, "CLASSNAME");
-    CIMInstance instance(context.className);
-    while (reader.nextChild()) {
-        if (!readMember(instance)) {
-            reader.failUnexpected("QUALIFIER, PROPERTY, PROPERTY.ARRAY or PROPERTY.REFERENCE");
-        }
+    context.className = &context.requiredName(reader, "CLASSNAME");
+    assembly.start(*context.className, context.embeddingLevel == 0);
+    while (readKnownProperty() || readMember()) {
     }
-    context.className.clear();
-    return instance;
+    context.className = nullptr;
+    return assembly.finish();
 }
 
-CIMClass ObjectReader::readClass() {
-    context.className = context.requiredName(reader, "NAME");
-    CIMClass cimClass(context.className, context.optionalName(reader, "SUPERCLASS"));
-    while (reader.nextChild()) {
-        if (reader.is("METHOD")) {
-            skipMethod();
-        } else if (!readMember(cimClass)) {
-            reader.failUnexpected(
-                "QUALIFIER, PROPERTY, PROPERTY.ARRAY, PROPERTY.REFERENCE or METHOD");
+// Reads a property that looks like one of an earlier instance but for its value; false when none
+// comes next.
+bool ObjectReader::readKnownProperty() {
+    constexpr std::size_t kLookAhead = 4;
+    for (std::size_t ahead = 0; ahead < kLookAhead; ++ahead) {
+        const KnownProperties::Property* known = assembly.expected(ahead);
+        if (known == nullptr) {
+            return false;
         }
+        const PropertyDeclaration& property = assembly.declaration(*known);
+        context.propertyName = &property.name;
+        const bool hasValue = known->withValue && reader.readLike(*known->withValue);
+        const bool isNull =
+            !hasValue && known->withoutValue && reader.readLike(*known->withoutValue);
+        if (hasValue) {
+            values.packTexts(property.type, property.isArray, assembly.packer());
+        }
+        context.propertyName = nullptr;
+        if (!hasValue && !isNull) {
+            continue;
+        }
+        if (isNull) {
+            assembly.packer().beginNull();
+        }
+        assembly.tookExpected(ahead);
+        return true;
     }
-    context.className.clear();
-    return cimClass;
+    return false;
 }
 
-// Reads what a class and an instance have in common; false when the element is none of it.
-template <typename Owner>
-bool ObjectReader::readMember(Owner& owner) {
-    if (reader.is("PROPERTY")) {
-        add(owner, readProperty());
-    } else if (reader.is("PROPERTY.ARRAY")) {
-        add(owner, readPropertyArray());
-    } else if (reader.is("PROPERTY.REFERENCE")) {
-        add(owner, readPropertyReference());
-    } else if (reader.is("PROPERTY.REFARRAY")) {
-        add(owner, readPropertyReferenceArray());
-    } else if (reader.is("QUALIFIER")) {
-        add(owner, readQualifier());
-    } else {
+// Reads the next member of the instance; false at its end.
+bool ObjectReader::readMember() {
+    const std::uint64_t begin = reader.position();
+    if (!reader.nextChild()) {
         return false;
+    }
+    if (isAtProperty()) {
+        const CIMProperty property = readAnyProperty();
+        addOnce("property", property,
+                [&] { assembly.addProperty(property, reader.readSince(begin)); });
+    } else if (reader.is("QUALIFIER")) {
+        const CIMQualifier qualifier = readQualifier();
+        addOnce("qualifier", qualifier, [&] { assembly.addQualifier(qualifier); });
+    } else {
+        reader.failUnexpected("QUALIFIER, PROPERTY, PROPERTY.ARRAY or PROPERTY.REFERENCE");
     }
     return true;
 }
 
-template <typename Owner>
-void ObjectReader::add(Owner& owner, const CIMProperty& property) const {
-    try {
-        owner.addProperty(property);
-    } catch (const AlreadyExistsException&) {
-        failTwice("property", property.getName());
+CIMClass ObjectReader::readClass() {
+    context.className = &context.requiredName(reader, "NAME");
+    CIMClass cimClass(*context.className, context.optionalName(reader, "SUPERCLASS"));
+    while (reader.nextChild()) {
+        if (isAtProperty()) {
+            const CIMProperty property = readAnyProperty();
+            addOnce("property", property, [&] { cimClass.addProperty(property); });
+        } else if (reader.is("QUALIFIER")) {
+            const CIMQualifier qualifier = readQualifier();
+            addOnce("qualifier", qualifier, [&] { cimClass.addQualifier(qualifier); });
+        } else if (reader.is("METHOD")) {
+            skipMethod();
+        } else {
+            reader.failUnexpected(
+                "QUALIFIER, PROPERTY, PROPERTY.ARRAY, PROPERTY.REFERENCE or METHOD");
+        }
     }
+    context.className = nullptr;
+    return cimClass;
 }
 
-template <typename Owner>
-void ObjectReader::add(Owner& owner, const CIMQualifier& qualifier) const {
-    try {
-        owner.addQualifier(qualifier);
-    } catch (const AlreadyExistsException&) {
-        failTwice("qualifier", qualifier.getName());
-    }
+bool ObjectReader::isAtProperty() const {
+    return reader.name().starts_with("PROPERTY") &&
+           (reader.is("PROPERTY") || reader.is("PROPERTY.ARRAY") ||
+            reader.is("PROPERTY.REFERENCE") || reader.is("PROPERTY.REFARRAY"));
 }
 
-void ObjectReader::failTwice(const char* kind, const CIMName& name) const {
-    const CString utf8 = name.getString().getCString();
-    reader.fail(std::string(kind) + " " + quotedForMessage(static_cast<const char*>(utf8)) +
-                " is given twice");
+CIMProperty ObjectReader::readAnyProperty() {
+    if (reader.is("PROPERTY")) {
+        return readProperty();
+    }
+    if (reader.is("PROPERTY.ARRAY")) {
+        return readPropertyArray();
+    }
+    return reader.is("PROPERTY.REFERENCE") ? readPropertyReference() : readPropertyReferenceArray();
+}
+
+template <typename Item, typename Add>
+void ObjectReader::addOnce(const char* kind, const Item& item, Add add) const {
+    try {
+        add();
+    } catch (const AlreadyExistsException&) {
+        const CString utf8 = item.getName().getString().getCString();
+        reader.fail(std::string(kind) + " " + quotedForMessage(static_cast<const char*>(utf8)) +
+                    " is given twice");
+    }
 }
 
 CIMProperty ObjectReader::readProperty() {
-    context.propertyName = context.requiredName(reader, "NAME");
+    context.propertyName = &context.requiredName(reader, "NAME");
     return readPropertyBody(CIMValue(values.readType(), false), "VALUE");
 }
 
 CIMProperty ObjectReader::readPropertyArray() {
-    context.propertyName = context.requiredName(reader, "NAME");
+    context.propertyName = &context.requiredName(reader, "NAME");
     return readPropertyBody(CIMValue(values.readType(), true, readArraySize()), "VALUE.ARRAY");
 }
 
 CIMProperty ObjectReader::readPropertyReference() {
-    context.propertyName = context.requiredName(reader, "NAME");
+    context.propertyName = &context.requiredName(reader, "NAME");
     return readPropertyBody(CIMValue(CIMTYPE_REFERENCE, false), "VALUE.REFERENCE");
 }
 
 CIMProperty ObjectReader::readPropertyReferenceArray() {
-    context.propertyName = context.requiredName(reader, "NAME");
+    context.propertyName = &context.requiredName(reader, "NAME");
     return readPropertyBody(CIMValue(CIMTYPE_REFERENCE, true, readArraySize()), "VALUE.REFARRAY");
 }
 
@@ -118,23 +155,23 @@ CIMProperty ObjectReader::readPropertyBody(CIMValue value, std::string_view valu
     const CIMName referenceClass = context.optionalName(reader, "REFERENCECLASS");
     const CIMName classOrigin = context.optionalName(reader, "CLASSORIGIN");
     const Boolean propagated = reader.booleanAttribute("PROPAGATED", false);
-    Array<CIMQualifier> qualifiers;
+    std::vector<CIMQualifier> qualifiers;
     while (reader.nextChild()) {
         if (reader.is(valueElement) && value.isNull()) {
             value = value.isArray() ? values.readArray(value.getType())
                                     : values.readScalar(value.getType());
         } else if (reader.is("QUALIFIER")) {
-            qualifiers.append(readQualifier());
+            qualifiers.push_back(readQualifier());
         } else {
             reader.failUnexpected("QUALIFIER or one " + std::string(valueElement));
         }
     }
-    CIMProperty property(context.propertyName, std::move(value), arraySize, referenceClass,
+    CIMProperty property(*context.propertyName, std::move(value), arraySize, referenceClass,
                          classOrigin, propagated);
     for (const CIMQualifier& qualifier : qualifiers) {
-        add(property, qualifier);
+        addOnce("qualifier", qualifier, [&] { property.addQualifier(qualifier); });
     }
-    context.propertyName.clear();
+    context.propertyName = nullptr;
     return property;
 }
 

@@ -12,6 +12,7 @@
 
 #include "xml/DecodeContext.h"
 #include "xml/ElementReader.h"
+#include "xml/InstanceAssembly.h"
 #include "xml/PathReader.h"
 #include "xml/ValueReader.h"
 
@@ -23,7 +24,10 @@ class ObjectReader {
   public:
     /// Both must outlive the object reader.
     ObjectReader(ElementReader& reader, DecodeContext& context)
-        : reader(reader), context(context), values(reader, context), paths(reader, context) {}
+        : reader(reader),
+          context(context),
+          values(reader, context),
+          paths(reader, context, &knownKeys) {}
 
     /// VALUE.NAMEDINSTANCE: an instance with its path.
     CIMInstance readNamedInstance();
@@ -33,13 +37,12 @@ class ObjectReader {
     CIMClass readClass();
 
   private:
-    template <typename Owner>
-    bool readMember(Owner& owner);
-    template <typename Owner>
-    void add(Owner& owner, const CIMProperty& property) const;
-    template <typename Owner>
-    void add(Owner& owner, const CIMQualifier& qualifier) const;
-    [[noreturn]] void failTwice(const char* kind, const CIMName& name) const;
+    bool readKnownProperty();
+    bool readMember();
+    CIMProperty readAnyProperty();
+    bool isAtProperty() const;
+    template <typename Item, typename Add>
+    void addOnce(const char* kind, const Item& item, Add add) const;
 
     CIMProperty readProperty();
     CIMProperty readPropertyArray();
@@ -54,7 +57,9 @@ class ObjectReader {
     ElementReader& reader;
     DecodeContext& context;
     ValueReader values;
+    std::vector<PathReader::KnownKey> knownKeys;
     PathReader paths;
+    InstanceAssembly assembly;
 };
 
 }  // namespace Pegasus

@@ -7,6 +7,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "xml/ScalarParser.h"
@@ -38,8 +39,23 @@ bool isNumber(const ElementText& text) {
     return parseScalar(text, positive) || parseScalar(text, negative) || parseScalar(text, real);
 }
 
-// Sorts, so that an absurd number of keys takes no absurd time.
+bool fewHaveDuplicates(const Array<CIMKeyBinding>& keys) {
+    for (Uint32 i = 1; i < keys.size(); ++i) {
+        for (Uint32 k = 0; k < i; ++k) {
+            if (keys[i].getName().equal(keys[k].getName())) {
+                return true;
+            }
+        }
+    }
+    return false;
+}
+
+// Sorts many, so that an absurd number of keys takes no absurd time.
 bool hasDuplicates(const Array<CIMKeyBinding>& keys) {
+    constexpr Uint32 kFew = 8;
+    if (keys.size() <= kFew) {
+        return fewHaveDuplicates(keys);
+    }
     std::vector<const CIMName*> names;
     names.reserve(keys.size());
     for (const CIMKeyBinding& key : keys) {
@@ -82,13 +98,54 @@ CIMName PathReader::readClassName() {
 CIMObjectPath PathReader::readInstanceName() {
     const CIMName className = context.requiredName(reader, "CLASSNAME");
     Array<CIMKeyBinding> keys;
-    while (reader.nextChild()) {
-        keys.append(reader.is("KEYBINDING") ? readKeyBinding() : readKey(CIMName()));
+    while (readKnownKey(keys) || readNextKey(keys)) {
     }
     if (hasDuplicates(keys)) {
         reader.fail("a key of an instance name is given twice");
     }
     return CIMObjectPath(String(), CIMNamespaceName(), className, std::move(keys));
+}
+
+// Adds a key that looks like that of an earlier instance but for its value.
+bool PathReader::readKnownKey(Array<CIMKeyBinding>& keys) {
+    if (known == nullptr || keys.size() >= known->size()) {
+        return false;
+    }
+    const KnownKey& key = (*known)[keys.size()];
+    if (!reader.readLike(key.markup)) {
+        return false;
+    }
+    keys.append(makeKey(key.name, key.type, reader.textOf(0)));
+    return true;
+}
+
+// Adds the next key; false when there is none.
+bool PathReader::readNextKey(Array<CIMKeyBinding>& keys) {
+    const std::uint64_t begin = reader.position();
+    if (!reader.nextChild()) {
+        return false;
+    }
+    const bool isBinding = reader.is("KEYBINDING");
+    const CIMKeyBinding key = isBinding ? readKeyBinding() : readKey(CIMName());
+    if (known != nullptr && isBinding && key.getType() != CIMKeyBinding::REFERENCE) {
+        learn(key, keys.size(), reader.readSince(begin));
+    }
+    keys.append(key);
+    return true;
+}
+
+void PathReader::learn(const CIMKeyBinding& key, Uint32 position, std::string_view element) {
+    constexpr Uint32 kMostKeys = 64;
+    std::optional<MarkupRun> markup = MarkupRun::ofOneText(element, "KEYVALUE");
+    if (!markup || position > known->size() || position == kMostKeys) {
+        return;
+    }
+    KnownKey seen{key.getName(), key.getType(), std::move(*markup)};
+    if (position == known->size()) {
+        known->push_back(std::move(seen));
+    } else {
+        (*known)[position] = std::move(seen);
+    }
 }
 
 CIMKeyBinding PathReader::readKeyBinding() {
@@ -111,7 +168,11 @@ CIMKeyBinding PathReader::readKey(const CIMName& name) {
 
 CIMKeyBinding PathReader::readKeyValue(const CIMName& name) {
     const CIMKeyBinding::Type type = keyType(reader);
-    const ElementText text = reader.readText();
+    return makeKey(name, type, reader.readText());
+}
+
+CIMKeyBinding PathReader::makeKey(const CIMName& name, CIMKeyBinding::Type type,
+                                  const ElementText& text) const {
     Boolean isTrue = false;
     if (type == CIMKeyBinding::BOOLEAN) {
         if (!parseScalar(text, isTrue)) {

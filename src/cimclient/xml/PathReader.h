@@ -6,8 +6,12 @@
 #include <Pegasus/Common/CIMName.h>
 #include <Pegasus/Common/CIMObjectPath.h>
 
+#include <string_view>
+#include <vector>
+
 #include "xml/DecodeContext.h"
 #include "xml/ElementReader.h"
+#include "xml/MarkupRun.h"
 
 namespace Pegasus {
 
@@ -15,8 +19,18 @@ namespace Pegasus {
 /// Failures are XmlError.
 class PathReader {
   public:
-    /// Both must outlive the path reader.
-    PathReader(ElementReader& reader, DecodeContext& context) : reader(reader), context(context) {}
+    /// A key as it looked in an earlier instance name.
+    struct KnownKey {
+        CIMName name;
+        CIMKeyBinding::Type type;
+        MarkupRun markup;
+    };
+
+    /// All must outlive the path reader. With `known`, which is for the reader to fill, keys that
+    /// look alike are recognised.
+    PathReader(ElementReader& reader, DecodeContext& context,
+               std::vector<KnownKey>* known = nullptr)
+        : reader(reader), context(context), known(known) {}
 
     /// LOCALNAMESPACEPATH: its NAMESPACE elements joined by "/".
     CIMNamespaceName readLocalNamespacePath();
@@ -41,9 +55,15 @@ class PathReader {
     CIMKeyBinding readKeyBinding();
     CIMKeyBinding readKey(const CIMName& name);
     CIMKeyBinding readKeyValue(const CIMName& name);
+    CIMKeyBinding makeKey(const CIMName& name, CIMKeyBinding::Type type,
+                          const ElementText& text) const;
+    bool readKnownKey(Array<CIMKeyBinding>& keys);
+    bool readNextKey(Array<CIMKeyBinding>& keys);
+    void learn(const CIMKeyBinding& key, Uint32 position, std::string_view element);
 
     ElementReader& reader;
     DecodeContext& context;
+    std::vector<KnownKey>* known;
 };
 
 }  // namespace Pegasus

@@ -10,6 +10,7 @@
 #include <type_traits>
 #include <utility>
 
+#include "model/CimTypeDispatch.h"
 #include "xml/MemorySource.h"
 #include "xml/ObjectReader.h"
 #include "xml/PathReader.h"
@@ -23,50 +24,6 @@ namespace {
 // An object embedded in an object embedded in ...: each level is escaped once more, so real ones
 // are shallow.
 constexpr unsigned kMaxEmbedding = 8;
-
-template <typename T>
-struct Type {};
-
-// Calls `action` with the C++ type that carries `type`.
-template <typename Action>
-auto dispatch(CIMType type, Action action) {
-    switch (type) {
-        case CIMTYPE_BOOLEAN:
-            return action(Type<Boolean>());
-        case CIMTYPE_UINT8:
-            return action(Type<Uint8>());
-        case CIMTYPE_SINT8:
-            return action(Type<Sint8>());
-        case CIMTYPE_UINT16:
-            return action(Type<Uint16>());
-        case CIMTYPE_SINT16:
-            return action(Type<Sint16>());
-        case CIMTYPE_UINT32:
-            return action(Type<Uint32>());
-        case CIMTYPE_SINT32:
-            return action(Type<Sint32>());
-        case CIMTYPE_UINT64:
-            return action(Type<Uint64>());
-        case CIMTYPE_SINT64:
-            return action(Type<Sint64>());
-        case CIMTYPE_REAL32:
-            return action(Type<Real32>());
-        case CIMTYPE_REAL64:
-            return action(Type<Real64>());
-        case CIMTYPE_CHAR16:
-            return action(Type<Char16>());
-        case CIMTYPE_STRING:
-            return action(Type<String>());
-        case CIMTYPE_DATETIME:
-            return action(Type<CIMDateTime>());
-        case CIMTYPE_REFERENCE:
-            return action(Type<CIMObjectPath>());
-        case CIMTYPE_OBJECT:
-            return action(Type<CIMObject>());
-        default:
-            return action(Type<CIMInstance>());
-    }
-}
 
 }  // namespace
 
@@ -117,12 +74,14 @@ CIMType ValueReader::readType() const {
 }
 
 CIMValue ValueReader::readScalar(CIMType type) {
-    return dispatch(type, [this]<typename T>(Type<T>) { return CIMValue(readItem<T>()); });
+    return dispatchCimType(type,
+                           [this]<typename T>(CimTypeTag<T>) { return CIMValue(readItem<T>()); });
 }
 
 CIMValue ValueReader::readArray(CIMType type) {
     const std::string_view item = type == CIMTYPE_REFERENCE ? "VALUE.REFERENCE" : "VALUE";
-    return dispatch(type, [this, item]<typename T>(Type<T>) { return readItems<T>(item); });
+    return dispatchCimType(type,
+                           [this, item]<typename T>(CimTypeTag<T>) { return readItems<T>(item); });
 }
 
 template <typename T>
@@ -154,13 +113,40 @@ T ValueReader::readItem() {
         }
         return CIMInstance(object);
     } else {
-        const ElementText text = reader.readText();
-        T item{};
-        if (!parseScalar(text, item)) {
-            reader.fail("value " + quotedForMessage(text.raw) + " is no " +
-                        cimTypeToString(kCimTypeOf<T>));
+        return parse<T>(reader.readText());
+    }
+}
+
+template <typename T>
+T ValueReader::parse(const ElementText& text) const {
+    T item{};
+    if (!parseScalar(text, item)) {
+        reader.fail("value " + quotedForMessage(text.raw) + " is no " +
+                    cimTypeToString(kCimTypeOf<T>));
+    }
+    return item;
+}
+
+void ValueReader::packTexts(CIMType type, Boolean isArray, PropertyPacker& packer) {
+    const std::size_t count = reader.textCount();
+    if (isArray) {
+        packer.beginArray(static_cast<Uint32>(count));
+    } else {
+        packer.beginScalar();
+    }
+    dispatchCimType(type, [&]<typename T>(CimTypeTag<T>) {
+        for (std::size_t i = 0; i < count; ++i) {
+            packText<T>(reader.textOf(i), packer);
         }
-        return item;
+    });
+}
+
+template <typename T>
+void ValueReader::packText(const ElementText& text, PropertyPacker& packer) const {
+    if constexpr (std::is_same_v<T, String>) {
+        packer.putText(text.trimmed);
+    } else if constexpr (PackableScalar<T>) {
+        packer.put(parse<T>(text));
     }
 }
 

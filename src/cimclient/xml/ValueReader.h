@@ -9,6 +9,7 @@
 #include <optional>
 #include <string_view>
 
+#include "model/PackedProperties.h"
 #include "xml/DecodeContext.h"
 #include "xml/ElementReader.h"
 
@@ -31,11 +32,19 @@ class ValueReader {
     /// VALUE.NULL becomes 0, false, an empty text or an empty path.
     CIMValue readArray(CIMType type);
 
+    /// Packs the texts that the reader holds after ElementReader::readLike(). `type` is neither
+    /// reference nor embedded object; a scalar has one text.
+    void packTexts(CIMType type, Boolean isArray, PropertyPacker& packer);
+
   private:
     template <typename T>
     T readItem();
     template <typename T>
     CIMValue readItems(std::string_view itemElement);
+    template <typename T>
+    T parse(const ElementText& text) const;
+    template <typename T>
+    void packText(const ElementText& text, PropertyPacker& packer) const;
     CIMObject readEmbedded();
     CIMObject readEmbeddedDocument(std::string_view xml, DecodeContext& inner) const;
 

@@ -25,6 +25,18 @@ constexpr OctetTable makeTable(std::string_view stops) {
 
 constexpr OctetTable kTextStops = makeTable("<>&\r");
 constexpr OctetTable kTagStops = makeTable("<>\"'");
+// What a text of known markup may not hold, references apart, is left to the general way.
+constexpr OctetTable kLeafTextStops = makeTable("<>\r");
+
+constexpr OctetTable makeNameTable() {
+    OctetTable table{};
+    for (std::size_t octet = 0; octet < table.size(); ++octet) {
+        table[octet] = isNameCharacter(static_cast<char>(octet));
+    }
+    return table;
+}
+
+constexpr OctetTable kNameCharacters = makeNameTable();
 
 std::size_t skipTo(const OctetTable& stops, const char* data, std::size_t from) {
     while (!stops[static_cast<unsigned char>(data[from])]) {
@@ -70,6 +82,9 @@ XmlTokenizer::Token XmlTokenizer::advance() {
             return finish();
         }
         if (*at(pos) == '<') {
+            if (isNameStart(*at(pos + 1))) {
+                return readStartTag();
+            }
             if (startsWith("<?")) {
                 skipInstruction();
             } else if (startsWith("<!--")) {
@@ -98,6 +113,64 @@ XmlTokenizer::Token XmlTokenizer::finish() {
         failTruncated();
     }
     return Token::End;
+}
+
+bool XmlTokenizer::readLike(const MarkupRun& run) {
+    // PROPERTY.ARRAY, VALUE.ARRAY, VALUE.
+    constexpr std::size_t kDeepest = 3;
+    currentTexts.clear();
+    const std::string_view unread = view(pos, window.size());
+    if (emptyElement || depth() + kDeepest > limits.depth || !unread.starts_with(run.before)) {
+        return false;
+    }
+    const char* end = unread.data() + run.before.size();
+    if (run.hasText) {
+        end = findTextsLike(run, end);
+        if (end == nullptr) {
+            return false;
+        }
+    }
+    decodeTexts();
+    pos = static_cast<std::size_t>(end - window.data());
+    return true;
+}
+
+// Notes the texts as they stand. Returns where the element ends, or nullptr.
+const char* XmlTokenizer::findTextsLike(const MarkupRun& run, const char* p) {
+    const char* const windowEnd = window.data() + window.size();
+    for (;;) {
+        const char* const end = p + skipTo(kLeafTextStops, p, 0);
+        const auto size = static_cast<std::size_t>(end - p);
+        const std::string_view rest(end, static_cast<std::size_t>(windowEnd - end));
+        if (size > limits.tokenSize) {
+            return nullptr;
+        }
+        currentTexts.emplace_back(p, size);
+        if (rest.starts_with(run.after)) {
+            return end + run.after.size();
+        }
+        if (run.between.empty() || !rest.starts_with(run.between)) {
+            return nullptr;
+        }
+        p = end + run.between.size();
+    }
+}
+
+void XmlTokenizer::decodeTexts() {
+    for (std::string_view& text : currentTexts) {
+        if (text.find('&') != std::string_view::npos) {
+            char* const begin = at(static_cast<std::size_t>(text.data() - window.data()));
+            const char* const end = decode(begin, begin + text.size(), XmlTextKind::Content);
+            text = text.substr(0, static_cast<std::size_t>(end - begin));
+        }
+    }
+}
+
+std::string_view XmlTokenizer::readSince(std::uint64_t from) const {
+    if (from < window.offsetOf(0) || from < changedUpTo) {
+        return {};
+    }
+    return view(static_cast<std::size_t>(from - window.offsetOf(0)), pos);
 }
 
 XmlTokenizer::Token XmlTokenizer::readMarkup() {
@@ -334,20 +407,16 @@ void XmlTokenizer::scanTo(std::string_view terminator) {
     checkSize();
 }
 
-// Called before anything else is found wrong, so that the outcome does not depend on how much of a
-// token that is too long arrives at once.
-void XmlTokenizer::checkSize() const {
-    if (pos - tokenStart > limits.tokenSize) {
-        fail(XmlError::Kind::Limit, offset(),
-             "a tag or text is longer than " + std::to_string(limits.tokenSize) + " octets");
-    }
+void XmlTokenizer::failTooLong() const {
+    fail(XmlError::Kind::Limit, offset(),
+         "a tag or text is longer than " + std::to_string(limits.tokenSize) + " octets");
 }
 
 char* XmlTokenizer::parseName(char* p, const char* expected) {
     if (!isNameStart(*p)) {
         failAt(p, std::string("expected ") + expected);
     }
-    while (isNameCharacter(*p)) {
+    while (kNameCharacters[static_cast<unsigned char>(*p)]) {
         ++p;
     }
     return p;
@@ -410,7 +479,8 @@ void XmlTokenizer::checkNewAttribute(std::string_view name) const {
     }
 }
 
-char* XmlTokenizer::decode(char* begin, const char* end, XmlTextKind kind) const {
+char* XmlTokenizer::decode(char* begin, const char* end, XmlTextKind kind) {
+    changedUpTo = window.offsetOf(static_cast<std::size_t>(end - window.data()));
     try {
         return decodeXmlText(begin, end, kind);
     } catch (const XmlTextFault& fault) {
@@ -431,7 +501,7 @@ bool XmlTokenizer::more() {
     return extended;
 }
 
-bool XmlTokenizer::available(std::size_t count) {
+bool XmlTokenizer::makeAvailable(std::size_t count) {
     while (window.size() - pos < count) {
         if (!more()) {
             return false;

@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "xml/ByteSource.h"
+#include "xml/MarkupRun.h"
 #include "xml/XmlError.h"
 #include "xml/XmlTextDecoder.h"
 #include "xml/XmlWindow.h"
@@ -56,6 +57,23 @@ class XmlTokenizer {
     /// As next(), but the current text stays readable as heldText() until the following call.
     Token nextHoldingText();
 
+    /// Reads the next element when its markup is that of `run`, which was read in this place
+    /// before. Its texts are then in texts(), and the current token is its end. False, with nothing
+    /// read, when the octets differ or have not all arrived.
+    bool readLike(const MarkupRun& run);
+    /// Valid until the next octet is read.
+    const std::vector<std::string_view>& texts() const { return currentTexts; }
+    /// Octets of the document before `text`, one of texts().
+    std::uint64_t offsetOf(std::string_view text) const {
+        return window.offsetOf(static_cast<std::size_t>(text.data() - window.data()));
+    }
+
+    /// Octets of the document before the next token.
+    std::uint64_t position() const { return window.offsetOf(pos); }
+    /// The octets that were read since `from`, an earlier position(); empty when they are not at
+    /// hand as they stood in the document.
+    std::string_view readSince(std::uint64_t from) const;
+
     std::string_view name() const { return currentName; }
     std::string_view text() const { return view(textBegin, textEnd); }
     std::string_view heldText() const { return view(heldBegin, heldEnd); }
@@ -84,16 +102,28 @@ class XmlTokenizer {
 
     void scanTag();
     void scanTo(std::string_view terminator);
-    void checkSize() const;
+    // Called before anything else is found wrong, so that the outcome does not depend on how much
+    // of a token that is too long arrives at once.
+    void checkSize() const {
+        if (pos - tokenStart > limits.tokenSize) {
+            failTooLong();
+        }
+    }
+    [[noreturn]] void failTooLong() const;
     char* parseName(char* p, const char* expected);
     void parseAttributes(char* p, const char* end);
     char* parseAttribute(char* p, const char* end);
     void checkNewAttribute(std::string_view name) const;
 
-    char* decode(char* begin, const char* end, XmlTextKind kind) const;
+    char* decode(char* begin, const char* end, XmlTextKind kind);
+    const char* findTextsLike(const MarkupRun& run, const char* p);
+    void decodeTexts();
 
     bool more();
-    bool available(std::size_t count);
+    bool available(std::size_t count) {
+        return window.size() - pos >= count || makeAvailable(count);
+    }
+    bool makeAvailable(std::size_t count);
     bool startsWith(std::string_view expected);
     char* at(std::size_t index) { return window.data() + index; }
     std::string_view view(std::size_t from, std::size_t to) const {
@@ -119,6 +149,9 @@ class XmlTokenizer {
     std::uint64_t declarationOffset = 0;
     std::string_view currentName;
     std::vector<Attribute> currentAttributes;
+    std::vector<std::string_view> currentTexts;
+    // Up to where the window's octets may differ from the document's.
+    std::uint64_t changedUpTo = 0;
     // The names of the open elements, one after the other, and where each begins.
     std::string openNames;
     std::vector<std::size_t> nameStarts;

@@ -5,6 +5,8 @@
 #include <Pegasus/Common/CIMName.h>
 #include <Pegasus/Common/CIMObjectPath.h>
 
+#include <memory>
+
 namespace Pegasus {
 
 class InstanceBody;
@@ -14,6 +16,7 @@ class CIMConstProperty;
 class CIMProperty;
 class CIMConstQualifier;
 class CIMQualifier;
+CIMInstance makeInstance(std::unique_ptr<InstanceBody> body);
 
 /// A handle that reads. Copies share one instance. Getters of a default-constructed handle raise
 /// UninitializedObjectException; positions that do not exist raise IndexOutOfBoundsException.
@@ -68,6 +71,7 @@ class CIMInstance : public CIMConstInstance {
 
   private:
     friend class CIMConstInstance;
+    friend CIMInstance makeInstance(std::unique_ptr<InstanceBody> body);
 };
 
 }  // namespace Pegasus

@@ -10,10 +10,12 @@
 namespace Pegasus {
 
 class CIMValue;
+class PackedProperties;
 class PropertyBody;
 class CIMProperty;
 
-/// A handle that reads. Copies share one property. Getters of a default-constructed handle raise
+/// A handle that reads. Copies share one property. That of an instance which a server sent shows
+/// the property as it was sent, also after the instance was changed. Getters of a default-constructed handle raise
 /// UninitializedObjectException.
 class CIMConstProperty {
   public:
@@ -25,14 +27,15 @@ class CIMConstProperty {
                      CIMName referenceClass = CIMName(), CIMName classOrigin = CIMName(),
                      Boolean propagated = false);
 
-    const CIMName& getName() const;
-    const CIMValue& getValue() const;
+    /// These are copies, which are cheap: there need be no object that they could refer to.
+    CIMName getName() const;
+    CIMValue getValue() const;
     CIMType getType() const;
     Boolean isArray() const;
     /// The declared size of an array of fixed size; 0 for any other property.
     Uint32 getArraySize() const;
-    const CIMName& getReferenceClassName() const;
-    const CIMName& getClassOrigin() const;
+    CIMName getReferenceClassName() const;
+    CIMName getClassOrigin() const;
     Boolean getPropagated() const;
 
     /// The position of the qualifier, or PEG_NOT_FOUND.
@@ -49,7 +52,16 @@ class CIMConstProperty {
     PropertyBody& access() const;
 
   private:
-    BodyRef<PropertyBody> body;
+    friend class PropertyStore;
+    /// Property `index` of `properties`.
+    CIMConstProperty(const BodyRef<PackedProperties>& properties, Uint32 index);
+    const PackedProperties* packed() const;
+
+    static constexpr Uint32 kNotPacked = PEG_NOT_FOUND;
+
+    /// A PropertyBody or PackedProperties, of which it is one.
+    BodyRef<SharedBody> body;
+    Uint32 index = kNotPacked;
 };
 
 /// The handle that also changes its property.

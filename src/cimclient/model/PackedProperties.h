@@ -1,0 +1,104 @@
+// The properties of an instance in little memory: a shape that it shares with others of its class,
+// and its values one behind the other in one piece.
+//
+// An inventory has hundred thousands of values, most of which are looked at once. A CIMProperty of
+// its own for each of them would take ten times their size.
+#pragma once
+
+#include <Pegasus/Common/BodyRef.h>
+#include <Pegasus/Common/CIMDateTime.h>
+#include <Pegasus/Common/CIMProperty.h>
+#include <Pegasus/Common/CIMValue.h>
+#include <Pegasus/Common/Char16.h>
+#include <Pegasus/Common/SharedBody.h>
+
+#include <concepts>
+#include <cstring>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <type_traits>
+#include <utility>
+#include <vector>
+
+#include "InstanceShape.h"
+
+namespace Pegasus {
+
+/// What a packed property can hold: everything but references and embedded objects.
+template <class T>
+concept PackableScalar = std::is_arithmetic_v<T> || std::same_as<T, Char16> ||
+    std::same_as<T, String> || std::same_as<T, CIMDateTime>;
+
+/// They never change, so that copies of an instance can share them.
+class PackedProperties : public SharedBody {
+  public:
+    Uint32 size() const { return shape->size(); }
+    /// The position, or PEG_NOT_FOUND.
+    Uint32 find(const CIMName& name) const { return shape->find(name); }
+
+    /// Of an index below size().
+    const PropertyDeclaration& declaration(Uint32 index) const { return shape->at(index); }
+    CIMValue value(Uint32 index) const;
+    /// A property of its own.
+    CIMProperty at(Uint32 index) const;
+
+  private:
+    friend class PropertyPacker;
+    PackedProperties(std::shared_ptr<const InstanceShape> shape, std::unique_ptr<char[]> octets)
+        : shape(std::move(shape)), octets(std::move(octets)) {}
+
+    std::shared_ptr<const InstanceShape> shape;
+    /// For each property where its value begins, 0 for null; behind them the values.
+    std::unique_ptr<char[]> octets;
+};
+
+/// Makes the packed properties of one instance after the other.
+///
+/// Between start() and finish() each property is begun with beginNull(), beginScalar() or
+/// beginArray(); the latter two are followed by one putText() or put() for each element.
+class PropertyPacker {
+  public:
+    /// Forgets what was packed since the last finish().
+    void start();
+    void beginNull() { starts.push_back(kNull); }
+    void beginScalar() { starts.push_back(static_cast<Uint32>(values.size())); }
+    void beginArray(Uint32 elements) {
+        beginScalar();
+        put(elements);
+    }
+
+    /// A number, boolean or char16.
+    template <class T>
+    requires(std::is_arithmetic_v<T> || std::same_as<T, Char16>) void put(T item) {
+        values.append(reinterpret_cast<const char*>(&item), sizeof item);
+    }
+    void put(const CIMDateTime& time) {
+        const CString text = time.toString().getCString();
+        putText(static_cast<const char*>(text));
+    }
+    /// A string, in UTF-8.
+    void putText(std::string_view utf8) {
+        put(static_cast<Uint32>(utf8.size()));
+        values += utf8;
+    }
+    /// The next property as a whole. False, and nothing happens, when its value cannot be packed.
+    Boolean add(const CIMValue& value);
+
+    /// The number of properties begun.
+    Uint32 size() const { return static_cast<Uint32>(starts.size()); }
+    /// False when so much was packed that positions in it might overflow with the next property.
+    Boolean hasRoom() const { return values.size() < kMostOctets; }
+
+    /// `shape` has as many declarations, and of the types that were put. Raises std::bad_alloc.
+    BodyRef<PackedProperties> finish(std::shared_ptr<const InstanceShape> shape);
+
+  private:
+    static constexpr Uint32 kNull = 0xFFFFFFFF;
+    static constexpr std::size_t kMostOctets = std::size_t{512} * 1024 * 1024;
+
+    std::string values;
+    std::vector<Uint32> starts;
+};
+
+}  // namespace Pegasus
