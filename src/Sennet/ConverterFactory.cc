@@ -43,9 +43,14 @@ void createQveConverters(CimConverterList& converters, const String& mifDirector
                          const String& sqlDirectory, const String& scriptName,
                          const Velm::Properties& properties) {
     if (converters.getNumberOfConverters() == 0) {
-        add<QveSennetConverter>(converters, mifDirectory + "/kwvinv.mif", properties);
-        add<QveLumoSennetConverter>(converters, mifDirectory + "/kwinvlumo.mif", properties,
-                                    kMaxLumoName);
+        auto* const qve =
+            new QveSennetConverter(mifDirectory + "/kwvinv.mif", properties, kMaxName);
+        converters.addConverter(qve);
+        auto* const lumo =
+            new QveLumoSennetConverter(mifDirectory + "/kwinvlumo.mif", properties, kMaxLumoName);
+        converters.addConverter(lumo);
+        // They differ in names only.
+        qve->shareRows(*lumo);
     } else {
         keepCombinedConverters(converters);
     }

@@ -13,19 +13,16 @@ PropertyLookup::PropertyLookup(CIMClass& cimClass, const CIMName& theName) : nam
 }
 
 ResolvedProperty PropertyLookup::in(const CIMInstance* instance) const {
-    ResolvedProperty resolved;
     const Uint32 position = instance != nullptr ? instance->findProperty(name) : PEG_NOT_FOUND;
     if (position != PEG_NOT_FOUND) {
         const CIMConstProperty holder = instance->getProperty(position);
-        resolved.type = holder.getType();
-        resolved.value = holder.getValue();
-        resolved.property = declared ? inClass : CIMInstance(*instance).getProperty(position);
-    } else if (declared) {
-        resolved.type = inClass.getType();
-        resolved.value = inClass.getValue();
-        resolved.property = inClass;
+        return {declared ? inClass : CIMInstance(*instance).getProperty(position), holder.getType(),
+                holder.getValue()};
     }
-    return resolved;
+    if (declared) {
+        return {inClass, inClass.getType(), inClass.getValue()};
+    }
+    return {};
 }
 
 Array<CIMName> scriptProperties(CimScriptParser& parser, CIMClass& cimClass) {

@@ -39,6 +39,11 @@ SennetConverter::~SennetConverter() {
     }
 }
 
+void SennetConverter::shareRows(SennetConverter& other) {
+    sharedRows = std::make_shared<TableRows>();
+    other.sharedRows = sharedRows;
+}
+
 void SennetConverter::printOutput(CimScriptParser& parser, Array<CIMClass>& classes,
                                   CimInstanceLists& instanceLists) {
     if (holdsData(classes, instanceLists)) {
@@ -71,6 +76,18 @@ void SennetConverter::printTable(CimScriptParser& parser, Array<CIMClass>& class
     Output(header.getCString());
     ++nextGroupId;
 
+    if (sharedRows != nullptr && sharedRows->show(instanceLists)) {
+        for (const std::string& rows : sharedRows->take()) {
+            Output(rows.c_str());
+        }
+    } else {
+        printRows(parser, classes, instanceLists, style);
+    }
+    Output("\r\n   End Table\r\n");
+}
+
+void SennetConverter::printRows(CimScriptParser& parser, Array<CIMClass>& classes,
+                                CimInstanceLists& instanceLists, const TableStyle& style) {
     std::vector<ClassRows> cells;
     for (Uint32 k = 0; k < classes.size(); ++k) {
         cells.push_back({instanceLists.getInstanceList(static_cast<int>(k)), {}});
@@ -79,6 +96,9 @@ void SennetConverter::printTable(CimScriptParser& parser, Array<CIMClass>& class
             cells.back().columns.emplace_back(classes[k], names[i]);
         }
     }
+    if (sharedRows != nullptr) {
+        sharedRows->start(instanceLists);
+    }
     const Uint32 rows = largestListSize(instanceLists);
     for (Uint32 row = style.firstRowLast ? 1 : 0; row < rows; ++row) {
         printRow(cells, row, style);
@@ -86,7 +106,6 @@ void SennetConverter::printTable(CimScriptParser& parser, Array<CIMClass>& class
     if (style.firstRowLast) {
         printRow(cells, 0, style);
     }
-    Output("\r\n   End Table\r\n");
 }
 
 void SennetConverter::printRow(const std::vector<ClassRows>& classes, Uint32 rowIndex,
@@ -112,7 +131,11 @@ void SennetConverter::printRow(const std::vector<ClassRows>& classes, Uint32 row
         }
     }
     row.append("}\r\n");
-    Output(row.getCString());
+    const CString utf8 = row.getCString();
+    Output(utf8);
+    if (sharedRows != nullptr) {
+        sharedRows->add(static_cast<const char*>(utf8));
+    }
 }
 
 void SennetConverter::printClass(CimScriptParser& parser, Array<CIMClass>& classes,

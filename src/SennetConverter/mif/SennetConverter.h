@@ -4,8 +4,12 @@
 // instances a group (the template) and a table (one row per instance). What the importing products
 // want differently is in the subclasses.
 
+#include <memory>
+#include <vector>
+
 #include "SennetConverter/framework/CimConverter.h"
 #include "SennetConverter/mif/GroupAttributes.h"
+#include "SennetConverter/mif/TableRows.h"
 #include "SennetConverter/mif/ValueNames.h"
 
 namespace Pegasus {
@@ -23,6 +27,10 @@ class SennetConverter : public CimConverter {
     /// Writes group and table of one script; nothing when no class has an instance.
     void printOutput(CimScriptParser& parser, Array<CIMClass>& classes,
                      CimInstanceLists& instanceLists) override;
+
+    /// Has the rows of each table rendered once for this document and `other`, whose class must
+    /// render values as this one's does.
+    void shareRows(SennetConverter& other);
 
     /// Header of the group that describes instance n (0 or more), with its key attribute; before
     /// the file's first group the component's header too.
@@ -115,6 +123,8 @@ class SennetConverter : public CimConverter {
     struct ClassRows;
 
     String groupName(CimScriptParser& parser);
+    void printRows(CimScriptParser& parser, Array<CIMClass>& classes,
+                   CimInstanceLists& instanceLists, const TableStyle& style);
     void printRow(const std::vector<ClassRows>& classes, Uint32 rowIndex, const TableStyle& style);
     void printAttributes(CimScriptParser& parser, Array<CIMClass>& classes,
                          CimInstanceLists& instanceLists, unsigned int n, int blankValues,
@@ -127,6 +137,7 @@ class SennetConverter : public CimConverter {
     ValueNamesCache valueNames;
     // Kept from row to row for its capacity.
     String rowText;
+    std::shared_ptr<TableRows> sharedRows;
 };
 
 }  // namespace Pegasus

@@ -208,13 +208,13 @@ String SennetConverter::formatString(String text) {
 String SennetConverter::escape(const String& text, const char* escapedCharacters) {
     constexpr Uint32 kPiece = 256;
     Char16 piece[2 * kPiece];
-    bool isEscaped[128] = {};
-    for (const char* character = escapedCharacters; *character != '\0'; ++character) {
-        isEscaped[static_cast<unsigned char>(*character)] = true;
-    }
     const Char16* const data = text.getChar16Data();
     if (isPlain(data, text.size(), escapedCharacters)) {
         return text;
+    }
+    bool isEscaped[128] = {};
+    for (const char* character = escapedCharacters; *character != '\0'; ++character) {
+        isEscaped[static_cast<unsigned char>(*character)] = true;
     }
     String escaped;
     for (Uint32 begin = 0; begin < text.size(); begin += kPiece) {

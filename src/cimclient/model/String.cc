@@ -157,6 +157,11 @@ String& String::append(const Char16* text, Uint32 n) {
     if (n == 0)
         return *this;
     const Uint32 oldSize = size();
+    if (body && !body->isShared() && n <= body->capacity() - oldSize) {
+        std::copy_n(text, n, body->text() + oldSize);
+        body->setSize(oldSize + n);
+        return *this;
+    }
     if (n > kLargestSize - oldSize)
         throw std::bad_alloc();
     const Uint32 newSize = oldSize + n;

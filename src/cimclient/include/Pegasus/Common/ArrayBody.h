@@ -2,8 +2,8 @@
 #pragma once
 
 #include <Pegasus/Common/Config.h>
+#include <Pegasus/Common/HandleCount.h>
 
-#include <atomic>
 #include <cstddef>
 #include <memory>
 #include <new>
@@ -21,12 +21,12 @@ class ArrayBody {
         return new (memory) ArrayBody(capacity);
     }
 
-    void retain() noexcept { handles.fetch_add(1, std::memory_order_relaxed); }
+    void retain() noexcept { handles.increase(); }
     void release() noexcept {
-        if (handles.fetch_sub(1, std::memory_order_acq_rel) == 1)
+        if (handles.decrease())
             destroy();
     }
-    bool isShared() const noexcept { return handles.load(std::memory_order_acquire) != 1; }
+    bool isShared() const noexcept { return handles.isShared(); }
 
     T* elements() noexcept {
         return reinterpret_cast<T*>(reinterpret_cast<unsigned char*>(this) + offset());
@@ -50,7 +50,7 @@ class ArrayBody {
         ::operator delete(this);
     }
 
-    std::atomic<Uint32> handles{1};
+    HandleCount handles{1};
 };
 
 }  // namespace Pegasus

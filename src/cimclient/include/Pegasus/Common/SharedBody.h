@@ -1,9 +1,7 @@
 // What the handle classes share: a counted body.
 #pragma once
 
-#include <Pegasus/Common/Config.h>
-
-#include <atomic>
+#include <Pegasus/Common/HandleCount.h>
 
 namespace Pegasus {
 
@@ -16,17 +14,17 @@ class SharedBody {
     SharedBody& operator=(const SharedBody&) = delete;
     virtual ~SharedBody() = default;
 
-    void retain() const noexcept { handles.fetch_add(1, std::memory_order_relaxed); }
+    void retain() const noexcept { handles.increase(); }
     /// Deletes this body when the last handle lets go of it.
     void release() const noexcept {
-        if (handles.fetch_sub(1, std::memory_order_acq_rel) == 1)
+        if (handles.decrease())
             destroy();
     }
 
   private:
     void destroy() const noexcept;
 
-    mutable std::atomic<Uint32> handles{0};
+    mutable HandleCount handles{0};
 };
 
 }  // namespace Pegasus

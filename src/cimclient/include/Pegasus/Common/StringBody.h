@@ -3,8 +3,8 @@
 
 #include <Pegasus/Common/Char16.h>
 #include <Pegasus/Common/Config.h>
+#include <Pegasus/Common/HandleCount.h>
 
-#include <atomic>
 #include <cstddef>
 #include <new>
 
@@ -20,12 +20,12 @@ class StringBody {
         return new (memory) StringBody(capacity);
     }
 
-    void retain() noexcept { handles.fetch_add(1, std::memory_order_relaxed); }
+    void retain() noexcept { handles.increase(); }
     void release() noexcept {
-        if (handles.fetch_sub(1, std::memory_order_acq_rel) == 1)
+        if (handles.decrease())
             destroy();
     }
-    Boolean isShared() const noexcept { return handles.load(std::memory_order_acquire) != 1; }
+    Boolean isShared() const noexcept { return handles.isShared(); }
 
     Char16* text() noexcept { return reinterpret_cast<Char16*>(this + 1); }
     Uint32 size() const noexcept { return length; }
@@ -40,7 +40,7 @@ class StringBody {
     void destroy() noexcept;
     explicit StringBody(Uint32 capacity) noexcept : room(capacity) { setSize(0); }
 
-    std::atomic<Uint32> handles{1};
+    HandleCount handles{1};
     Uint32 length = 0;
     Uint32 room;
 };
