@@ -15,8 +15,8 @@ class PropertyBody;
 class CIMProperty;
 
 /// A handle that reads. Copies share one property. That of an instance which a server sent shows
-/// the property as it was sent, also after the instance was changed. Getters of a default-constructed handle raise
-/// UninitializedObjectException.
+/// the property as it was sent, also after the instance was changed. Getters of a
+/// default-constructed handle raise UninitializedObjectException.
 class CIMConstProperty {
   public:
     CIMConstProperty() = default;
