@@ -91,8 +91,8 @@ ElementText ElementReader::readText() {
     return collectText(first);
 }
 
-ElementText ElementReader::textOf(std::size_t index) {
-    const std::string_view text = tokenizer.texts()[index];
+ElementText ElementReader::takeText() {
+    const std::string_view text = tokenizer.takeText();
     elementOffset = tokenizer.offsetOf(text) - textTagSize;
     return {text, trimXmlSpace(text)};
 }

@@ -52,16 +52,16 @@ class ElementReader {
     ElementText readText();
 
     /// Reads the next child as a whole when its markup is that of `run`, an earlier child in this
-    /// place of the grammar; its texts are then textOf(0) and on. Otherwise false, and nothing
-    /// happens.
+    /// place of the grammar; its texts are then for takeText() to give. Otherwise false, and
+    /// nothing happens.
     bool readLike(const MarkupRun& run) {
         textTagSize = run.textTagSize;
         return tokenizer.readLike(run);
     }
-    std::size_t textCount() const { return tokenizer.texts().size(); }
-    /// A text inside the child that was read last; faults reported from now on are those of the
-    /// element that has it.
-    ElementText textOf(std::size_t index);
+    std::size_t textCount() const { return tokenizer.textCount(); }
+    /// The next of the textCount() texts inside the child that was read last. Faults reported from
+    /// now on are those of the element that has it.
+    ElementText takeText();
 
     /// Octets of the document read so far.
     std::uint64_t position() const { return tokenizer.position(); }

@@ -115,7 +115,7 @@ bool PathReader::readKnownKey(Array<CIMKeyBinding>& keys) {
     if (!reader.readLike(key.markup)) {
         return false;
     }
-    keys.append(makeKey(key.name, key.type, reader.textOf(0)));
+    keys.append(makeKey(key.name, key.type, reader.takeText()));
     return true;
 }
 

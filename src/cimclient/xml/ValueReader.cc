@@ -136,7 +136,7 @@ void ValueReader::packTexts(CIMType type, Boolean isArray, PropertyPacker& packe
     }
     dispatchCimType(type, [&]<typename T>(CimTypeTag<T>) {
         for (std::size_t i = 0; i < count; ++i) {
-            packText<T>(reader.textOf(i), packer);
+            packText<T>(reader.takeText(), packer);
         }
     });
 }

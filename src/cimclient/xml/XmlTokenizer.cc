@@ -119,6 +119,7 @@ bool XmlTokenizer::readLike(const MarkupRun& run) {
     // PROPERTY.ARRAY, VALUE.ARRAY, VALUE.
     constexpr std::size_t kDeepest = 3;
     currentTexts.clear();
+    nextText = 0;
     const std::string_view unread = view(pos, window.size());
     if (emptyElement || depth() + kDeepest > limits.depth || !unread.starts_with(run.before)) {
         return false;
@@ -130,7 +131,6 @@ bool XmlTokenizer::readLike(const MarkupRun& run) {
             return false;
         }
     }
-    decodeTexts();
     pos = static_cast<std::size_t>(end - window.data());
     return true;
 }
@@ -156,14 +156,14 @@ const char* XmlTokenizer::findTextsLike(const MarkupRun& run, const char* p) {
     }
 }
 
-void XmlTokenizer::decodeTexts() {
-    for (std::string_view& text : currentTexts) {
-        if (text.find('&') != std::string_view::npos) {
-            char* const begin = at(static_cast<std::size_t>(text.data() - window.data()));
-            const char* const end = decode(begin, begin + text.size(), XmlTextKind::Content);
-            text = text.substr(0, static_cast<std::size_t>(end - begin));
-        }
+std::string_view XmlTokenizer::takeText() {
+    const std::string_view text = currentTexts[nextText++];
+    if (text.find('&') == std::string_view::npos) {
+        return text;
     }
+    char* const begin = at(static_cast<std::size_t>(text.data() - window.data()));
+    const char* const end = decode(begin, begin + text.size(), XmlTextKind::Content);
+    return text.substr(0, static_cast<std::size_t>(end - begin));
 }
 
 std::string_view XmlTokenizer::readSince(std::uint64_t from) const {

@@ -58,12 +58,15 @@ class XmlTokenizer {
     Token nextHoldingText();
 
     /// Reads the next element when its markup is that of `run`, which was read in this place
-    /// before. Its texts are then in texts(), and the current token is its end. False, with nothing
-    /// read, when the octets differ or have not all arrived.
+    /// before. Its texts are then for takeText() to give, and the current token is its end. False,
+    /// with nothing read, when the octets differ or have not all arrived.
     bool readLike(const MarkupRun& run);
-    /// Valid until the next octet is read.
-    const std::vector<std::string_view>& texts() const { return currentTexts; }
-    /// Octets of the document before `text`, one of texts().
+    std::size_t textCount() const { return currentTexts.size(); }
+    /// The next of the textCount() texts, references replaced: each can be had once, so that what
+    /// is wrong with one is found after the earlier ones were looked at. Valid until the next octet
+    /// is read.
+    std::string_view takeText();
+    /// Octets of the document before `text`, which takeText() gave.
     std::uint64_t offsetOf(std::string_view text) const {
         return window.offsetOf(static_cast<std::size_t>(text.data() - window.data()));
     }
@@ -117,7 +120,6 @@ class XmlTokenizer {
 
     char* decode(char* begin, const char* end, XmlTextKind kind);
     const char* findTextsLike(const MarkupRun& run, const char* p);
-    void decodeTexts();
 
     bool more();
     bool available(std::size_t count) {
@@ -149,7 +151,9 @@ class XmlTokenizer {
     std::uint64_t declarationOffset = 0;
     std::string_view currentName;
     std::vector<Attribute> currentAttributes;
+    // Of readLike(), as they stand in the document, and which is next.
     std::vector<std::string_view> currentTexts;
+    std::size_t nextText = 0;
     // Up to where the window's octets may differ from the document's.
     std::uint64_t changedUpTo = 0;
     // The names of the open elements, one after the other, and where each begins.

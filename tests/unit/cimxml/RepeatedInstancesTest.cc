@@ -157,6 +157,15 @@ TEST(RepeatedInstances, SayWhichValueIsWrong) {
     EXPECT_EQ(message, outcome(good + good + wrong, kInPieces));
 }
 
+// All texts of an array are found before the first of them is looked at.
+TEST(RepeatedInstances, SayWhatIsWrongFirst) {
+    const std::string good = instanceXml(array("A", "uint8", {"1", "2"}));
+    const std::string wrong = instanceXml(array("A", "uint8", {"1", "256", "&none;"}));
+    const std::string message = outcome(good + good + wrong, kAtOnce);
+    EXPECT_NE(message.find("value \"256\" is no uint8"), std::string::npos) << message;
+    EXPECT_EQ(message, outcome(good + good + wrong, kInPieces));
+}
+
 TEST(RepeatedInstances, AreReadStrictly) {
     const std::string good = instanceXml(property("A", "string", "a") + array("B", "uint8", {"1"}));
     for (const char* value : {"a&b;", "a]]&gt;", "a]]>", "<b/>", "&#0;", "a\rb", "a\r\nb", "a>b",
