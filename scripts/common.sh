@@ -42,7 +42,9 @@ BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev lib
     libfmt-dev libmnl-dev libsystemd-dev)
 # shellcheck disable=SC2034
 TEST_PACKAGES=(libgtest-dev libgmock-dev rpm python3 mariadb-server postgresql-15 shellcheck
-    sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode)
+    sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode mandoc)
+# shellcheck disable=SC2034
+PACKAGING_PACKAGES=(dpkg-dev file fakeroot rpm lintian debootstrap pkg-config)
 # shellcheck disable=SC2034
 BENCHMARK_PACKAGES=(libexpat1-dev libbenchmark-dev python3)
 # shellcheck disable=SC2034
