@@ -9,6 +9,7 @@ import tempfile
 import unittest
 
 UNITS = None
+USERS = None
 # systemd-analyze grades from 0 (best) to 10; what is left is the network of the loopback and the
 # one capability.
 MAX_EXPOSURE = 2.5
@@ -39,6 +40,15 @@ class UnitsTest(unittest.TestCase):
         exposure = re.search(r"Overall exposure level for \S+: ([\d.]+)", result.stdout).group(1)
         self.assertLessEqual(float(exposure), MAX_EXPOSURE)
 
+    def test_the_user_of_the_service_is_made(self):
+        # The message bus turned a dynamic user away, and the table of services stayed empty.
+        self.assertIn("User=cimomd", (UNITS / "cimomd.service").read_text().splitlines())
+        users = pathlib.Path(self.directory.name) / "root"
+        (users / "etc").mkdir(parents=True)
+        subprocess.run(["systemd-sysusers", f"--root={users}", USERS], capture_output=True,
+                       check=True)
+        self.assertRegex((users / "etc" / "passwd").read_text(), r"(?m)^cimomd:x:\d+:\d+:")
+
     def test_the_hardening_that_was_promised_is_there(self):
         lines = (UNITS / "cimomd.service").read_text().splitlines()
         for line in ("ProtectSystem=strict", "NoNewPrivileges=yes",
@@ -50,6 +60,8 @@ class UnitsTest(unittest.TestCase):
 if __name__ == "__main__":
     parser = argparse.ArgumentParser()
     parser.add_argument("--units", type=pathlib.Path, required=True)
+    parser.add_argument("--users", type=pathlib.Path, required=True)
     known, rest = parser.parse_known_args()
     UNITS = known.units
+    USERS = known.users
     unittest.main(argv=[sys.argv[0], *rest])
