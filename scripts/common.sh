@@ -44,7 +44,7 @@ BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev lib
 TEST_PACKAGES=(libgtest-dev libgmock-dev rpm python3 mariadb-server postgresql-15 shellcheck
     sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode mandoc)
 # shellcheck disable=SC2034
-PACKAGING_PACKAGES=(dpkg-dev file fakeroot rpm lintian debootstrap pkg-config)
+PACKAGING_PACKAGES=(dpkg-dev file fakeroot rpm lintian debootstrap pkg-config systemd-container)
 # shellcheck disable=SC2034
 BENCHMARK_PACKAGES=(libexpat1-dev libbenchmark-dev python3)
 # shellcheck disable=SC2034
