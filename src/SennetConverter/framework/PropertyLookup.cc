@@ -16,8 +16,7 @@ ResolvedProperty PropertyLookup::in(const CIMInstance* instance) const {
     const Uint32 position = instance != nullptr ? instance->findProperty(name) : PEG_NOT_FOUND;
     if (position != PEG_NOT_FOUND) {
         const CIMConstProperty holder = instance->getProperty(position);
-        return {declared ? inClass : CIMInstance(*instance).getProperty(position), holder.getType(),
-                holder.getValue()};
+        return {declared ? inClass : holder.clone(), holder.getType(), holder.getValue()};
     }
     if (declared) {
         return {inClass, inClass.getType(), inClass.getValue()};

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <type_traits>
+#include <utility>
 
 namespace Pegasus {
 namespace {
@@ -25,6 +26,19 @@ TEST(CIMPropertyTest, GivesWhatItIsMadeOf) {
     EXPECT_EQ(full.getReferenceClassName().getString(), "Target");
     EXPECT_EQ(full.getClassOrigin().getString(), "Origin");
     EXPECT_TRUE(full.getPropagated());
+}
+
+// What is asked of a copy that nobody holds is a copy, too: a reference would outlive it.
+TEST(CIMPropertyTest, GivesNamesThatMayBeReferredTo) {
+    using OfProperty = decltype(std::declval<CIMConstProperty>().getName().getString());
+    using OfName = decltype(std::declval<const CIMName&>().getString());
+    static_assert(std::is_same_v<OfProperty, String>);
+    static_assert(std::is_same_v<OfName, const String&>);
+    const CIMProperty property("Name", CIMValue(String("x")), 0, CIMName(), "Origin");
+    const String& name = property.getName().getString();
+    const String& origin = property.getClassOrigin().getString();
+    EXPECT_EQ(name, "Name");
+    EXPECT_EQ(origin, "Origin");
 }
 
 TEST(CIMPropertyTest, KeepsItsType) {

@@ -16,8 +16,10 @@ class CIMName {
 
     static Boolean legal(const String& name);
 
-    /// Empty when null.
-    const String& getString() const { return name; }
+    /// Empty when null. Of a name that somebody holds it is the name's own text; of one that a
+    /// function just returned, a copy, which a reference to it keeps alive.
+    const String& getString() const& { return name; }
+    String getString() const&& { return name; }
     Boolean isNull() const { return name.size() == 0; }
     void clear();
     /// Ignores the case of ASCII letters.
