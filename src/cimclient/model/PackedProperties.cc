@@ -2,6 +2,8 @@
 
 #include <Pegasus/Common/Exception.h>
 
+#include <algorithm>
+
 #include "CimTypeDispatch.h"
 
 namespace Pegasus {
@@ -129,8 +131,10 @@ BodyRef<PackedProperties> PropertyPacker::finish(std::shared_ptr<const InstanceS
     std::unique_ptr<char[]> octets(new char[head + values.size()]);
     for (Uint32& begin : starts)
         begin = begin == kNull ? 0 : head + begin;
-    std::memcpy(octets.get(), starts.data(), head);
-    std::memcpy(octets.get() + head, values.data(), values.size());
+    // Without properties there is nothing at starts.data(), not even for memcpy() to copy none of.
+    char* const behindHead =
+        std::copy_n(reinterpret_cast<const char*>(starts.data()), head, octets.get());
+    std::copy(values.begin(), values.end(), behindHead);
     start();
     return BodyRef<PackedProperties>(new PackedProperties(std::move(shape), std::move(octets)));
 }
