@@ -98,6 +98,29 @@ TEST_F(CaSennetConverterTest, NumbersGroupsThroughTheWholeFile) {
                              "End Component\n"));
 }
 
+// The groups of a script have their attributes in common but for what the instances decide.
+TEST_F(CaSennetConverterTest, TypesEachGroupByItsOwnInstance) {
+    expectUnreadable("24:4: Group unlike the earlier one of its class");
+    const CIMClass described = cimClass("CIM_X", {property("P", null(CIMTYPE_UINT16))});
+    const auto having = [](const CIMValue& value) {
+        return cimInstance("CIM_X", {property("P", value)});
+    };
+    const Answer answer{described,
+                        {having(CIMValue(Uint16(5))), having(text("word")),
+                         having(CIMValue(arrayOf<Uint16>({1, 2}))), having(CIMValue(Uint16(6))),
+                         cimInstance("CIM_X", {}), having(CIMValue(arrayOf<Uint16>({3})))}};
+    EXPECT_EQ(
+        convert<CaSennetConverter>("[DEFAULT]\ntitle=T\n[CIM]\nG[0]=CIM_X\nA[0]=P\n", {answer}),
+        crlf(kComponent +  //
+             groupHead("T", 2, 1) + attribute("P", 2, "Integer", "5") + "   End Group\n" +
+             groupHead("T", 3, 2) + attribute("P", 2, "String(20)", "\"word\"") + "   End Group\n" +
+             groupHead("T", 4, 3) + attribute("P", 2, "String(255)", "\"1,2\"") + "   End Group\n" +
+             groupHead("T", 5, 4) + attribute("P", 2, "Integer", "6") + "   End Group\n" +
+             groupHead("T", 6, 5) + attribute("P", 2, "Integer", "0") + "   End Group\n" +
+             groupHead("T", 7, 6) + attribute("P", 2, "String(255)", "\"3\"") + "   End Group\n" +
+             "End Component\n"));
+}
+
 TEST_F(CaSennetConverterTest, WritesNothingWithoutInstances) {
     support::writeFile(path("out.mif"), "stale");
     Inventory none({{fanClass, {}}, {portClass, {}}});
