@@ -8,7 +8,7 @@
 #include <string>
 #include <string_view>
 
-#include "support/mif/MifReader.h"
+#include "mifreader/MifReader.h"
 
 namespace {
 

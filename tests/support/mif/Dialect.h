@@ -3,7 +3,7 @@
 // Where the files of each product leave the grammar whatever the inventory holds. What single
 // classes add to that is for the tests of these files to name.
 
-#include "support/mif/Tolerance.h"
+#include "mifreader/Tolerance.h"
 
 namespace Mif {
 

@@ -10,7 +10,7 @@
 #include <string>
 #include <vector>
 
-#include "support/mif/MifReader.h"
+#include "mifreader/MifReader.h"
 
 namespace {
 

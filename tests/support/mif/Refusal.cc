@@ -1,7 +1,7 @@
 #include "support/mif/Refusal.h"
 
-#include "support/mif/Error.h"
-#include "support/mif/MifReader.h"
+#include "mifreader/Error.h"
+#include "mifreader/MifReader.h"
 
 namespace Mif {
 

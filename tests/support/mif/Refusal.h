@@ -5,7 +5,7 @@
 #include <string>
 #include <string_view>
 
-#include "support/mif/Tolerance.h"
+#include "mifreader/Tolerance.h"
 
 namespace Mif {
 

@@ -9,7 +9,7 @@
 #include <vector>
 
 #include "ConverterFixture.h"
-#include "support/mif/Tolerance.h"
+#include "mifreader/Tolerance.h"
 
 namespace generatortest {
 

@@ -1,6 +1,6 @@
 // Tokens: blanks, comments, integers, literals with their escapes, and what is none of them.
 
-#include "support/mif/Lexer.h"
+#include "mifreader/Lexer.h"
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,6 @@
 // Whole files: what is read from good ones, and where exactly bad ones are refused.
 
-#include "support/mif/MifReader.h"
+#include "mifreader/MifReader.h"
 
 #include <gtest/gtest.h>
 

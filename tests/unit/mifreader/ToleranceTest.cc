@@ -1,6 +1,6 @@
 // The names of the tolerances, and sets of them.
 
-#include "support/mif/Tolerance.h"
+#include "mifreader/Tolerance.h"
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,6 @@
 // Values against types: ranges of integers, lengths of literals, dates, and the tolerances.
 
-#include "support/mif/ValueChecker.h"
+#include "mifreader/ValueChecker.h"
 
 #include <gtest/gtest.h>
 

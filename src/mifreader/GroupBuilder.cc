@@ -1,4 +1,4 @@
-#include "support/mif/GroupBuilder.h"
+#include "mifreader/GroupBuilder.h"
 
 #include <algorithm>
 #include <utility>

@@ -1,4 +1,4 @@
-#include "support/mif/Tolerance.h"
+#include "mifreader/Tolerance.h"
 
 #include <utility>
 

@@ -1,4 +1,4 @@
-#include "support/mif/ValueChecker.h"
+#include "mifreader/ValueChecker.h"
 
 #include <limits>
 #include <string_view>

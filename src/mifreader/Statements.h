@@ -5,7 +5,7 @@
 #include <map>
 #include <string>
 
-#include "support/mif/Error.h"
+#include "mifreader/Error.h"
 
 namespace Mif {
 

@@ -7,8 +7,8 @@
 #include <string>
 #include <vector>
 
-#include "support/mif/Document.h"
-#include "support/mif/Tolerance.h"
+#include "mifreader/Document.h"
+#include "mifreader/Tolerance.h"
 
 namespace Mif {
 

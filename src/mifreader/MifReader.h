@@ -6,8 +6,8 @@
 
 #include <string_view>
 
-#include "support/mif/Document.h"
-#include "support/mif/Tolerance.h"
+#include "mifreader/Document.h"
+#include "mifreader/Tolerance.h"
 
 namespace Mif {
 

@@ -7,8 +7,8 @@
 #include <string>
 #include <string_view>
 
-#include "support/mif/Error.h"
-#include "support/mif/Tolerance.h"
+#include "mifreader/Error.h"
+#include "mifreader/Tolerance.h"
 
 namespace Mif {
 

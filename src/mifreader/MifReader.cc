@@ -1,6 +1,6 @@
-#include "support/mif/MifReader.h"
+#include "mifreader/MifReader.h"
 
-#include "support/mif/Parser.h"
+#include "mifreader/Parser.h"
 
 namespace Mif {
 

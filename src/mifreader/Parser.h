@@ -9,12 +9,12 @@
 #include <string_view>
 #include <vector>
 
-#include "support/mif/Document.h"
-#include "support/mif/GroupBuilder.h"
-#include "support/mif/Lexer.h"
-#include "support/mif/Statements.h"
-#include "support/mif/Tolerance.h"
-#include "support/mif/ValueChecker.h"
+#include "mifreader/Document.h"
+#include "mifreader/GroupBuilder.h"
+#include "mifreader/Lexer.h"
+#include "mifreader/Statements.h"
+#include "mifreader/Tolerance.h"
+#include "mifreader/ValueChecker.h"
 
 namespace Mif {
 

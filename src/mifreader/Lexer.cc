@@ -1,4 +1,4 @@
-#include "support/mif/Lexer.h"
+#include "mifreader/Lexer.h"
 
 #include <cstdio>
 #include <limits>

@@ -2,8 +2,8 @@
 
 // Checks values against the type of their attribute.
 
-#include "support/mif/Document.h"
-#include "support/mif/Tolerance.h"
+#include "mifreader/Document.h"
+#include "mifreader/Tolerance.h"
 
 namespace Mif {
 

@@ -1,4 +1,4 @@
-#include "support/mif/Parser.h"
+#include "mifreader/Parser.h"
 
 #include <algorithm>
 #include <utility>

@@ -8,7 +8,7 @@
 #include <string>
 #include <vector>
 
-#include "support/mif/Error.h"
+#include "mifreader/Error.h"
 
 namespace Mif {
 
