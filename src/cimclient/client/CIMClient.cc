@@ -36,4 +36,9 @@ Array<CIMInstance> CIMClient::enumerateInstances(const CIMNamespaceName& nameSpa
                                    includeQualifiers, includeClassOrigin, propertyList);
 }
 
+Array<CIMName> CIMClient::enumerateClassNames(const CIMNamespaceName& nameSpace,
+                                              const CIMName& className, Boolean deepInheritance) {
+    return rep->enumerateClassNames(nameSpace, className, deepInheritance);
+}
+
 }  // namespace Pegasus

@@ -216,4 +216,14 @@ Array<CIMInstance> CIMClientRep::enumerateInstances(const CIMNamespaceName& name
         [&](ByteSource& source) { return decodeEnumerateInstancesResponse(source, id); });
 }
 
+Array<CIMName> CIMClientRep::enumerateClassNames(const CIMNamespaceName& nameSpace,
+                                                 const CIMName& className,
+                                                 Boolean deepInheritance) {
+    const std::string id = nextMessageId();
+    return perform(
+        "EnumerateClassNames", nameSpace,
+        encodeEnumerateClassNamesRequest(id, nameSpace, className, deepInheritance),
+        [&](ByteSource& source) { return decodeEnumerateClassNamesResponse(source, id); });
+}
+
 }  // namespace Pegasus

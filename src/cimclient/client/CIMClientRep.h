@@ -30,6 +30,8 @@ class CIMClientRep {
                                           Boolean localOnly, Boolean includeQualifiers,
                                           Boolean includeClassOrigin,
                                           const CIMPropertyList& propertyList);
+    Array<CIMName> enumerateClassNames(const CIMNamespaceName& nameSpace, const CIMName& className,
+                                       Boolean deepInheritance);
 
   private:
     /// Closes the connection at its end unless told to keep it.

@@ -42,6 +42,35 @@ bool isServerSocket(const std::string& path) {
            isTrusted(status.st_uid);
 }
 
+std::optional<uid_t> ownerOf(const std::string& path) {
+    struct stat status {};
+    return ::lstat(path.c_str(), &status) == 0 ? std::optional<uid_t>(status.st_uid) : std::nullopt;
+}
+
+// Why a path of a known place is passed over.
+std::string reasonToSkip(const std::string& path) {
+    struct stat status {};
+    if (::lstat(path.c_str(), &status) != 0) {
+        return errno == ENOENT ? "not there" : std::generic_category().message(errno);
+    }
+    return S_ISSOCK(status.st_mode) ? "belongs neither to root nor to this user" : "is no socket";
+}
+
+// Notes what becomes of each place, if anybody wants to know.
+class SearchLog {
+  public:
+    explicit SearchLog(std::vector<TriedPlace>* tried) : tried(tried) {}
+
+    void add(const std::string& path, const std::string& result, bool chosen = false) const {
+        if (tried != nullptr) {
+            tried->push_back({path, ownerOf(path), result, chosen});
+        }
+    }
+
+  private:
+    std::vector<TriedPlace>* tried;
+};
+
 // Connects to one socket. Without success the connection is not open and `reason` says why.
 ServerConnection connectTo(const std::string& path, FinalLink finalLink, const Deadline& deadline,
                            std::string& reason) {
@@ -62,10 +91,13 @@ ServerConnection connectTo(const std::string& path, FinalLink finalLink, const D
     return {nullptr, std::move(result.socket), *user};
 }
 
-ServerConnection connectToNamedSocket(const std::string& path, const Deadline& deadline) {
+ServerConnection connectToNamedSocket(const std::string& path, const Deadline& deadline,
+                                      const SearchLog& log) {
     std::string reason;
     ServerConnection connection = connectTo(path, FinalLink::Follow, deadline, reason);
-    if (!connection.socket.isOpen()) {
+    const bool connected = connection.socket.isOpen();
+    log.add(path, connected ? "connected; CIM_LOCAL_SOCKET names it" : reason, connected);
+    if (!connected) {
         throw CannotConnectException(printableText("Cannot connect to CIM server: " + reason));
     }
     return connection;
@@ -84,7 +116,8 @@ std::string embeddedProgram(const ServerPlaces& places) {
     return *found;
 }
 
-ServerConnection startServer(const ServerPlaces& places, const Deadline& deadline) {
+ServerConnection startServer(const ServerPlaces& places, const Deadline& deadline,
+                             const SearchLog& log) {
     if (environmentText("CIM_EMBEDDED") == "never") {
         throw CannotConnectException("No CIM server on this machine, and CIM_EMBEDDED is never");
     }
@@ -97,37 +130,44 @@ ServerConnection startServer(const ServerPlaces& places, const Deadline& deadlin
     FileDescriptor ownEnd(ends[0]);
     FileDescriptor childEnd(ends[1]);
     auto child = std::make_unique<ChildProcess>(program, std::move(childEnd), deadline);
+    log.add(program, "started for this connection, for no CIM server is installed", true);
     return {std::move(child), std::move(ownEnd), ::geteuid()};
 }
 
 }  // namespace
 
-ServerConnection connectToLocalServer(const ServerPlaces& places, const Deadline& deadline) {
+ServerConnection connectToLocalServer(const ServerPlaces& places, const Deadline& deadline,
+                                      std::vector<TriedPlace>* tried) {
+    const SearchLog log(tried);
     const std::string named = environmentText("CIM_LOCAL_SOCKET");
     if (!named.empty()) {
-        return connectToNamedSocket(named, deadline);
+        return connectToNamedSocket(named, deadline, log);
     }
     std::string reasons;
     for (const std::string& path : places.sockets) {
         if (!isServerSocket(path)) {
+            log.add(path, reasonToSkip(path));
             continue;
         }
         std::string reason;
         ServerConnection connection = connectTo(path, FinalLink::Refuse, deadline, reason);
         if (connection.socket.isOpen()) {
+            log.add(path, "connected", true);
             return connection;
         }
+        log.add(path, reason);
         reasons += (reasons.empty() ? "" : "; ") + reason;
     }
     for (const std::string& program : places.programs) {
         if (reasons.empty() && programExists(program)) {
             reasons = program + " is installed but listens nowhere";
+            log.add(program, "is installed but listens nowhere, so no other server is started");
         }
     }
     if (!reasons.empty()) {
         throw CannotConnectException(printableText("Cannot connect to CIM server: " + reasons));
     }
-    return startServer(places, deadline);
+    return startServer(places, deadline, log);
 }
 
 }  // namespace Pegasus

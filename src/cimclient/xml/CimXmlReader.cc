@@ -1,6 +1,7 @@
 #include "xml/CimXmlReader.h"
 
 #include "xml/ObjectReader.h"
+#include "xml/PathReader.h"
 #include "xml/ResponseReader.h"
 
 namespace Pegasus {
@@ -33,6 +34,22 @@ Array<CIMInstance> decodeEnumerateInstancesResponse(ByteSource& source,
         }
     });
     return instances;
+}
+
+Array<CIMName> decodeEnumerateClassNamesResponse(ByteSource& source, const std::string& messageId) {
+    ResponseReader response(source);
+    ElementReader& reader = response.elements();
+    PathReader paths(reader, response.decodeContext());
+    Array<CIMName> names;
+    response.read(messageId, "EnumerateClassNames", [&] {
+        while (reader.nextChild()) {
+            if (!reader.is("CLASSNAME")) {
+                reader.failUnexpected("CLASSNAME");
+            }
+            names.append(paths.readClassName());
+        }
+    });
+    return names;
 }
 
 }  // namespace Pegasus

@@ -8,6 +8,7 @@
 #include <Pegasus/Common/Array.h>
 #include <Pegasus/Common/CIMClass.h>
 #include <Pegasus/Common/CIMInstance.h>
+#include <Pegasus/Common/CIMName.h>
 
 #include <string>
 
@@ -29,5 +30,9 @@ CIMClass decodeGetClassResponse(ByteSource& source, const std::string& messageId
 /// One faulty instance fails the whole answer. Throws as decodeGetClassResponse does.
 Array<CIMInstance> decodeEnumerateInstancesResponse(ByteSource& source,
                                                     const std::string& messageId);
+
+/// Reads the answer to EnumerateClassNames up to the end of `source`: the names in the order of the
+/// answer. Throws as decodeGetClassResponse does.
+Array<CIMName> decodeEnumerateClassNamesResponse(ByteSource& source, const std::string& messageId);
 
 }  // namespace Pegasus

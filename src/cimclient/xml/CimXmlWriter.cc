@@ -46,6 +46,9 @@ void beginCall(std::string& xml, std::string_view messageId, std::string_view me
     appendAttribute(xml, "NAME", method);
     xml += '>';
     appendLocalNamespacePath(xml, nameSpace);
+    if (className.isNull()) {
+        return;
+    }
     xml += "<IPARAMVALUE NAME=\"ClassName\">";
     appendClassName(xml, className);
     xml += "</IPARAMVALUE>";
@@ -89,6 +92,16 @@ std::string encodeEnumerateInstancesRequest(std::string_view messageId,
     appendFlagParameter(xml, "IncludeQualifiers", includeQualifiers);
     appendFlagParameter(xml, "IncludeClassOrigin", includeClassOrigin);
     appendListParameter(xml, propertyList);
+    endCall(xml);
+    return xml;
+}
+
+std::string encodeEnumerateClassNamesRequest(std::string_view messageId,
+                                             const CIMNamespaceName& nameSpace,
+                                             const CIMName& className, Boolean deepInheritance) {
+    std::string xml;
+    beginCall(xml, messageId, "EnumerateClassNames", nameSpace, className);
+    appendFlagParameter(xml, "DeepInheritance", deepInheritance);
     endCall(xml);
     return xml;
 }

@@ -33,6 +33,11 @@ std::string encodeEnumerateInstancesRequest(std::string_view messageId,
                                             Boolean includeClassOrigin,
                                             const CIMPropertyList& propertyList);
 
+/// The body of an EnumerateClassNames request. A null class name, for all classes, is left out.
+std::string encodeEnumerateClassNamesRequest(std::string_view messageId,
+                                             const CIMNamespaceName& nameSpace,
+                                             const CIMName& className, Boolean deepInheritance);
+
 /// Whether a call is an operation of DSP0200 or a method that a class declares.
 enum class CallKind { Intrinsic, Extrinsic };
 

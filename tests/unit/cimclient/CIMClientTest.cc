@@ -313,5 +313,26 @@ TEST_F(CIMClientTest, TwoClientsDoNotDisturbEachOther) {
     thread.join();
 }
 
+TEST_F(CIMClientTest, NamesTheClassesOfANamespace) {
+    server.onNext(Reply::ok("<CLASSNAME NAME=\"CIM_Fan\"/><CLASSNAME NAME=\"CIM_Card\"/>"));
+    client.connectLocal();
+    const Array<CIMName> names = client.enumerateClassNames(kNamespace, CIMName(), true);
+    ASSERT_EQ(names.size(), 2U);
+    EXPECT_TRUE(names[0].equal(CIMName("CIM_Fan")));
+    EXPECT_TRUE(names[1].equal(CIMName("CIM_Card")));
+    const std::string body = server.requests().at(0).body;
+    EXPECT_NE(body.find("<IMETHODCALL NAME=\"EnumerateClassNames\">"), std::string::npos);
+    EXPECT_NE(body.find("NAME=\"DeepInheritance\"><VALUE>TRUE<"), std::string::npos);
+    EXPECT_EQ(body.find("\"ClassName\""), std::string::npos);
+}
+
+TEST_F(CIMClientTest, NamesTheSubclassesOfAClass) {
+    server.onNext(Reply::ok(""));
+    client.connectLocal();
+    EXPECT_EQ(client.enumerateClassNames(kNamespace, CIMName("CIM_Fan")).size(), 0U);
+    EXPECT_NE(server.requests().at(0).body.find("<CLASSNAME NAME=\"CIM_Fan\"/>"),
+              std::string::npos);
+}
+
 }  // namespace
 }  // namespace Pegasus

@@ -117,6 +117,36 @@ TEST_F(LocalConnectorTest, TheNamedSocketIsTheOnlyOne) {
     EXPECT_EQ(known.connectionCount(), 0U);
 }
 
+TEST_F(LocalConnectorTest, TellsEachPlaceThatItTried) {
+    FakeCimServer server;
+    const std::string stale = directory.path("stale");
+    leaveStaleSocket(stale);
+    places.sockets = {directory.path("none"), directory.write("file", ""), stale,
+                      server.socketPath(), directory.path("beyond")};
+    std::vector<TriedPlace> tried;
+    connectToLocalServer(places, Deadline(5000), &tried);
+    ASSERT_EQ(tried.size(), 4U);
+    EXPECT_EQ(tried[0].path, directory.path("none"));
+    EXPECT_EQ(tried[0].result, "not there");
+    EXPECT_EQ(tried[0].owner, std::nullopt);
+    EXPECT_EQ(tried[1].result, "is no socket");
+    EXPECT_EQ(tried[1].owner, geteuid());
+    EXPECT_EQ(tried[2].result, stale + ": Connection refused");
+    EXPECT_FALSE(tried[2].chosen);
+    EXPECT_EQ(tried[3].path, server.socketPath());
+    EXPECT_EQ(tried[3].result, "connected");
+    EXPECT_TRUE(tried[3].chosen);
+}
+
+TEST_F(LocalConnectorTest, TellsWhatItTriedBeforeItGaveUp) {
+    const ScopedEnvironment name("CIM_LOCAL_SOCKET", directory.path("none"));
+    std::vector<TriedPlace> tried;
+    EXPECT_THROW(connectToLocalServer(places, Deadline(5000), &tried), CannotConnectException);
+    ASSERT_EQ(tried.size(), 1U);
+    EXPECT_EQ(tried[0].result, directory.path("none") + ": No such file or directory");
+    EXPECT_FALSE(tried[0].chosen);
+}
+
 TEST_F(LocalConnectorTest, AnEmptyNameIsNoName) {
     FakeCimServer known;
     places.sockets = {known.socketPath()};

@@ -87,6 +87,13 @@ class CIMClient {
                                           Boolean includeClassOrigin = false,
                                           const CIMPropertyList& propertyList = CIMPropertyList());
 
+    /// The names of the subclasses of a class, or with a null name of the classes that have no
+    /// superclass; with deepInheritance also those of all classes below (EnumerateClassNames of
+    /// DSP0200).
+    Array<CIMName> enumerateClassNames(const CIMNamespaceName& nameSpace,
+                                       const CIMName& className = CIMName(),
+                                       Boolean deepInheritance = false);
+
   private:
     std::unique_ptr<CIMClientRep> rep;
 };
