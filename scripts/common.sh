@@ -39,7 +39,7 @@ need_packages() {
 
 # shellcheck disable=SC2034
 BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev libcli11-dev
-    libfmt-dev libmnl-dev libsystemd-dev)
+    libfmt-dev libmnl-dev libsystemd-dev nlohmann-json3-dev)
 # shellcheck disable=SC2034
 TEST_PACKAGES=(libgtest-dev libgmock-dev rpm python3 mariadb-server postgresql-15 shellcheck
     sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode mandoc)

@@ -80,12 +80,12 @@ ServerConnection connectTo(const std::string& path, FinalLink finalLink, const D
             printableText("Cannot connect to " + path + " within the time-out"));
     }
     if (result.error != 0) {
-        reason = path + ": " + std::generic_category().message(result.error);
+        reason = std::generic_category().message(result.error);
         return {};
     }
     const std::optional<uid_t> user = peerUserOf(result.socket);
     if (!user.has_value() || !isTrusted(*user)) {
-        reason = path + ": its server runs neither as root nor as this user";
+        reason = "its server runs neither as root nor as this user";
         return {};
     }
     return {nullptr, std::move(result.socket), *user};
@@ -96,9 +96,10 @@ ServerConnection connectToNamedSocket(const std::string& path, const Deadline& d
     std::string reason;
     ServerConnection connection = connectTo(path, FinalLink::Follow, deadline, reason);
     const bool connected = connection.socket.isOpen();
-    log.add(path, connected ? "connected; CIM_LOCAL_SOCKET names it" : reason, connected);
+    log.add(path, connected ? "connected" : reason, connected);
     if (!connected) {
-        throw CannotConnectException(printableText("Cannot connect to CIM server: " + reason));
+        throw CannotConnectException(
+            printableText("Cannot connect to CIM server: " + path + ": " + reason));
     }
     return connection;
 }
@@ -156,7 +157,7 @@ ServerConnection connectToLocalServer(const ServerPlaces& places, const Deadline
             return connection;
         }
         log.add(path, reason);
-        reasons += (reasons.empty() ? "" : "; ") + reason;
+        reasons += (reasons.empty() ? "" : "; ") + path + ": " + reason;
     }
     for (const std::string& program : places.programs) {
         if (reasons.empty() && programExists(program)) {

@@ -131,7 +131,7 @@ TEST_F(LocalConnectorTest, TellsEachPlaceThatItTried) {
     EXPECT_EQ(tried[0].owner, std::nullopt);
     EXPECT_EQ(tried[1].result, "is no socket");
     EXPECT_EQ(tried[1].owner, geteuid());
-    EXPECT_EQ(tried[2].result, stale + ": Connection refused");
+    EXPECT_EQ(tried[2].result, "Connection refused");
     EXPECT_FALSE(tried[2].chosen);
     EXPECT_EQ(tried[3].path, server.socketPath());
     EXPECT_EQ(tried[3].result, "connected");
@@ -143,7 +143,7 @@ TEST_F(LocalConnectorTest, TellsWhatItTriedBeforeItGaveUp) {
     std::vector<TriedPlace> tried;
     EXPECT_THROW(connectToLocalServer(places, Deadline(5000), &tried), CannotConnectException);
     ASSERT_EQ(tried.size(), 1U);
-    EXPECT_EQ(tried[0].result, directory.path("none") + ": No such file or directory");
+    EXPECT_EQ(tried[0].result, "No such file or directory");
     EXPECT_FALSE(tried[0].chosen);
 }
 

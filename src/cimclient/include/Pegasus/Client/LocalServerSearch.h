@@ -13,7 +13,7 @@ namespace Pegasus {
 struct LocalServerPlace {
     std::string path;               ///< a socket, or a program that is started
     std::optional<unsigned> owner;  ///< user number of what stands there; none when nothing does
-    std::string result;             ///< what became of it; may name the path, as raw as it is
+    std::string result;             ///< what became of it, for people
     bool chosen = false;            ///< this is the server that connectLocal reaches
 };
 

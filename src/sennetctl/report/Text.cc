@@ -1,0 +1,57 @@
+#include "report/Text.h"
+
+#include "utf8/Utf8.h"
+
+namespace sennetctl {
+
+std::string printable(std::string_view text) {
+    std::string clean = utf8::clean(text);
+    for (char& c : clean) {
+        const auto code = static_cast<unsigned char>(c);
+        if (code < ' ' || code == 0x7F) {
+            c = ' ';
+        }
+    }
+    // The second set of control characters, U+0080 to U+009F, moves the cursor, too.
+    for (std::size_t i = 0; i + 1 < clean.size(); ++i) {
+        if (clean[i] == '\xC2' && static_cast<unsigned char>(clean[i + 1]) < 0xA0) {
+            clean.replace(i, 2, " ");
+        }
+    }
+    return clean;
+}
+
+std::size_t widthOf(std::string_view text) {
+    std::size_t width = 0;
+    for (const char c : text) {
+        width += utf8::isContinuation(c) ? 0 : 1;
+    }
+    return width;
+}
+
+std::string shortened(std::string_view text, std::size_t width) {
+    if (width == 0 || widthOf(text) <= width) {
+        return std::string(text);
+    }
+    std::size_t end = 0;
+    for (std::size_t characters = 0; characters + 1 < width; ++characters) {
+        end += utf8::characterLength(text.substr(end));
+    }
+    return std::string(text.substr(0, end)) + "…";
+}
+
+std::string fromLatin1(std::string_view octets) {
+    std::string text;
+    for (const char c : octets) {
+        utf8::append(text, static_cast<unsigned char>(c));
+    }
+    return text;
+}
+
+std::string counted(std::size_t count, std::string_view noun) {
+    std::string text = std::to_string(count) + " ";
+    text += noun;
+    return count == 1 ? text : text + "s";
+}
+
+}  // namespace sennetctl

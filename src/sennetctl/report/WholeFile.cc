@@ -1,0 +1,39 @@
+#include "report/WholeFile.h"
+
+#include <cerrno>
+#include <filesystem>
+#include <fstream>
+#include <system_error>
+
+namespace sennetctl {
+
+std::string readWholeFile(const std::string& path, std::size_t limitOctets) {
+    std::error_code error;
+    const std::filesystem::file_status status = std::filesystem::status(path, error);
+    if (status.type() == std::filesystem::file_type::not_found) {
+        throw CannotRun(path + ": there is no such file");
+    }
+    // A pipe or a terminal would keep the command waiting.
+    if (!error && status.type() != std::filesystem::file_type::regular) {
+        throw CannotRun(path + ": is no regular file");
+    }
+    std::ifstream file(path, std::ios::binary);
+    if (!file) {
+        throw CannotRun(path + ": " + std::generic_category().message(errno));
+    }
+    std::string octets;
+    char piece[64 * 1024];
+    while (file.read(piece, sizeof piece) || file.gcount() > 0) {
+        octets.append(piece, static_cast<std::size_t>(file.gcount()));
+        if (octets.size() > limitOctets) {
+            throw CannotRun(path + ": is larger than " + std::to_string(limitOctets >> 20) +
+                            " MiB");
+        }
+    }
+    if (file.bad()) {
+        throw CannotRun(path + ": cannot be read to its end");
+    }
+    return octets;
+}
+
+}  // namespace sennetctl

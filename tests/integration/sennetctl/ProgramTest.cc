@@ -1,0 +1,93 @@
+// The program itself: its command line and its exit statuses, with the object manager of this
+// project on a recorded machine.
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include "support/RunProgram.h"
+#include "support/TempDirectory.h"
+
+namespace {
+
+using support::ProgramResult;
+using ::testing::HasSubstr;
+using ::testing::IsEmpty;
+
+class ProgramTest : public testing::Test {
+  protected:
+    /// The object manager starts as the program's child, on the recorded laptop.
+    ProgramResult run(const std::vector<std::string>& arguments) const {
+        return support::runProgram(TEST_BIN_DIR "/sennetctl", arguments,
+                                   {{"CIM_COMMAND", command}});
+    }
+
+    ProgramResult runWithoutServer(const std::vector<std::string>& arguments) const {
+        return support::runProgram(TEST_BIN_DIR "/sennetctl", arguments,
+                                   {{"CIM_LOCAL_SOCKET", directory.path("none")}});
+    }
+
+    support::TempDirectory directory;
+
+  private:
+    std::string makeCommand() const {
+        const std::string path = directory.write(
+            "cimomd-on-laptop", "#!/bin/sh\nexec " TEST_BIN_DIR "/cimomd --root " TEST_SOURCE_DIR
+                                "/machines/laptop \"$@\"\n");
+        std::filesystem::permissions(path, std::filesystem::perms::owner_all);
+        return path;
+    }
+
+    std::string command = makeCommand();
+};
+
+TEST_F(ProgramTest, HelpHasExamplesOnEveryLevel) {
+    for (const std::vector<std::string>& arguments : std::vector<std::vector<std::string>>{
+             {"--help"}, {"server", "--help"}, {"get", "--help"}}) {
+        const ProgramResult result = runWithoutServer(arguments);
+        EXPECT_EQ(result.exitStatus, 0);
+        EXPECT_THAT(result.out, HasSubstr("Examples:\n  sennetctl "));
+        EXPECT_THAT(result.err, IsEmpty());
+    }
+}
+
+TEST_F(ProgramTest, AWrongCommandLineCannotRun) {
+    EXPECT_EQ(runWithoutServer({}).exitStatus, 2);
+    EXPECT_EQ(runWithoutServer({"nothing"}).exitStatus, 2);
+    EXPECT_EQ(runWithoutServer({"get"}).exitStatus, 2);
+    EXPECT_EQ(runWithoutServer({"server", "--wrong"}).exitStatus, 2);
+}
+
+TEST_F(ProgramTest, GetCannotRunWithoutAServer) {
+    const ProgramResult result = runWithoutServer({"get", "CIM_Processor"});
+    EXPECT_EQ(result.exitStatus, 2);
+    EXPECT_THAT(result.err, HasSubstr("sennetctl: Cannot connect to CIM server: "));
+    EXPECT_THAT(result.out, IsEmpty());
+}
+
+TEST_F(ProgramTest, ServerFindsNone) {
+    const ProgramResult result = runWithoutServer({"server"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.out, HasSubstr(directory.path("none")));
+}
+
+TEST_F(ProgramTest, GetShowsTheMachine) {
+    const ProgramResult result =
+        run({"get", "CIM_OperatingSystem", "-p", "OSType,CSCreationClassName"});
+    EXPECT_EQ(result.exitStatus, 0) << result.err;
+    EXPECT_THAT(result.out, HasSubstr("OSType"));
+    EXPECT_THAT(result.out, HasSubstr("1 instance\n"));
+    EXPECT_EQ(result.out.find('\x1B'), std::string::npos) << "colour into a pipe";
+}
+
+TEST_F(ProgramTest, ServerTellsTheStartedOne) {
+    const ProgramResult result = run({"server"});
+    EXPECT_EQ(result.exitStatus, 0) << result.err;
+    EXPECT_THAT(result.out, HasSubstr("\n*  " + directory.path("cimomd-on-laptop")));
+    EXPECT_THAT(result.out, HasSubstr("\nroot/cimv2  "));
+}
+
+}  // namespace
