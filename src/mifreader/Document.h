@@ -77,6 +77,8 @@ struct Group {
     std::vector<std::uint64_t> key;
     std::string description;
     std::string pragma;
+    Position namePosition;
+    Position classPosition;
     std::vector<Attribute> attributes;  // in ascending order of their Ids
     std::size_t requiredValues = 0;     // a row ends no earlier: the last of these has no default
 
@@ -99,6 +101,7 @@ struct Table {
     std::string name;
     std::uint64_t id = 0;
     std::string className;
+    Position namePosition;
     std::size_t group = 0;  // its place in Component::groups
     std::vector<Row> rows;
 };
@@ -116,6 +119,9 @@ struct Component {
     std::vector<Enumeration> enumerations;
     std::vector<Group> groups;
     std::vector<Table> tables;
+    Position namePosition;
+    // Where literals hold CR or LF as they are, each line end once; strictly there is none.
+    std::vector<Position> rawLineEnds;
 };
 
 }  // namespace Mif

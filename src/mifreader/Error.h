@@ -2,6 +2,7 @@
 
 // What is wrong with a file, and where.
 
+#include <cstddef>
 #include <stdexcept>
 #include <string>
 
@@ -16,9 +17,22 @@ struct Position {
 // The text reads "line:column: message".
 class Error : public std::runtime_error {
   public:
-    Error(Position position, const std::string& message)
-        : std::runtime_error(std::to_string(position.line) + ":" + std::to_string(position.column) +
-                             ": " + message) {}
+    Error(Position thePosition, const std::string& theMessage)
+        : std::runtime_error(std::to_string(thePosition.line) + ":" +
+                             std::to_string(thePosition.column) + ": " + theMessage),
+          place(thePosition),
+          messageLength(theMessage.size()) {}
+
+    Position position() const { return place; }
+    // The text without the position.
+    std::string message() const {
+        const std::string text = what();
+        return text.substr(text.size() - messageLength);
+    }
+
+  private:
+    Position place;
+    std::size_t messageLength;
 };
 
 }  // namespace Mif

@@ -208,7 +208,7 @@ void Lexer::literal(std::string& decoded) {
         if (c == '\\') {
             escape(decoded);
         } else if (c == '\r' || c == '\n') {
-            throw Error(position, "line end in a literal");
+            lineEnd(decoded, Tolerance::BareLineEnds);
         } else if (!isText(c)) {
             throw Error(position, shownCharacter(c) + " in a literal");
         } else {
@@ -218,6 +218,18 @@ void Lexer::literal(std::string& decoded) {
     take();
 }
 
+void Lexer::lineEnd(std::string& decoded, Tolerance tolerance) {
+    if (!tolerances.has(tolerance)) {
+        throw Error(position, "line end in a literal");
+    }
+    // CR and LF are one line end, also with a backslash between them.
+    const bool second = peek() == '\n' && !decoded.empty() && decoded.back() == '\r';
+    if (!second) {
+        lineEnds.push_back(position);
+    }
+    decoded += take();
+}
+
 void Lexer::escape(std::string& decoded) {
     const Position start = position;
     take();
@@ -225,13 +237,9 @@ void Lexer::escape(std::string& decoded) {
         return;
     }
     const char c = peek();
-    const bool lineEnd = c == '\r' || c == '\n';
-    if (lineEnd && tolerances.has(Tolerance::RawLineEnds)) {
-        decoded += take();
+    if (c == '\r' || c == '\n') {
+        lineEnd(decoded, Tolerance::RawLineEnds);
         return;
-    }
-    if (lineEnd) {
-        throw Error(position, "line end in a literal");
     }
     if (tolerances.has(Tolerance::PlainBackslashes) && c != '"') {
         decoded += '\\';

@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "mifreader/Error.h"
 #include "mifreader/Tolerance.h"
@@ -37,6 +38,9 @@ class Lexer {
     // Throws Error for what cannot be a token.
     Token next();
 
+    // The line ends in the literals read so far that a tolerance let pass.
+    const std::vector<Position>& rawLineEnds() const { return lineEnds; }
+
   private:
     bool atEnd() const { return offset == text.size(); }
     char peek(std::size_t ahead = 0) const {
@@ -49,6 +53,7 @@ class Lexer {
     Token integer();
     Token literals();
     void literal(std::string& decoded);
+    void lineEnd(std::string& decoded, Tolerance tolerance);
     void escape(std::string& decoded);
     char octal();
     char hexadecimal();
@@ -57,6 +62,7 @@ class Lexer {
     Tolerances tolerances;
     std::size_t offset = 0;
     Position position;
+    std::vector<Position> lineEnds;
 };
 
 }  // namespace Mif

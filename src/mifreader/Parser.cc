@@ -32,6 +32,7 @@ Component Parser::file() {
         }
         const Token word = statement(statements);
         if (word.text == "name") {
+            result.namePosition = current.position;
             result.name = expectLiteral();
         } else if (word.text == "description") {
             result.description = expectLiteral();
@@ -46,6 +47,7 @@ Component Parser::file() {
     if (current.kind != Token::Kind::End) {
         throw Error(current.position, "nothing may follow the component");
     }
+    result.rawLineEnds = lexer.rawLineEnds();
     return std::move(result);
 }
 
@@ -228,8 +230,10 @@ void Parser::group(Position start) {
 void Parser::groupStatement(GroupBuilder& builder, Statements& statements) {
     const Token word = statement(statements);
     if (word.text == "name") {
+        builder.group.namePosition = current.position;
         builder.group.name = expectLiteral();
     } else if (word.text == "class") {
+        builder.group.classPosition = current.position;
         builder.group.className = expectLiteral();
     } else if (word.text == "id") {
         const Number id = expectNumber("an Id");
@@ -402,6 +406,7 @@ void Parser::table(Position start) {
 void Parser::tableStatement(Table& table, Statements& statements) {
     const Token word = statement(statements);
     if (word.text == "name") {
+        table.namePosition = current.position;
         table.name = expectLiteral();
     } else if (word.text == "id") {
         const Number id = expectNumber("an Id");

@@ -14,6 +14,8 @@ enum class Tolerance : std::uint8_t {
     // CR and LF as they are behind a backslash in a literal: importers take the character, while
     // the escapes \r and \n reach some of them as the letters.
     RawLineEnds,
+    // CR and LF as they are in a literal, without a backslash.
+    BareLineEnds,
     // A backslash stands for itself unless CR, LF or a double quote follows it.
     PlainBackslashes,
     // A bare integer where the type is a string: row numbers, and integers that a product wants
@@ -24,6 +26,10 @@ enum class Tolerance : std::uint8_t {
     TextAsIntegers,
     // Numbers up to 4294967295 where the type is Integer: the low word of a 64-bit value.
     UnsignedIntegers,
+    // Any number of 64 bits where the type is Integer.
+    WideIntegers,
+    // Any literal or integer where the type is a date.
+    AnyDates,
     // An empty literal where the type is a date: the value of a template.
     EmptyDates,
     // A literal longer than its type says: the length comes from the class definition, which

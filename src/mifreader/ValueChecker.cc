@@ -97,6 +97,9 @@ void ValueChecker::check(const Value& value, const Type& type) const {
 }
 
 void ValueChecker::checkInteger(const Value& value, Type::Base base) const {
+    if (base == Type::Base::Integer && tolerances.has(Tolerance::WideIntegers)) {
+        return;
+    }
     IntegerRange range = rangeOf(base);
     if (base == Type::Base::Integer && tolerances.has(Tolerance::UnsignedIntegers)) {
         range.largest = (1ULL << 32) - 1;
@@ -115,6 +118,9 @@ void ValueChecker::checkLength(const Value& value, const Type& type) const {
 }
 
 void ValueChecker::checkDate(const Value& value) const {
+    if (tolerances.has(Tolerance::AnyDates)) {
+        return;
+    }
     if (value.kind == Value::Kind::Text) {
         const bool empty = value.text.empty() && tolerances.has(Tolerance::EmptyDates);
         if (empty || isDate(value.text)) {

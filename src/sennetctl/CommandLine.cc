@@ -9,10 +9,14 @@
 #include <iostream>
 #include <memory>
 #include <string>
+#include <utility>
+#include <vector>
 
 #include "cim/CimText.h"
+#include "mif/MifCommands.h"
 #include "report/Output.h"
 #include "report/Text.h"
+#include "script/CheckCommand.h"
 #include "server/GetCommand.h"
 #include "server/ServerCommand.h"
 
@@ -75,6 +79,105 @@ void addGet(CLI::App& app, Choice& choice) {
     });
 }
 
+void addCheck(CLI::App& app, Choice& choice) {
+    CLI::App* command = addCommand(
+        app, choice, "check",
+        "Tell what sennet will make of inventory scripts, and where it will stay silent.",
+        "  sennetctl check\n"
+        "  sennetctl check --translations\n"
+        "  sennetctl check --offline own.script.inv");
+    const auto options = std::make_shared<CheckOptions>();
+    command
+        ->add_option("SCRIPT", options->scripts,
+                     "inventory scripts; by default all that sennet reads")
+        ->option_text("SCRIPT...");
+    command->add_flag("--offline", options->offline, "ask no CIM server");
+    command->add_flag("--translations", options->translations,
+                      "tell names and sizes that the resource properties lack, too");
+    command->callback([&choice, options] {
+        choice.command = [options](const Output& output) { return checkScripts(*options, output); };
+    });
+}
+
+void addMifCheck(CLI::App& mif, Choice& choice) {
+    CLI::App* command =
+        addCommand(mif, choice, "check", "Check MIF files as a product that imports them does.",
+                   "  sennetctl mif check --profile sms out/*.mif\n"
+                   "  sennetctl mif check --profile sms --max-kb 1024 yesterday.mif today.mif\n"
+                   "  sennetctl mif check kwvinv.mif --json");
+    struct Options {
+        LintOptions lint;
+        std::string profile = "dmi";
+        std::vector<std::string> files;
+    };
+    const auto options = std::make_shared<Options>();
+    command
+        ->add_option("--profile", options->profile,
+                     "whose rules: dmi (the standard, which is the default), sms, ca or landesk")
+        ->option_text("PROFILE")
+        ->check(CLI::IsMember({"dmi", "sms", "ca", "landesk"}));
+    command
+        ->add_option("--max-kb", options->lint.largestKilobytes,
+                     "the size that the site takes, by default 250 KB")
+        ->option_text("KB")
+        ->check(CLI::Range(1, 5120));
+    command
+        ->add_option("FILE", options->files,
+                     "the files in the order in which they are imported; a later one is compared "
+                     "with the classes of the earlier ones")
+        ->option_text("FILE...")
+        ->required();
+    command->callback([&choice, options] {
+        options->lint.profile = parseMifProfile(options->profile).value_or(MifProfile::Dmi);
+        choice.command = [options](const Output& output) {
+            return checkMifFiles(options->files, options->lint, output);
+        };
+    });
+}
+
+void addMifShow(CLI::App& mif, Choice& choice) {
+    const auto file = std::make_shared<std::string>();
+    CLI::App* show = addCommand(mif, choice, "show", "Show the tables of a MIF file.",
+                                "  sennetctl mif show out/processor.mif");
+    show->add_option("FILE", *file, "the file")->option_text("FILE")->required();
+    show->callback([&choice, file] {
+        choice.command = [file](const Output& output) { return showMifFile(*file, output); };
+    });
+    CLI::App* json = addCommand(mif, choice, "json", "Print the tables of a MIF file as JSON.",
+                                "  sennetctl mif json out/processor.mif | jq '.tables[].rows'");
+    json->add_option("FILE", *file, "the file")->option_text("FILE")->required();
+    json->callback([&choice, file] {
+        choice.json = true;
+        choice.command = [file](const Output& output) { return showMifFile(*file, output); };
+    });
+}
+
+void addMifDiff(CLI::App& mif, Choice& choice) {
+    const auto files = std::make_shared<std::pair<std::string, std::string>>();
+    CLI::App* command =
+        addCommand(mif, choice, "diff", "Tell what changed in the inventory.",
+                   "  sennetctl mif diff yesterday/diskdrive.mif out/diskdrive.mif");
+    command->add_option("OLD", files->first, "the earlier file")->option_text("OLD")->required();
+    command->add_option("NEW", files->second, "the later file")->option_text("NEW")->required();
+    command->callback([&choice, files] {
+        choice.command = [files](const Output& output) {
+            return compareMifFiles(files->first, files->second, output);
+        };
+    });
+}
+
+void addMif(CLI::App& app, Choice& choice) {
+    CLI::App* mif = app.add_subcommand("mif", "Check, show and compare MIF files.");
+    mif->require_subcommand(1);
+    mif->footer(
+        "Examples:\n"
+        "  sennetctl mif check --profile sms out/*.mif\n"
+        "  sennetctl mif show out/processor.mif");
+    addMifCheck(*mif, choice);
+    addMifShow(*mif, choice);
+    addMifDiff(*mif, choice);
+}
+
 int runCommand(const Choice& choice) {
     const Output output{std::cout, std::cerr, choice.json, ::isatty(STDOUT_FILENO) == 1,
                         ::isatty(STDERR_FILENO) == 1};
@@ -104,13 +207,17 @@ int runCommandLine(int argc, char** argv) {
     app.require_subcommand(1);
     app.footer(
         "Examples:\n"
+        "  sennetctl check\n"
         "  sennetctl server\n"
-        "  sennetctl get CIM_Processor\n\n"
+        "  sennetctl get CIM_Processor\n"
+        "  sennetctl mif check --profile sms out/*.mif\n\n"
         "The exit status is 0 when all is fine, 1 when something was found, and 2 when the "
         "command\n"
         "could not do its work. 'sennetctl COMMAND --help' tells more about a command.");
+    addCheck(app, choice);
     addServer(app, choice);
     addGet(app, choice);
+    addMif(app, choice);
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

@@ -4,6 +4,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <chrono>
 #include <filesystem>
 #include <string>
 #include <vector>
@@ -32,7 +33,6 @@ class ProgramTest : public testing::Test {
 
     support::TempDirectory directory;
 
-  private:
     std::string makeCommand() const {
         const std::string path = directory.write(
             "cimomd-on-laptop", "#!/bin/sh\nexec " TEST_BIN_DIR "/cimomd --root " TEST_SOURCE_DIR
@@ -45,8 +45,16 @@ class ProgramTest : public testing::Test {
 };
 
 TEST_F(ProgramTest, HelpHasExamplesOnEveryLevel) {
-    for (const std::vector<std::string>& arguments : std::vector<std::vector<std::string>>{
-             {"--help"}, {"server", "--help"}, {"get", "--help"}}) {
+    for (const std::vector<std::string>& arguments :
+         std::vector<std::vector<std::string>>{{"--help"},
+                                               {"server", "--help"},
+                                               {"get", "--help"},
+                                               {"check", "--help"},
+                                               {"mif", "--help"},
+                                               {"mif", "check", "--help"},
+                                               {"mif", "show", "--help"},
+                                               {"mif", "json", "--help"},
+                                               {"mif", "diff", "--help"}}) {
         const ProgramResult result = runWithoutServer(arguments);
         EXPECT_EQ(result.exitStatus, 0);
         EXPECT_THAT(result.out, HasSubstr("Examples:\n  sennetctl "));
@@ -72,6 +80,38 @@ TEST_F(ProgramTest, ServerFindsNone) {
     const ProgramResult result = runWithoutServer({"server"});
     EXPECT_EQ(result.exitStatus, 1);
     EXPECT_THAT(result.out, HasSubstr(directory.path("none")));
+}
+
+TEST_F(ProgramTest, ChecksMifFilesByTheirProfile) {
+    const std::string file = directory.write(
+        "f.mif",
+        "Start Component Name = \"a\" Start Group Name = \"b\" Class = \"c|b|1\" Id = 1\n"
+        "Start Attribute Name = \"d\" Id = 1 Type = String(3) Value = 7 End Attribute\n"
+        "End Group End Component");
+    const ProgramResult strict = runWithoutServer({"mif", "check", file});
+    EXPECT_EQ(strict.exitStatus, 1);
+    EXPECT_THAT(strict.out, HasSubstr(file + ":2:60: error: integer where the type is a string\n"));
+    const ProgramResult landesk =
+        runWithoutServer({"mif", "check", "--profile", "landesk", "--json", file});
+    EXPECT_THAT(landesk.out, HasSubstr("no group of the class DMTF|ComponentID|001"));
+    EXPECT_THAT(landesk.out, HasSubstr("\"errors\": 0"));
+    EXPECT_EQ(runWithoutServer({"mif", "check", "--profile", "other", file}).exitStatus, 2);
+    EXPECT_EQ(runWithoutServer({"mif", "check", directory.path("none")}).exitStatus, 2);
+    EXPECT_EQ(runWithoutServer({"mif", "diff", file, file}).exitStatus, 0);
+    EXPECT_THAT(runWithoutServer({"mif", "json", file}).out, HasSubstr("\"component\": \"a\""));
+    EXPECT_THAT(runWithoutServer({"mif", "show", file}).out, HasSubstr("Component a\n"));
+}
+
+TEST_F(ProgramTest, TheShippedScriptsAreClean) {
+    const std::string configuration = directory.write(
+        "velm.properties", "sennet.directory=" INVENTORY_DIR "\nsennet.resources=" INVENTORY_DIR
+                           "/sennet.properties\n");
+    const ProgramResult result = support::runProgram(
+        TEST_BIN_DIR "/sennetctl", {"check", "--translations"},
+        {{"CIM_COMMAND", command}, {"VELM_CONFIG", configuration}}, std::chrono::seconds(240));
+    EXPECT_EQ(result.exitStatus, 0) << result.out;
+    EXPECT_THAT(result.out, HasSubstr(" files: 0 errors, 0 warnings\n"));
+    EXPECT_THAT(result.out, HasSubstr("note: Velmira_OperatingSystem: 1 instance\n"));
 }
 
 TEST_F(ProgramTest, GetShowsTheMachine) {

@@ -10,6 +10,9 @@ using namespace Mif;
 
 TEST(ToleranceTest, KnowsEveryName) {
     EXPECT_EQ(parseTolerance("raw-line-ends"), Tolerance::RawLineEnds);
+    EXPECT_EQ(parseTolerance("bare-line-ends"), Tolerance::BareLineEnds);
+    EXPECT_EQ(parseTolerance("wide-integers"), Tolerance::WideIntegers);
+    EXPECT_EQ(parseTolerance("any-dates"), Tolerance::AnyDates);
     EXPECT_EQ(parseTolerance("plain-backslashes"), Tolerance::PlainBackslashes);
     EXPECT_EQ(parseTolerance("integers-as-text"), Tolerance::IntegersAsText);
     EXPECT_EQ(parseTolerance("text-as-integers"), Tolerance::TextAsIntegers);

@@ -1,0 +1,194 @@
+#include "mif/MifCommands.h"
+
+#include <cstdint>
+#include <ostream>
+
+#include "mif/MifDifference.h"
+#include "mif/MifTables.h"
+#include "report/Json.h"
+#include "report/Text.h"
+#include "report/TextTable.h"
+#include "report/WholeFile.h"
+
+namespace sennetctl {
+
+namespace {
+
+constexpr std::size_t kWidestCell = 48;
+
+std::string typeName(const Mif::Type& type) {
+    static constexpr const char* kNames[] = {"Integer",       "Integer64",   "Gauge",
+                                             "Counter",       "Counter64",   "String",
+                                             "DisplayString", "OctetString", "Date"};
+    const std::string name = kNames[static_cast<std::size_t>(type.base)];
+    return type.length > 0 ? name + "(" + std::to_string(type.length) + ")" : name;
+}
+
+Json jsonOf(const Mif::Value& value) {
+    if (value.kind == Mif::Value::Kind::Integer) {
+        constexpr std::uint64_t kLowest = std::uint64_t(1) << 63;
+        if (!value.negative) {
+            return value.magnitude;
+        }
+        return value.magnitude <= kLowest ? Json(static_cast<std::int64_t>(0 - value.magnitude))
+                                          : Json(shownValue(value));
+    }
+    return value.kind == Mif::Value::Kind::Text ? Json(fromLatin1(value.text)) : Json(nullptr);
+}
+
+Json jsonOf(const MifTable& table) {
+    Json one = Json::object();
+    one["name"] = table.name;
+    one["class"] = table.className;
+    one["attributes"] = Json::array();
+    for (const MifColumn& column : table.columns) {
+        Json attribute = Json::object();
+        attribute["name"] = column.name;
+        attribute["type"] = typeName(column.type);
+        attribute["key"] = column.isKey;
+        one["attributes"].push_back(std::move(attribute));
+    }
+    one["rows"] = Json::array();
+    for (const std::vector<Mif::Value>& values : table.rows) {
+        Json row = Json::object();
+        for (std::size_t i = 0; i < values.size(); ++i) {
+            row[table.columns[i].name] = jsonOf(values[i]);
+        }
+        one["rows"].push_back(std::move(row));
+    }
+    return one;
+}
+
+void printTable(const MifTable& table, const Output& output) {
+    output.out << '\n'
+               << printable(table.name) << " (" << printable(table.className) << ", "
+               << counted(table.rows.size(), "row") << ")\n";
+    std::vector<std::string> titles;
+    for (const MifColumn& column : table.columns) {
+        titles.push_back(column.name);
+    }
+    TextTable shown(titles, kWidestCell);
+    for (const std::vector<Mif::Value>& values : table.rows) {
+        std::vector<std::string> cells;
+        for (const Mif::Value& value : values) {
+            cells.push_back(shownValue(value));
+        }
+        shown.addRow(std::move(cells));
+    }
+    shown.print(output);
+}
+
+const char* signOf(MifChange::Kind kind) {
+    switch (kind) {
+        case MifChange::Kind::Added:
+            return "+";
+        case MifChange::Kind::Removed:
+            return "-";
+        case MifChange::Kind::Changed:
+            break;
+    }
+    return "~";
+}
+
+const char* nameOf(MifChange::Kind kind) {
+    switch (kind) {
+        case MifChange::Kind::Added:
+            return "added";
+        case MifChange::Kind::Removed:
+            return "removed";
+        case MifChange::Kind::Changed:
+            break;
+    }
+    return "changed";
+}
+
+std::string descriptionOf(const MifChange& change) {
+    if (change.row.empty()) {
+        return change.attribute.empty() ? "table" : "attribute " + change.attribute;
+    }
+    if (change.kind != MifChange::Kind::Changed) {
+        return change.row;
+    }
+    return change.row + ": " + change.attribute + ": '" + change.before + "' is now '" +
+           change.after + "'";
+}
+
+void printChanges(const std::vector<MifChange>& changes, const Output& output) {
+    const std::string* table = nullptr;
+    for (const MifChange& change : changes) {
+        if (table == nullptr || *table != change.table) {
+            output.out << printable(change.table) << '\n';
+            table = &change.table;
+        }
+        output.out << "  " << signOf(change.kind) << ' ' << printable(descriptionOf(change))
+                   << '\n';
+    }
+    output.out << counted(changes.size(), "difference") << '\n';
+}
+
+Json jsonOf(const MifChange& change) {
+    const auto textOrNull = [](const std::string& text) {
+        return text.empty() ? Json(nullptr) : Json(text);
+    };
+    Json one = Json::object();
+    one["table"] = change.table;
+    one["change"] = nameOf(change.kind);
+    one["row"] = textOrNull(change.row);
+    one["attribute"] = textOrNull(change.attribute);
+    if (change.kind == MifChange::Kind::Changed) {
+        one["old"] = change.before;
+        one["new"] = change.after;
+    }
+    return one;
+}
+
+}  // namespace
+
+int checkMifFiles(const std::vector<std::string>& files, const LintOptions& options,
+                  const Output& output) {
+    MifLint lint(options);
+    std::vector<Finding> findings;
+    for (const std::string& file : files) {
+        const std::vector<Finding> found = lint.check(file, readWholeFile(file));
+        findings.insert(findings.end(), found.begin(), found.end());
+    }
+    return printFindings(findings, files, output);
+}
+
+int showMifFile(const std::string& file, const Output& output) {
+    const Mif::Component component = readMifFile(file);
+    const std::vector<MifTable> tables = tablesOf(component);
+    if (output.json) {
+        Json document = Json::object();
+        document["component"] = fromLatin1(component.name);
+        document["tables"] = Json::array();
+        for (const MifTable& table : tables) {
+            document["tables"].push_back(jsonOf(table));
+        }
+        printJson(document, output);
+        return kFine;
+    }
+    output.out << "Component " << printable(fromLatin1(component.name)) << '\n';
+    for (const MifTable& table : tables) {
+        printTable(table, output);
+    }
+    return kFine;
+}
+
+int compareMifFiles(const std::string& oldFile, const std::string& newFile, const Output& output) {
+    const std::vector<MifChange> changes =
+        differencesOf(tablesOf(readMifFile(oldFile)), tablesOf(readMifFile(newFile)));
+    if (output.json) {
+        Json document = Json::object();
+        document["changes"] = Json::array();
+        for (const MifChange& change : changes) {
+            document["changes"].push_back(jsonOf(change));
+        }
+        printJson(document, output);
+    } else {
+        printChanges(changes, output);
+    }
+    return changes.empty() ? kFine : kFindings;
+}
+
+}  // namespace sennetctl

@@ -1,0 +1,217 @@
+#include "mif/MifDifference.h"
+
+#include <algorithm>
+#include <map>
+#include <optional>
+#include <set>
+
+namespace sennetctl {
+
+namespace {
+
+using Texts = std::vector<std::string>;
+
+/// The row number that the generator puts first; it says nothing about the machine.
+bool isRowNumber(const MifColumn& column) {
+    return column.isKey && (column.name == "Index" || column.name == "Row_Index");
+}
+
+/// One of the tables with what is compared: its columns without row numbers, its values as texts.
+struct ComparedTable {
+    explicit ComparedTable(const MifTable& table) {
+        std::vector<std::size_t> places;
+        for (std::size_t i = 0; i < table.columns.size(); ++i) {
+            if (!isRowNumber(table.columns[i])) {
+                places.push_back(i);
+                names.push_back(table.columns[i].name);
+                keys.push_back(table.columns[i].isKey);
+            }
+        }
+        for (const std::vector<Mif::Value>& values : table.rows) {
+            Texts row;
+            for (const std::size_t place : places) {
+                row.push_back(shownValue(values[place]));
+            }
+            rows.push_back(std::move(row));
+        }
+    }
+
+    std::optional<std::size_t> placeOf(const std::string& name) const {
+        const auto found = std::find(names.begin(), names.end(), name);
+        return found == names.end()
+                   ? std::nullopt
+                   : std::optional<std::size_t>(static_cast<std::size_t>(found - names.begin()));
+    }
+
+    Texts names;
+    std::vector<bool> keys;
+    std::vector<Texts> rows;
+};
+
+class TableComparison {
+  public:
+    TableComparison(const MifTable& before, const MifTable& after, std::vector<MifChange>& changes)
+        : name(after.name), before(before), after(after), changes(changes) {}
+
+    void run() {
+        compareColumns();
+        identity = chooseIdentity();
+        if (identity.empty()) {
+            compareWholeRows();
+        } else {
+            compareById();
+        }
+    }
+
+  private:
+    void add(MifChange::Kind kind, const std::string& row, const std::string& attribute = {},
+             const std::string& oldValue = {}, const std::string& newValue = {}) {
+        changes.push_back({name, kind, row, attribute, oldValue, newValue});
+    }
+
+    void compareColumns() {
+        for (const std::string& column : before.names) {
+            if (!after.placeOf(column)) {
+                add(MifChange::Kind::Removed, {}, column);
+            }
+        }
+        for (const std::string& column : after.names) {
+            if (before.placeOf(column)) {
+                common.push_back(column);
+            } else {
+                add(MifChange::Kind::Added, {}, column);
+            }
+        }
+    }
+
+    /// The key, or the first column, if that tells the rows of both files apart.
+    Texts chooseIdentity() const {
+        Texts chosen;
+        for (std::size_t i = 0; i < after.names.size(); ++i) {
+            if (after.keys[i]) {
+                chosen.push_back(after.names[i]);
+            }
+        }
+        if (chosen.empty() && !common.empty()) {
+            chosen.push_back(common.front());
+        }
+        return tellsApart(before, chosen) && tellsApart(after, chosen) ? chosen : Texts();
+    }
+
+    static Texts valuesOf(const ComparedTable& table, const Texts& row, const Texts& columns) {
+        Texts values;
+        for (const std::string& column : columns) {
+            const std::optional<std::size_t> place = table.placeOf(column);
+            values.push_back(place ? row[*place] : std::string());
+        }
+        return values;
+    }
+
+    static bool tellsApart(const ComparedTable& table, const Texts& columns) {
+        std::set<Texts> seen;
+        return std::all_of(table.rows.begin(), table.rows.end(), [&](const Texts& row) {
+            const Texts values = valuesOf(table, row, columns);
+            const bool empty = std::all_of(values.begin(), values.end(),
+                                           [](const std::string& value) { return value.empty(); });
+            return !empty && seen.insert(values).second;
+        });
+    }
+
+    static std::string joined(const Texts& values) {
+        std::string text;
+        for (const std::string& value : values) {
+            text += (text.empty() ? "" : ", ") + value;
+        }
+        return text.empty() ? "a row without values" : text;
+    }
+
+    void compareById() {
+        std::map<Texts, const Texts*> newRows;
+        for (const Texts& row : after.rows) {
+            newRows[valuesOf(after, row, identity)] = &row;
+        }
+        std::set<Texts> known;
+        for (const Texts& row : before.rows) {
+            const Texts id = valuesOf(before, row, identity);
+            known.insert(id);
+            const auto found = newRows.find(id);
+            if (found == newRows.end()) {
+                add(MifChange::Kind::Removed, joined(id));
+            } else {
+                compareRow(joined(id), row, *found->second);
+            }
+        }
+        for (const Texts& row : after.rows) {
+            const Texts id = valuesOf(after, row, identity);
+            if (known.count(id) == 0) {
+                add(MifChange::Kind::Added, joined(id));
+            }
+        }
+    }
+
+    void compareRow(const std::string& id, const Texts& oldRow, const Texts& newRow) {
+        const Texts oldValues = valuesOf(before, oldRow, common);
+        const Texts newValues = valuesOf(after, newRow, common);
+        for (std::size_t i = 0; i < common.size(); ++i) {
+            if (oldValues[i] != newValues[i]) {
+                add(MifChange::Kind::Changed, id, common[i], oldValues[i], newValues[i]);
+            }
+        }
+    }
+
+    /// Rows that have their like in the other file are no change, however often they occur there.
+    void compareWholeRows() {
+        std::multiset<Texts> left;
+        for (const Texts& row : after.rows) {
+            left.insert(valuesOf(after, row, common));
+        }
+        for (const Texts& row : before.rows) {
+            const Texts values = valuesOf(before, row, common);
+            const auto like = left.find(values);
+            if (like == left.end()) {
+                add(MifChange::Kind::Removed, joined(values));
+            } else {
+                left.erase(like);
+            }
+        }
+        for (const Texts& values : left) {
+            add(MifChange::Kind::Added, joined(values));
+        }
+    }
+
+    std::string name;
+    ComparedTable before;
+    ComparedTable after;
+    std::vector<MifChange>& changes;
+    Texts common;
+    Texts identity;
+};
+
+const MifTable* findClass(const std::vector<MifTable>& tables, const std::string& className) {
+    const auto found = std::find_if(tables.begin(), tables.end(), [&](const MifTable& table) {
+        return table.className == className;
+    });
+    return found == tables.end() ? nullptr : &*found;
+}
+
+}  // namespace
+
+std::vector<MifChange> differencesOf(const std::vector<MifTable>& oldTables,
+                                     const std::vector<MifTable>& newTables) {
+    std::vector<MifChange> changes;
+    for (const MifTable& before : oldTables) {
+        if (const MifTable* after = findClass(newTables, before.className)) {
+            TableComparison(before, *after, changes).run();
+        } else {
+            changes.push_back({before.name, MifChange::Kind::Removed, {}, {}, {}, {}});
+        }
+    }
+    for (const MifTable& after : newTables) {
+        if (findClass(oldTables, after.className) == nullptr) {
+            changes.push_back({after.name, MifChange::Kind::Added, {}, {}, {}, {}});
+        }
+    }
+    return changes;
+}
+
+}  // namespace sennetctl

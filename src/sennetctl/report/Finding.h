@@ -1,0 +1,32 @@
+#pragma once
+
+// What a command found in a file, and how it is told.
+
+#include <string>
+#include <vector>
+
+#include "report/Output.h"
+
+namespace sennetctl {
+
+/// A note is told but is no reason for the exit status kFindings.
+enum class Severity { Note, Warning, Error };
+
+/// "note", "warning" or "error".
+const char* nameOf(Severity severity);
+
+struct Finding {
+    std::string file;
+    /// Counted from 1, in lines that end at LF and in octets; 0 where there is no such place.
+    unsigned line = 0;
+    unsigned column = 0;
+    Severity severity = Severity::Warning;
+    std::string message;
+};
+
+/// Prints each finding as "file:line:column: severity: message" and then how many there are, or all
+/// as JSON. `files` are those that were looked at. Returns the exit status.
+int printFindings(const std::vector<Finding>& findings, const std::vector<std::string>& files,
+                  const Output& output);
+
+}  // namespace sennetctl

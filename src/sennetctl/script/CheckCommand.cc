@@ -1,0 +1,108 @@
+#include "script/CheckCommand.h"
+
+#include <Velm/DirectoryReader.h>
+#include <Velm/PlatformUtilities.h>
+#include <Velm/PropertiesFile.h>
+
+#include <algorithm>
+#include <memory>
+#include <ostream>
+#include <tuple>
+
+#include "cim/LocalServer.h"
+#include "report/Finding.h"
+#include "report/Text.h"
+#include "report/WholeFile.h"
+#include "script/ScriptLint.h"
+#include "script/ScriptReader.h"
+#include "script/ServerCheck.h"
+
+namespace sennetctl {
+
+namespace {
+
+std::vector<std::string> installedScripts() {
+    const char* directory = Velm::PlatformUtilities::getSennetDirectory();
+    const Velm::DirectoryReader reader(directory, ".script.inv");
+    std::vector<std::string> scripts;
+    for (int i = 0; i < reader.getNumberOfFiles(); ++i) {
+        scripts.emplace_back(reader.getFileName(i));
+    }
+    if (scripts.empty()) {
+        throw CannotRun(std::string("there are no inventory scripts in ") + directory);
+    }
+    return scripts;
+}
+
+std::unique_ptr<LocalServer> connectUnlessOffline(const CheckOptions& options,
+                                                  const Output& output) {
+    if (options.offline) {
+        return nullptr;
+    }
+    try {
+        return std::make_unique<LocalServer>();
+    } catch (const CannotRun& failure) {
+        output.err << "sennetctl: " << printable(failure.what())
+                   << "\nsennetctl: only the scripts themselves are checked\n";
+        return nullptr;
+    }
+}
+
+/// One line that is written over and taken away at the end.
+class Progress {
+  public:
+    explicit Progress(const Output& theOutput) : output(theOutput) {}
+    ~Progress() { show(""); }
+    Progress(const Progress&) = delete;
+    Progress& operator=(const Progress&) = delete;
+
+    void show(const std::string& text) const {
+        if (output.progress) {
+            output.err << "\r\x1B[K" << printable(text) << std::flush;
+        }
+    }
+
+  private:
+    const Output& output;
+};
+
+std::vector<Finding> checkScriptFile(const std::string& file, const CheckOptions& options,
+                                     const Velm::Properties& texts, LocalServer* server) {
+    std::vector<Finding> findings;
+    ScriptModel model = ScriptReader(file, findings).read(readWholeFile(file));
+    checkScript(model, findings);
+    if (options.translations) {
+        checkTranslations(model, texts, findings);
+    }
+    if (server != nullptr && !model.givenUp) {
+        ServerCheck(*server, texts, options.translations, findings).check(model);
+    }
+    std::stable_sort(findings.begin(), findings.end(), [](const Finding& one, const Finding& two) {
+        return std::tie(one.line, one.column) < std::tie(two.line, two.column);
+    });
+    return findings;
+}
+
+}  // namespace
+
+int checkScripts(const CheckOptions& options, const Output& output) {
+    const std::vector<std::string> files =
+        options.scripts.empty() ? installedScripts() : options.scripts;
+    Velm::PropertiesFile texts(Velm::PlatformUtilities::getSennetResourceFile());
+    texts.load();
+    const std::unique_ptr<LocalServer> server = connectUnlessOffline(options, output);
+    std::vector<Finding> findings;
+    {
+        const Progress progress(output);
+        for (std::size_t i = 0; i < files.size(); ++i) {
+            progress.show("script " + std::to_string(i + 1) + " of " +
+                          std::to_string(files.size()) + ": " + files[i]);
+            const std::vector<Finding> found =
+                checkScriptFile(files[i], options, texts.getProperties(), server.get());
+            findings.insert(findings.end(), found.begin(), found.end());
+        }
+    }
+    return printFindings(findings, files, output);
+}
+
+}  // namespace sennetctl

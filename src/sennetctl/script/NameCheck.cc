@@ -1,0 +1,162 @@
+#include "script/NameCheck.h"
+
+#include <algorithm>
+
+#include "CimScriptParser/CimScriptParser.h"
+#include "SennetConverter/framework/SennetUtilities.h"
+#include "cim/CimText.h"
+
+namespace sennetctl {
+
+using namespace Pegasus;
+
+namespace {
+
+constexpr unsigned kQveName = 30;
+constexpr unsigned kLumoName = 18;
+
+/// A column before a product's rules.
+struct NamedColumn {
+    ScriptText place;
+    String name;
+    Uint32 number;  // its Id in the group
+};
+
+String pegasusText(const std::string& text) {
+    return String(text.c_str());
+}
+
+/// What the resource properties have under the key, else the other text; trimmed.
+String readable(const Velm::Properties& texts, const std::string& key, const std::string& other) {
+    const char* text = texts.getPropertyValue(key.c_str());
+    return SennetUtilities::trim(text != nullptr ? String(text) : pegasusText(other));
+}
+
+std::vector<NamedColumn> columnsOf(const std::vector<AnsweredClass>& classes,
+                                   const Velm::Properties& texts) {
+    std::vector<NamedColumn> columns;
+    for (const AnsweredClass& answered : classes) {
+        const std::string className = textOf(answered.definition.getClassName());
+        for (const ScriptText& property : answered.slot->properties) {
+            const auto number = static_cast<Uint32>(columns.size() + 2);
+            columns.push_back({property,
+                               readable(texts, className + "." + property.value, property.value),
+                               number});
+        }
+    }
+    return columns;
+}
+
+class NameChecker {
+  public:
+    NameChecker(const ScriptModel& model, std::vector<Finding>& findings)
+        : model(model), findings(findings) {}
+
+    /// Names as SMS, LANDesk and CA take them.
+    void checkPlain(const std::vector<NamedColumn>& columns) {
+        Array<String> used;
+        for (const NamedColumn& column : columns) {
+            tellRepeated(column, "all products", column.name, used);
+        }
+    }
+
+    void checkQve(const std::vector<NamedColumn>& columns) {
+        Array<String> used;
+        for (const NamedColumn& column : columns) {
+            const String name = shortened(column, "QVE", kQveName);
+            // What collides for all products has been told.
+            if (!collidesPlainly(columns, column)) {
+                tellRepeated(column, "QVE", name, used);
+            }
+        }
+    }
+
+    /// Here words are abbreviated after the names were made different.
+    void checkLumo(const std::vector<NamedColumn>& columns) {
+        Array<String> used;
+        std::vector<String> written;
+        for (const NamedColumn& column : columns) {
+            const String name = SennetUtilities::substituteValues(SennetUtilities::makeUnique(
+                shortened(column, "QVE with Lumo", kLumoName), number(column), used));
+            const bool taken =
+                std::any_of(written.begin(), written.end(),
+                            [&](const String& other) { return String::equalNoCase(other, name); });
+            if (taken) {
+                add(column.place, "two columns are called " + textOf(name) +
+                                      " for QVE with Lumo, which refuses the table");
+            }
+            written.push_back(name);
+        }
+    }
+
+    void checkTitle(const ScriptText& place, const String& title) {
+        for (const unsigned limit : {kQveName, kLumoName}) {
+            const String name = SennetUtilities::hashString(title, limit);
+            if (name.size() > 0 && !String::equal(name, withUnderscores(title))) {
+                add(place, "the title " + textOf(title) + " is shortened to " + textOf(name) +
+                               " for QVE" + (limit == kLumoName ? " with Lumo" : ""));
+            }
+        }
+    }
+
+  private:
+    static String withUnderscores(const String& text) {
+        return SennetUtilities::replaceAll(text, ' ', '_');
+    }
+
+    static String number(const NamedColumn& column) {
+        return SennetUtilities::toUnsignedDecimal(column.number);
+    }
+
+    static bool collidesPlainly(const std::vector<NamedColumn>& columns,
+                                const NamedColumn& column) {
+        return std::any_of(columns.begin(), columns.end(), [&](const NamedColumn& other) {
+            return other.number < column.number && String::equal(other.name, column.name);
+        });
+    }
+
+    void tellRepeated(const NamedColumn& column, const std::string& product, const String& name,
+                      Array<String>& used) {
+        const String unique = SennetUtilities::makeUnique(name, number(column), used);
+        if (!String::equal(unique, name)) {
+            add(column.place, "two columns are called " + textOf(name) + ": for " + product +
+                                  " this one becomes " + textOf(unique));
+        }
+    }
+
+    /// The name as QVE takes it; tells when that cuts it.
+    String shortened(const NamedColumn& column, const std::string& product, unsigned limit) {
+        const String name = SennetUtilities::formatPropertyName4quvelle(column.name, limit);
+        if (column.name.size() > limit) {
+            add(column.place, "the name " + textOf(column.name) + " is cut to " + textOf(name) +
+                                  " for " + product);
+        }
+        return name;
+    }
+
+    void add(const ScriptText& place, const std::string& message) {
+        findings.push_back({model.file, place.line, place.column, Severity::Warning, message});
+    }
+
+    const ScriptModel& model;
+    std::vector<Finding>& findings;
+};
+
+}  // namespace
+
+void checkNames(const ScriptModel& model, const std::vector<AnsweredClass>& classes,
+                const Velm::Properties& texts, std::vector<Finding>& findings) {
+    const std::vector<NamedColumn> columns = columnsOf(classes, texts);
+    NameChecker checker(model, findings);
+    checker.checkPlain(columns);
+    checker.checkQve(columns);
+    checker.checkLumo(columns);
+    CimScriptParser parser(pegasusText(model.file));
+    const std::string title =
+        model.title.value.empty() ? textOf(parser.getTitle()) : model.title.value;
+    std::string key = title;
+    std::replace(key.begin(), key.end(), ' ', '_');
+    checker.checkTitle(model.title, readable(texts, "title." + key, title));
+}
+
+}  // namespace sennetctl

@@ -1,0 +1,18 @@
+#pragma once
+
+// What the products make of a script's title and of its columns' names.
+
+#include <Velm/Properties.h>
+
+#include <vector>
+
+#include "report/Finding.h"
+#include "script/AnsweredClass.h"
+
+namespace sennetctl {
+
+/// Appends which names collide, and which are cut, for which product.
+void checkNames(const ScriptModel& model, const std::vector<AnsweredClass>& classes,
+                const Velm::Properties& texts, std::vector<Finding>& findings);
+
+}  // namespace sennetctl

@@ -1,0 +1,162 @@
+#include "script/ScriptLint.h"
+
+#include <algorithm>
+
+#include "script/ScriptText.h"
+
+namespace sennetctl {
+
+namespace {
+
+constexpr const char* kGivenUp = ": sennet gives the whole script up";
+constexpr const char* kSuffix = ".script.inv";
+
+class Checker {
+  public:
+    Checker(ScriptModel& model, std::vector<Finding>& findings)
+        : model(model), findings(findings) {}
+
+    void run() {
+        checkFileName();
+        for (std::size_t i = 0; i < model.slots.size(); ++i) {
+            checkSlot(i);
+        }
+        const bool any = std::any_of(model.slots.begin(), model.slots.end(),
+                                     [](const ScriptSlot& slot) { return slot.isUsed(); });
+        if (!any && !model.givenUp) {
+            add(Severity::Warning, {}, "the script names no class: nothing is written");
+        }
+    }
+
+  private:
+    void add(Severity severity, const ScriptText& place, const std::string& message) {
+        findings.push_back({model.file, place.line, place.column, severity, message});
+    }
+
+    void giveUp(const ScriptText& place, const std::string& message) {
+        add(Severity::Error, place, message + kGivenUp);
+        model.givenUp = true;
+    }
+
+    void checkFileName() {
+        const std::string& file = model.file;
+        const std::size_t length = std::string_view(kSuffix).size();
+        if (file.size() < length ||
+            !sameIgnoringCase(std::string_view(file).substr(file.size() - length), kSuffix)) {
+            add(Severity::Warning, {},
+                "the file's name does not end in .script.inv: sennet does not read it");
+        }
+    }
+
+    void checkSlot(std::size_t number) {
+        ScriptSlot& slot = model.slots[number];
+        if (!slot.isUsed()) {
+            for (const ScriptText* lost : {&slot.nameSpace, &slot.propertyList}) {
+                if (lost->line > 0) {
+                    add(Severity::Warning, *lost,
+                        "line without effect: slot " + std::to_string(number) +
+                            " has no class, which G[" + std::to_string(number) + "]= would name");
+                }
+            }
+            return;
+        }
+        checkClass(slot, number);
+        checkNamespace(slot);
+        if (slot.propertyList.line == 0) {
+            add(Severity::Warning, slot.className,
+                "slot " + std::to_string(number) +
+                    " has no property list: its rows get an empty cell that no column is for");
+        }
+        readProperties(slot);
+    }
+
+    void checkClass(const ScriptSlot& slot, std::size_t number) {
+        const std::string& name = slot.className.value;
+        if (!isLegalName(name)) {
+            giveUp(slot.className, "'" + name + "' is no name of a class");
+        }
+        for (std::size_t i = 0; i < number; ++i) {
+            if (sameIgnoringCase(model.slots[i].className.value, name)) {
+                add(Severity::Warning, slot.className,
+                    "slot " + std::to_string(i) +
+                        " has this class, too: its property list is taken for both");
+                return;
+            }
+        }
+    }
+
+    void checkNamespace(const ScriptSlot& slot) {
+        const bool own = !slot.nameSpace.value.empty();
+        const ScriptText& text = own ? slot.nameSpace : model.defaultNamespace;
+        if (!isLegalNamespace(text.value)) {
+            giveUp(text, "'" + text.value + "' is no name of a namespace");
+        }
+    }
+
+    void readProperties(ScriptSlot& slot) {
+        const ScriptText& list = slot.propertyList;
+        std::size_t begin = 0;
+        for (const std::string& name : scriptTokens(list.value, ", ")) {
+            begin = list.value.find(name, begin);
+            ScriptText property = list;
+            property.value = name;
+            property.column += static_cast<unsigned>(begin);
+            begin += name.size();
+            checkProperty(slot, property);
+        }
+    }
+
+    void checkProperty(ScriptSlot& slot, const ScriptText& property) {
+        if (!isLegalName(property.value)) {
+            const char last = property.value.back();
+            const bool separator = last == ',' || last == ' ';
+            giveUp(property, "'" + property.value + "' is no name of a property" +
+                                 (separator ? ", for a comma or blank at the end of the line "
+                                              "belongs to it"
+                                            : ""));
+            return;
+        }
+        const bool repeated = std::any_of(
+            slot.properties.begin(), slot.properties.end(),
+            [&](const ScriptText& other) { return sameIgnoringCase(other.value, property.value); });
+        if (repeated) {
+            add(Severity::Warning, property,
+                "the property " + property.value + " is listed twice, and so gets two columns");
+        }
+        slot.properties.push_back(property);
+    }
+
+    ScriptModel& model;
+    std::vector<Finding>& findings;
+};
+
+std::string withUnderscores(std::string text) {
+    std::replace(text.begin(), text.end(), ' ', '_');
+    return text;
+}
+
+}  // namespace
+
+void checkScript(ScriptModel& model, std::vector<Finding>& findings) {
+    Checker(model, findings).run();
+}
+
+void checkTranslations(const ScriptModel& model, const Velm::Properties& texts,
+                       std::vector<Finding>& findings) {
+    const auto require = [&](const ScriptText& place, const std::string& key) {
+        if (texts.getPropertyValue(key.c_str()) == nullptr) {
+            findings.push_back({model.file, place.line, place.column, Severity::Warning,
+                                "the resource properties have no " + key});
+        }
+    };
+    if (!model.title.value.empty()) {
+        require(model.title, "title." + withUnderscores(model.title.value));
+    }
+    for (const ScriptSlot& slot : model.slots) {
+        for (const ScriptText& property : slot.properties) {
+            require(property, slot.className.value + "." + property.value);
+        }
+    }
+}
+
+}  // namespace sennetctl

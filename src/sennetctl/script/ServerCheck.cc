@@ -1,0 +1,172 @@
+#include "script/ServerCheck.h"
+
+#include "cim/CimText.h"
+#include "cim/ValueText.h"
+#include "report/Text.h"
+#include "script/ColumnCheck.h"
+#include "script/NameCheck.h"
+
+namespace sennetctl {
+
+using namespace Pegasus;
+
+namespace {
+
+std::string textIn(const CIMInstance& instance, const char* property) {
+    const Uint32 position = instance.findProperty(CIMName(property));
+    return position == PEG_NOT_FOUND ? std::string()
+                                     : textOf(instance.getProperty(position).getValue().toString());
+}
+
+/// The name of the reason, such as "Needs Root".
+std::string reasonIn(const CIMInstance& missing, const CIMClass& definition) {
+    const Uint32 inInstance = missing.findProperty(CIMName("Reason"));
+    const Uint32 inClass = definition.findProperty(CIMName("Reason"));
+    if (inInstance == PEG_NOT_FOUND || inClass == PEG_NOT_FOUND) {
+        return {};
+    }
+    const CIMProperty declared = CIMClass(definition).getProperty(inClass);
+    return ValueText().shown(missing.getProperty(inInstance).getValue(), &declared);
+}
+
+std::string nameOf(const AnsweredClass& answered) {
+    return textOf(answered.definition.getClassName());
+}
+
+}  // namespace
+
+void ServerCheck::check(const ScriptModel& model) {
+    std::vector<AnsweredClass> classes;
+    for (const ScriptSlot& slot : model.slots) {
+        if (!slot.isUsed()) {
+            continue;
+        }
+        if (std::optional<AnsweredClass> answered = ask(model, slot)) {
+            classes.push_back(std::move(*answered));
+        }
+    }
+    checkPairing(model, classes);
+    for (const AnsweredClass& answered : classes) {
+        checkColumns(model, answered);
+    }
+    checkNames(model, classes, texts, findings);
+}
+
+std::optional<AnsweredClass> ServerCheck::ask(const ScriptModel& model, const ScriptSlot& slot) {
+    const std::string& nameSpace = model.namespaceOf(slot);
+    AnsweredClass answered;
+    answered.slot = &slot;
+    try {
+        answered.definition = server.getClass(nameSpace, slot.className.value);
+    } catch (const CIMException& failure) {
+        const bool byDefault =
+            failure.getCode() == CIM_ERR_INVALID_NAMESPACE && slot.nameSpace.value.empty();
+        add(model, slot.className, Severity::Error,
+            "the server has no class " + slot.className.value + " in " + nameSpace +
+                ", so sennet leaves it out: " + reasonOf(failure) +
+                (byDefault ? " (no line N[n]= names another namespace)" : ""));
+        return std::nullopt;
+    }
+    try {
+        answered.instances = server.instances(nameSpace, slot.className.value);
+    } catch (const CIMException& failure) {
+        add(model, slot.className, Severity::Error,
+            "the server does not give the instances of " + slot.className.value +
+                ", so sennet takes it for empty: " + reasonOf(failure));
+        return answered;
+    }
+    const std::string reason = answered.instances.empty() ? reasonFor(answered, {}) : std::string();
+    add(model, slot.className, Severity::Note,
+        slot.className.value + ": " + counted(answered.instances.size(), "instance") +
+            (reason.empty() ? "" : " (" + reason + ")"));
+    return answered;
+}
+
+// The generator keeps no list for a class without instances, so that those behind it move up.
+void ServerCheck::checkPairing(const ScriptModel& model,
+                               const std::vector<AnsweredClass>& classes) {
+    std::vector<const AnsweredClass*> lists;
+    for (const AnsweredClass& answered : classes) {
+        if (!answered.instances.empty()) {
+            lists.push_back(&answered);
+        }
+    }
+    for (std::size_t k = 0; k < classes.size() && !lists.empty(); ++k) {
+        const AnsweredClass* shown = k < lists.size() ? lists[k] : nullptr;
+        if (shown == &classes[k] || (shown == nullptr && classes[k].instances.empty())) {
+            continue;
+        }
+        add(model, classes[k].slot->className, Severity::Error,
+            "a class without instances stands before others: the columns of " + nameOf(classes[k]) +
+                (shown == nullptr ? " stay empty" : " show the instances of " + nameOf(*shown)));
+    }
+}
+
+void ServerCheck::checkColumns(const ScriptModel& model, const AnsweredClass& answered) {
+    for (const ScriptText& property : answered.slot->properties) {
+        const std::optional<Column> column = columnOf(answered, property.value);
+        if (!column) {
+            add(model, property, Severity::Warning,
+                nameOf(answered) + " has no property " + property.value +
+                    ": the column stays empty");
+            continue;
+        }
+        for (const std::string& message : lossesIn(*column, answered, texts)) {
+            add(model, property, Severity::Warning, message);
+        }
+        if (wantSizes && lacksSize(*column, answered, texts)) {
+            add(model, property, Severity::Warning,
+                "neither the class nor the resource properties (" + nameOf(answered) + "." +
+                    property.value + ".Size) give a size: 255 are taken");
+        }
+        if (!answered.instances.empty() && isEmpty(*column, answered)) {
+            const std::string reason = reasonFor(answered, property.value);
+            add(model, property, Severity::Note,
+                "the column " + property.value + " is empty" +
+                    (reason.empty() ? "" : ": " + reason));
+        }
+    }
+}
+
+// What the server itself knows about it; other servers than cimomd do not tell.
+std::string ServerCheck::reasonFor(const AnsweredClass& answered, const std::string& property) {
+    const Reasons& known = missingValues();
+    const auto find = [&](const std::string& className) {
+        const auto found = known.find({className, property});
+        return found == known.end() ? std::string() : found->second;
+    };
+    for (const CIMInstance& instance : answered.instances) {
+        const std::string reason = find(textOf(instance.getClassName()));
+        if (!reason.empty()) {
+            return reason;
+        }
+    }
+    return find(nameOf(answered));
+}
+
+const ServerCheck::Reasons& ServerCheck::missingValues() {
+    constexpr const char* kNamespace = "root/cimv2";
+    constexpr const char* kClass = "Velmira_MissingValue";
+    if (reasons) {
+        return *reasons;
+    }
+    reasons.emplace();
+    try {
+        const CIMClass definition = server.getClass(kNamespace, kClass);
+        for (const CIMInstance& missing : server.instances(kNamespace, kClass)) {
+            reasons->insert({{textIn(missing, "TargetClassName"), textIn(missing, "PropertyName")},
+                             reasonIn(missing, definition)});
+        }
+    } catch (const CIMException&) {
+        // Only cimomd has this class.
+        return *reasons;
+    }
+    return *reasons;
+}
+
+void ServerCheck::add(const ScriptModel& model, const ScriptText& place, Severity severity,
+                      const std::string& message) {
+    findings.push_back({model.file, place.line, place.column, severity, message});
+}
+
+}  // namespace sennetctl

@@ -1,0 +1,152 @@
+#include "mif/MifCommands.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "CapturedOutput.h"
+#include "MifTexts.h"
+#include "report/WholeFile.h"
+#include "support/TempDirectory.h"
+
+namespace sennetctl {
+namespace {
+
+using ::testing::HasSubstr;
+
+class MifCommandsTest : public testing::Test {
+  protected:
+    std::string file(const std::string& name, const std::string& text) const {
+        return directory.write(name, text);
+    }
+    std::string fans(const std::string& name, const std::string& rows) const {
+        return file(name, mifOf(tableMif(2, "Fan", rows)));
+    }
+    std::string difference(const std::string& before, const std::string& after) {
+        CapturedOutput captured;
+        const int status = compareMifFiles(before, after, captured.plain());
+        EXPECT_EQ(status, captured.text() == "0 differences\n" ? 0 : 1);
+        return captured.text();
+    }
+
+    support::TempDirectory directory;
+    CapturedOutput output;
+};
+
+TEST_F(MifCommandsTest, CheckTellsTheFindingsOfAllFiles) {
+    const std::string good = fans("good", "{ 1, \"a\", 3 }\n");
+    const std::string bad = fans("bad", "{ 1, \"a\", \"b\" }\n");
+    EXPECT_EQ(checkMifFiles({good, bad}, {}, output.plain()), 1);
+    EXPECT_EQ(output.text(), bad +
+                                 ":20:11: error: literal where the type is an integer\n"
+                                 "2 files: 1 error, 0 warnings\n");
+    CapturedOutput fine;
+    EXPECT_EQ(checkMifFiles({good}, {}, fine.plain()), 0);
+}
+
+TEST_F(MifCommandsTest, FilesThatCannotBeReadEndTheCommand) {
+    EXPECT_THROW(checkMifFiles({directory.path("none")}, {}, output.plain()), CannotRun);
+    EXPECT_THROW(showMifFile(directory.path("none"), output.plain()), CannotRun);
+    const std::string broken = file("broken", "Start Component\nName = 7\n");
+    try {
+        showMifFile(broken, output.plain());
+        ADD_FAILURE() << "this is no MIF file";
+    } catch (const CannotRun& failure) {
+        EXPECT_EQ(failure.what(), broken + ":2:8: expected a literal, found 7");
+    }
+}
+
+TEST_F(MifCommandsTest, ShowsTables) {
+    const std::string path =
+        fans("fans", "{ 2, \"M\xFCller\", 4000000000 }\n{ 3, , unsupported }\n");
+    EXPECT_EQ(showMifFile(path, output.plain()), 0);
+    EXPECT_EQ(output.text(),
+              "Component Machine\n"
+              "\nComponentID (DMTF|ComponentID|001, 1 row)\n"
+              "Product\n"
+              "Disk\n"
+              "\nFan (Own|Fan|001, 2 rows)\n"
+              "Index  Device  Speed\n"
+              "2      M\xC3\xBCller  4000000000\n"
+              "3              unsupported\n");
+}
+
+TEST_F(MifCommandsTest, ShowsGroupsOfOneClassAsOneTable) {
+    const std::string path =
+        file("cards", kMifStart +
+                          groupMif(2, "Card", "Own|Card|001",
+                                   "Key = 1\n" + attributeMif(1, "Index", "Integer", "1")) +
+                          groupMif(3, "Card", "Own|Card|001",
+                                   "Key = 1\n" + attributeMif(1, "Index", "Integer", "-2")) +
+                          kMifEnd);
+    EXPECT_EQ(showMifFile(path, output.json()), 0);
+    EXPECT_EQ(output.document()["tables"].dump(),
+              R"([{"name":"Card","class":"Own|Card|001","attributes":[{"name":"Index",)"
+              R"("type":"Integer","key":true}],"rows":[{"Index":1},{"Index":-2}]}])");
+}
+
+TEST_F(MifCommandsTest, JsonKeepsNumbersTextsAndWhatIsMissing) {
+    const std::string path =
+        file("odd", kMifStart +
+                        groupMif(2, "Odd", "Own|Odd|001",
+                                 attributeMif(1, "Same", "Counter64", "18446744073709551615") +
+                                     attributeMif(2, "Same", "String(3)", "\"C:\\x\"") +
+                                     attributeMif(3, "None", "Integer64", "unsupported") +
+                                     attributeMif(4, "Low", "Integer64", "-9223372036854775808")) +
+                        kMifEnd);
+    EXPECT_EQ(showMifFile(path, output.json()), 0);
+    EXPECT_EQ(output.document()["tables"][0]["rows"].dump(),
+              R"j([{"Same":18446744073709551615,"Same (2)":"C:\\x","None":null,)j"
+              R"j("Low":-9223372036854775808}])j");
+    EXPECT_EQ(output.document()["tables"][0]["attributes"][1]["type"], "String(3)");
+}
+
+TEST_F(MifCommandsTest, TheOrderAndTheNumbersOfRowsAreNoDifference) {
+    EXPECT_EQ(difference(fans("old", "{ 1, \"a\", 3 }\n{ 2, \"b\", 4 }\n"),
+                         fans("new", "{ 1, \"b\", 4 }\n{ 2, \"a\", 3 }\n")),
+              "0 differences\n");
+}
+
+TEST_F(MifCommandsTest, RowsAreToldByTheirFirstAttribute) {
+    EXPECT_EQ(difference(fans("old", "{ 1, \"a\", 3 }\n{ 2, \"b\", 4 }\n"),
+                         fans("new", "{ 1, \"c\", 5 }\n{ 2, \"a\", 9 }\n")),
+              "Fan\n"
+              "  ~ a: Speed: '3' is now '9'\n"
+              "  - b\n"
+              "  + c\n"
+              "3 differences\n");
+}
+
+TEST_F(MifCommandsTest, RowsThatNothingTellsApartAreComparedAsAWhole) {
+    EXPECT_EQ(difference(fans("old", "{ 1, \"a\", 3 }\n{ 2, \"a\", 3 }\n"),
+                         fans("new", "{ 1, \"a\", 3 }\n{ 2, \"a\", 4 }\n")),
+              "Fan\n"
+              "  - a, 3\n"
+              "  + a, 4\n"
+              "2 differences\n");
+}
+
+TEST_F(MifCommandsTest, TablesAndAttributesComeAndGo) {
+    const std::string one = attributeMif(1, "One", "Integer", "1");
+    const std::string two = attributeMif(2, "Two", "Integer", "2");
+    const std::string before = file("old", kMifStart + groupMif(2, "A", "Own|A|1", one) +
+                                               groupMif(3, "B", "Own|B|1", one) + kMifEnd);
+    const std::string after = file("new", kMifStart + groupMif(2, "A", "Own|A|1", one + two) +
+                                              groupMif(3, "C", "Own|C|1", one) + kMifEnd);
+    EXPECT_EQ(difference(before, after),
+              "A\n  + attribute Two\n"
+              "B\n  - table\n"
+              "C\n  + table\n"
+              "3 differences\n");
+}
+
+TEST_F(MifCommandsTest, DifferencesInJson) {
+    EXPECT_EQ(compareMifFiles(fans("old", "{ 1, \"a\", 3 }\n"), fans("new", "{ 1, \"a\", 9 }\n"),
+                              output.json()),
+              1);
+    EXPECT_EQ(output.document().dump(),
+              R"({"changes":[{"table":"Fan","change":"changed","row":"a","attribute":"Speed",)"
+              R"("old":"3","new":"9"}]})");
+}
+
+}  // namespace
+}  // namespace sennetctl

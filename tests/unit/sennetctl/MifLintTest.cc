@@ -1,0 +1,199 @@
+#include "mif/MifLint.h"
+
+#include <gtest/gtest.h>
+
+#include <string>
+#include <vector>
+
+#include "MifTexts.h"
+
+namespace sennetctl {
+namespace {
+
+constexpr MifProfile kProfiles[] = {MifProfile::Dmi, MifProfile::Sms, MifProfile::Ca,
+                                    MifProfile::LanDesk};
+
+std::vector<Finding> check(MifProfile profile, const std::string& text) {
+    LintOptions options;
+    options.profile = profile;
+    return MifLint(options).check("f.mif", text);
+}
+
+std::string told(const std::vector<Finding>& findings) {
+    std::string text;
+    for (const Finding& finding : findings) {
+        text += std::to_string(finding.line) + ":" + std::to_string(finding.column) + ": " +
+                nameOf(finding.severity) + ": " + finding.message + "\n";
+    }
+    return text;
+}
+
+/// One letter per profile, in their order: E, W, or - for silence.
+std::string severities(const std::string& text) {
+    std::string letters;
+    for (const MifProfile profile : kProfiles) {
+        const std::vector<Finding> findings = check(profile, text);
+        EXPECT_LE(findings.size(), 1U) << told(findings);
+        letters += findings.empty() ? '-' : findings[0].severity == Severity::Error ? 'E' : 'W';
+    }
+    return letters;
+}
+
+std::string withAttribute(const std::string& type, const std::string& value,
+                          const std::string& name = "Speed") {
+    return mifOf(groupMif(2, "Fan", "Own|Fan|001", attributeMif(1, name, type, value)));
+}
+
+TEST(MifLintTest, AFileWithoutFaultHasNoFindings) {
+    EXPECT_EQ(severities(withAttribute("Integer", "7")), "----");
+    EXPECT_EQ(severities(mifOf(tableMif(2, "Fan", "{ 1, \"a\", 3 }\n"))), "----");
+}
+
+TEST(MifLintTest, BrokenStructureIsAnErrorForAll) {
+    EXPECT_EQ(severities("Start Component\n"), "EEEE");
+    EXPECT_EQ(severities(withAttribute("Counter", "4294967296")), "EEEE");
+    EXPECT_EQ(told(check(MifProfile::Sms, "Start Component\nName = 7\n")),
+              "2:8: error: expected a literal, found 7\n");
+}
+
+TEST(MifLintTest, TextWhereTheTypeIsAnInteger) {
+    EXPECT_EQ(severities(withAttribute("Integer", "\"7\"")), "EEEE");
+}
+
+TEST(MifLintTest, IntegerWhereTheTypeIsAString) {
+    EXPECT_EQ(severities(withAttribute("String(8)", "7")), "EWW-");
+}
+
+TEST(MifLintTest, IntegersBeyond32Bits) {
+    EXPECT_EQ(severities(withAttribute("Integer", "2147483647")), "----");
+    EXPECT_EQ(severities(withAttribute("Integer", "-2147483648")), "----");
+    EXPECT_EQ(severities(withAttribute("Integer", "2147483648")), "EWWW");
+    EXPECT_EQ(severities(withAttribute("Integer", "-2147483649")), "EWWW");
+    EXPECT_EQ(severities(withAttribute("Integer64", "2147483648")), "----");
+}
+
+TEST(MifLintTest, LiteralsLongerThanTheirType) {
+    EXPECT_EQ(severities(withAttribute("String(3)", "\"abc\"")), "----");
+    EXPECT_EQ(severities(withAttribute("String(3)", "\"abcd\"")), "EWWW");
+}
+
+TEST(MifLintTest, TextsThatAProductCuts) {
+    EXPECT_EQ(severities(withAttribute("String(999)", "\"" + std::string(255, 'x') + "\"")),
+              "----");
+    EXPECT_EQ(severities(withAttribute("String(999)", "\"" + std::string(256, 'x') + "\"")),
+              "-W-W");
+}
+
+TEST(MifLintTest, SeveralInstancesWithoutAKey) {
+    const std::string attribute = attributeMif(1, "Speed", "Integer", "7");
+    EXPECT_EQ(severities(mifOf(groupMif(2, "Fan", "Own|Fan|001", attribute) +
+                               groupMif(3, "Fan", "Own|Fan|001", attribute))),
+              "EEWW");
+    EXPECT_EQ(severities(mifOf(groupMif(2, "Fan", "Own|Fan|001", "Key = 1\n" + attribute) +
+                               groupMif(3, "Fan", "Own|Fan|001", "Key = 1\n" + attribute))),
+              "----");
+}
+
+TEST(MifLintTest, ClassesOfTheMachinesOwnRecord) {
+    const std::string attribute = attributeMif(1, "Speed", "Integer", "7");
+    EXPECT_EQ(severities(mifOf(groupMif(2, "ARCHITECTURE", "Own|Fan|001", attribute))), "-E--");
+    EXPECT_EQ(severities(mifOf(groupMif(2, "Fan", "Own|Identification|001", attribute))), "-E--");
+}
+
+TEST(MifLintTest, NamesAndTextsThatOldReadersRefuse) {
+    EXPECT_EQ(severities(withAttribute("Integer", "7", "Speed ")), "-E--");
+    EXPECT_EQ(severities(withAttribute("Integer", "7", "Top \\\"Speed\\\"")), "-E--");
+    EXPECT_EQ(severities(withAttribute("String(9)", "\"3.5\\\"\"")), "-E--");
+}
+
+TEST(MifLintTest, UnsupportedAsAValue) {
+    EXPECT_EQ(severities(withAttribute("Integer", "unsupported")), "-W--");
+}
+
+TEST(MifLintTest, OctetsBeyondAscii) {
+    EXPECT_EQ(severities(withAttribute("String(9)", "\"M\xFCller\"")), "-EWW");
+    EXPECT_EQ(severities("\xEF\xBB\xBF" + withAttribute("Integer", "7")), "-EWW");
+    std::string twoOctets = "\xFE\xFF";
+    for (const char c : withAttribute("Integer", "7")) {
+        twoOctets += '\0';
+        twoOctets += c;
+    }
+    EXPECT_EQ(severities(twoOctets), "-EWW");
+}
+
+TEST(MifLintTest, TheFirstOctetBeyondAsciiIsTheOneTold) {
+    EXPECT_EQ(told(check(MifProfile::Ca, withAttribute("String(9)", "\"\xE2\x80\x99\""))),
+              "16:65: warning: 3 octets beyond ASCII, of which this is the first: other "
+              "characters arrive\n");
+}
+
+TEST(MifLintTest, LineEndsInLiterals) {
+    EXPECT_EQ(severities(withAttribute("String(9)", "\"a\nb\"")), "E---");
+    EXPECT_EQ(severities(withAttribute("String(9)", "\"a\\\r\\\nb\"")), "E---");
+}
+
+TEST(MifLintTest, ClassesOffTheConvention) {
+    const std::string attribute = attributeMif(1, "Speed", "Integer", "7");
+    EXPECT_EQ(severities(mifOf(groupMif(2, "Fan", "Own|Fan", attribute))), "W-WW");
+    EXPECT_EQ(severities(mifOf(groupMif(2, "Fan", "Own||001", attribute))), "W-WW");
+}
+
+TEST(MifLintTest, AFileWithoutComponentId) {
+    EXPECT_EQ(
+        severities(kMifStart +
+                   groupMif(2, "Fan", "Own|Fan|001", attributeMif(1, "Speed", "Integer", "7")) +
+                   kMifEnd),
+        "W-WW");
+}
+
+TEST(MifLintTest, Dates) {
+    EXPECT_EQ(severities(withAttribute("Date", "\"20260131235959.000000+060\"")), "----");
+    EXPECT_EQ(severities(withAttribute("Date", "\"20261331235959.000000+060\"")), "EWWW");
+    EXPECT_EQ(severities(withAttribute("Date", "7")), "EWWW");
+    EXPECT_EQ(severities(withAttribute("Date", "\"\"")), "E---");
+}
+
+TEST(MifLintTest, TemplatesWithoutATable) {
+    EXPECT_EQ(severities(mifOf("Start Group Name = \"Fan\" Class = \"Own|Fan|001\" Key = 1\n" +
+                               attributeMif(1, "Index", "Integer", "1") + "End Group\n")),
+              "WWWW");
+}
+
+TEST(MifLintTest, PlainBackslashesAreForOneProductOnly) {
+    EXPECT_EQ(severities(withAttribute("String(9)", "\"C:\\dir\"")), "EE-E");
+}
+
+TEST(MifLintTest, ValuesInTablesAreChecked) {
+    const std::vector<Finding> findings = check(
+        MifProfile::Sms, mifOf(tableMif(2, "Fan", "{ 1, \"a\", 3000000000 }\n{ 2, 7, \"x\" }\n")));
+    EXPECT_EQ(told(findings),
+              "20:11: warning: integer beyond the type Integer, 32 bits with sign: arrives wrong "
+              "or negative\n"
+              "21:6: warning: integer where the type is a string\n"
+              "21:9: error: literal where the type is an integer\n");
+}
+
+TEST(MifLintTest, LargeFiles) {
+    LintOptions options{MifProfile::Sms, 1};
+    const std::string text = withAttribute("Integer", "7");
+    const std::string padding = "// " + std::string(1021 - text.size(), 'x');
+    EXPECT_EQ(told(MifLint(options).check("f", text + padding)), "");
+    EXPECT_EQ(told(MifLint(options).check("f", text + padding + "x")),
+              "1:1: warning: file of 2 KB: the site takes 1\n");
+}
+
+TEST(MifLintTest, AttributesThatAnEarlierFileHad) {
+    LintOptions options;
+    options.profile = MifProfile::Sms;
+    MifLint lint(options);
+    lint.check("old", mifOf(groupMif(2, "Fan", "Own|Fan|001",
+                                     attributeMif(1, "Speed", "Integer", "7") +
+                                         attributeMif(2, "Colour", "Integer", "7"))));
+    EXPECT_EQ(told(lint.check("new", withAttribute("Integer", "7"))),
+              "14:20: warning: the attribute Colour of the class Own|Fan|001, which an earlier "
+              "file had, is missing: it becomes NULL\n");
+    EXPECT_EQ(told(lint.check("newer", withAttribute("Integer", "7"))), "");
+}
+
+}  // namespace
+}  // namespace sennetctl

@@ -1,0 +1,191 @@
+#include "script/ServerCheck.h"
+
+#include <gtest/gtest.h>
+
+#include "FanServer.h"
+#include "report/WholeFile.h"
+#include "script/ScriptLint.h"
+#include "script/ScriptReader.h"
+
+namespace sennetctl {
+namespace {
+
+using support::Reply;
+
+class ServerCheckTest : public testing::Test {
+  protected:
+    /// What the server has to say to a script that is without fault by itself.
+    std::string check(const std::string& cim, const std::string& title = "Fans") {
+        std::vector<Finding> findings;
+        ScriptModel model = ScriptReader("x.script.inv", findings)
+                                .read("[DEFAULT]\ntitle=" + title + "\n[CIM]\n" + cim);
+        checkScript(model, findings);
+        EXPECT_TRUE(findings.empty()) << findings[0].message;
+        LocalServer server;
+        ServerCheck(server, texts, wantSizes, findings).check(model);
+        std::string text;
+        for (const Finding& finding : findings) {
+            if (finding.severity != Severity::Note || wantNotes) {
+                text += std::to_string(finding.line) + ":" + std::to_string(finding.column) + ": " +
+                        nameOf(finding.severity) + ": " + finding.message + "\n";
+            }
+        }
+        return text;
+    }
+
+    void addClass(const std::string& name, const std::string& instances) {
+        fans.server.onGetClass(
+            name, Reply::ok("<CLASS NAME=\"" + name +
+                            "\"><PROPERTY NAME=\"DeviceID\" TYPE=\"string\"/></CLASS>"));
+        fans.server.onEnumerateInstances(name, Reply::ok(instances));
+    }
+
+    FanServer fans;
+    Velm::Properties texts;
+    bool wantSizes = false;
+    bool wantNotes = false;
+};
+
+TEST_F(ServerCheckTest, CountsInstancesAndSaysNothingElseToAGoodScript) {
+    wantNotes = true;
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State,Bytes\n"),
+              "4:6: note: CIM_Fan: 2 instances\n");
+}
+
+TEST_F(ServerCheckTest, ClassesThatTheServerDoesNotKnow) {
+    EXPECT_EQ(check("G[0]=CIM_X\nN[0]=root/cimv2\nA[0]=DeviceID\n"),
+              "4:6: error: the server has no class CIM_X in root/cimv2, so sennet leaves it out: "
+              "CIM_ERR_NOT_FOUND (6): CIM_ERR_NOT_FOUND: CIM_X\n");
+    fans.server.onGetClass("CIM_X", Reply::cimError(3, "no such namespace"));
+    EXPECT_EQ(check("G[0]=CIM_X\nA[0]=DeviceID\n"),
+              "4:6: error: the server has no class CIM_X in root/velmira, so sennet leaves it out: "
+              "CIM_ERR_INVALID_NAMESPACE (3): no such namespace (no line N[n]= names another "
+              "namespace)\n");
+}
+
+TEST_F(ServerCheckTest, InstancesThatTheServerDoesNotGive) {
+    fans.server.onEnumerateInstances("CIM_Fan", Reply::cimError(1, "out of order"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),
+              "4:6: error: the server does not give the instances of CIM_Fan, so sennet takes it "
+              "for empty: CIM_ERR_FAILED (1): out of order\n");
+}
+
+TEST_F(ServerCheckTest, AServerThatBreaksDownEndsTheCheck) {
+    fans.server.onGetClass("CIM_Fan", Reply::closeAtOnce());
+    EXPECT_THROW(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"), CannotRun);
+}
+
+TEST_F(ServerCheckTest, PropertiesThatTheClassLacks) {
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,Colour\n"),
+              "5:15: warning: CIM_Fan has no property Colour: the column stays empty\n");
+}
+
+TEST_F(ServerCheckTest, AnEmptyClassLetsTheNextOnesMoveUp) {
+    addClass("CIM_None", "");
+    addClass("CIM_Card", instanceXml("CIM_Card", "c", ""));
+    texts.set("CIM_None.DeviceID", "None");
+    texts.set("CIM_Card.DeviceID", "Card");
+    EXPECT_EQ(check("G[0]=CIM_None\nA[0]=DeviceID\nG[1]=CIM_Card\nA[1]=DeviceID\n"
+                    "G[2]=CIM_Fan\nA[2]=DeviceID\n"),
+              "4:6: error: a class without instances stands before others: the columns of CIM_None "
+              "show the instances of CIM_Card\n"
+              "6:6: error: a class without instances stands before others: the columns of CIM_Card "
+              "show the instances of CIM_Fan\n"
+              "8:6: error: a class without instances stands before others: the columns of CIM_Fan "
+              "stay empty\n");
+}
+
+TEST_F(ServerCheckTest, AnEmptyClassBehindTheOthersDoesNoHarm) {
+    addClass("CIM_None", "");
+    texts.set("CIM_None.DeviceID", "Other");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\nG[1]=CIM_None\nA[1]=DeviceID\n"), "");
+}
+
+TEST_F(ServerCheckTest, IntegersBeyond32Bits) {
+    fans.setFans(fanXml("a", "2", "2147483647"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Bytes\n"), "");
+    fans.setFans(fanXml("a", "2", "2147483648") + fanXml("b", "2", "8589934592"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Bytes\n"),
+              "5:6: warning: 2 values of Bytes beyond 32 bits with sign: another number is "
+              "written\n");
+}
+
+TEST_F(ServerCheckTest, TextsThatAreCutOrLongerThanTheirColumn) {
+    fans.setFans(fanXml(std::string(65, 'x'), "2", "1"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),
+              "5:6: warning: 1 value of DeviceID longer than the column of 64\n");
+    texts.set("CIM_Fan.DeviceID.Size", "255");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"), "");
+    fans.setFans(fanXml(std::string(256, 'x'), "2", "1"));
+    texts.set("CIM_Fan.DeviceID.Size", "300");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),
+              "5:6: warning: 1 value of DeviceID cut, for texts end at 255 characters, and other "
+              "values at 32\n");
+}
+
+TEST_F(ServerCheckTest, EmptyColumnsAndTheirReason) {
+    wantNotes = true;
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Spare\n"),
+              "4:6: note: CIM_Fan: 2 instances\n5:6: note: the column Spare is empty\n");
+    const std::string definition =
+        R"(<CLASS NAME="Velmira_MissingValue"><PROPERTY NAME="Reason" TYPE="uint16">)"
+        R"(<QUALIFIER NAME="ValueMap" TYPE="string"><VALUE.ARRAY><VALUE>3</VALUE></VALUE.ARRAY>)"
+        R"(</QUALIFIER><QUALIFIER NAME="Values" TYPE="string"><VALUE.ARRAY>)"
+        R"(<VALUE>Needs Root</VALUE></VALUE.ARRAY></QUALIFIER></PROPERTY></CLASS>)";
+    fans.server.onGetClass("Velmira_MissingValue", Reply::ok(definition));
+    fans.server.onEnumerateInstances(
+        "Velmira_MissingValue",
+        Reply::ok(instanceXml(
+            "Velmira_MissingValue", "m",
+            R"(<PROPERTY NAME="TargetClassName" TYPE="string"><VALUE>CIM_Fan</VALUE></PROPERTY>)"
+            R"(<PROPERTY NAME="PropertyName" TYPE="string"><VALUE>Spare</VALUE></PROPERTY>)"
+            R"(<PROPERTY NAME="Reason" TYPE="uint16"><VALUE>3</VALUE></PROPERTY>)")));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Spare\n"),
+              "4:6: note: CIM_Fan: 2 instances\n"
+              "5:6: note: the column Spare is empty: Needs Root\n");
+}
+
+TEST_F(ServerCheckTest, ColumnsWithoutASize) {
+    wantSizes = true;
+    texts.set("CIM_Fan.State.Size", "16");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State,Bytes,Spare\n"),
+              "5:27: warning: neither the class nor the resource properties (CIM_Fan.Spare.Size) "
+              "give a size: 255 are taken\n");
+}
+
+TEST_F(ServerCheckTest, NamesThatCollideForAllProducts) {
+    texts.set("CIM_Fan.DeviceID", "Thing");
+    texts.set("CIM_Fan.State", " Thing ");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State\n"),
+              "5:15: warning: two columns are called Thing: for all products this one becomes "
+              "Thing3\n");
+}
+
+TEST_F(ServerCheckTest, NamesThatCollideWhereTheyAreCut) {
+    texts.set("CIM_Fan.DeviceID", "Twenty characters 20");
+    texts.set("CIM_Fan.State", "Twenty characters 21");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State\n"),
+              "5:6: warning: the name Twenty characters 20 is cut to Twenty_characters_ for QVE "
+              "with Lumo\n"
+              "5:15: warning: the name Twenty characters 21 is cut to Twenty_characters_ for QVE "
+              "with Lumo\n");
+}
+
+TEST_F(ServerCheckTest, NamesThatCollideWhereWordsAreAbbreviated) {
+    texts.set("CIM_Fan.DeviceID", "DeviceID");
+    texts.set("CIM_Fan.State", "Device");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State\n"),
+              "5:15: warning: two columns are called DEV for QVE with Lumo, which refuses the "
+              "table\n");
+}
+
+TEST_F(ServerCheckTest, TitlesThatAreShortened) {
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n", "Thirteen char"), "");
+    const std::string told = check("G[0]=CIM_Fan\nA[0]=DeviceID\n", "Fourteen chars");
+    EXPECT_EQ(told.rfind("2:7: warning: the title Fourteen chars is shortened to Fourteen_c", 0),
+              0U);
+    EXPECT_EQ(told.substr(told.size() - 19), " for QVE with Lumo\n");
+}
+
+}  // namespace
+}  // namespace sennetctl
