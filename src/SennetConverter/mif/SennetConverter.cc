@@ -76,7 +76,7 @@ void SennetConverter::printTable(CimScriptParser& parser, Array<CIMClass>& class
     Output(header.getCString());
     ++nextGroupId;
 
-    if (sharedRows != nullptr && sharedRows->show(instanceLists)) {
+    if (sharedRows != nullptr && sharedRows->show(instanceLists, *this)) {
         for (const std::string& rows : sharedRows->take()) {
             Output(rows.c_str());
         }
@@ -97,7 +97,7 @@ void SennetConverter::printRows(CimScriptParser& parser, Array<CIMClass>& classe
         }
     }
     if (sharedRows != nullptr) {
-        sharedRows->start(instanceLists);
+        sharedRows->start(instanceLists, *this);
     }
     const Uint32 rows = largestListSize(instanceLists);
     for (Uint32 row = style.firstRowLast ? 1 : 0; row < rows; ++row) {

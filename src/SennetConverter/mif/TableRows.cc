@@ -12,7 +12,8 @@ constexpr std::size_t kTextSize = std::size_t{64} * 1024;
 
 }  // namespace
 
-void TableRows::start(const CimInstanceLists& instanceLists) {
+void TableRows::start(const CimInstanceLists& instanceLists, const SennetConverter& theAuthor) {
+    author = &theAuthor;
     texts.clear();
     shown.clear();
     for (int i = 0; i < instanceLists.getNumberOfInstanceLists(); ++i) {
@@ -27,8 +28,8 @@ void TableRows::add(std::string_view row) {
     texts.back() += row;
 }
 
-bool TableRows::show(const CimInstanceLists& instanceLists) const {
-    if (shown.empty() ||
+bool TableRows::show(const CimInstanceLists& instanceLists, const SennetConverter& reader) const {
+    if (author == &reader || shown.empty() ||
         shown.size() != static_cast<std::size_t>(instanceLists.getNumberOfInstanceLists())) {
         return false;
     }

@@ -12,22 +12,28 @@
 namespace Pegasus {
 
 class CimInstanceLists;
+class SennetConverter;
 
 /// Shared by two converters that render values alike. The first to write a table keeps its rows
-/// here, the second writes these.
+/// here, the second writes these. A converter never gets back what it wrote itself: that was for
+/// another script.
 class TableRows {
   public:
-    /// Forgets earlier rows; those added from now on show `instanceLists`.
-    void start(const CimInstanceLists& instanceLists);
+    /// Forgets earlier rows; those added from now on are written by `author` and show
+    /// `instanceLists`.
+    void start(const CimInstanceLists& instanceLists, const SennetConverter& author);
     void add(std::string_view row);
 
-    /// Whether rows are kept, and show these very instances, not merely equal ones.
-    bool show(const CimInstanceLists& instanceLists) const;
+    /// Whether rows are kept that another than `reader` wrote, and that show these very instances,
+    /// not merely equal ones.
+    bool show(const CimInstanceLists& instanceLists, const SennetConverter& reader) const;
 
     /// The rows, several in each text. Forgets them.
     std::deque<std::string> take();
 
   private:
+    // To be compared only.
+    const SennetConverter* author = nullptr;
     std::vector<Array<CIMInstance>> shown;
     std::deque<std::string> texts;
 };

@@ -41,34 +41,41 @@ std::string joined(const std::deque<std::string>& texts) {
     return all;
 }
 
-TEST(TableRows, AreThoseOfTheVeryInstances) {
+class TableRowsTest : public ConverterFixture {
+  protected:
+    const QveSennetConverter writer{outputName(), properties, 30};
+    const QveSennetConverter reader{outputName(), properties, 30};
+};
+
+TEST_F(TableRowsTest, AreThoseOfTheVeryInstances) {
     const Inventory one = fans({"a"});
     const Inventory equal = fans({"a"});
     TableRows rows;
-    EXPECT_FALSE(rows.show(one.lists));
-    rows.start(one.lists);
+    EXPECT_FALSE(rows.show(one.lists, reader));
+    rows.start(one.lists, writer);
     rows.add("row 1\r\n");
     rows.add("row 2\r\n");
-    EXPECT_TRUE(rows.show(one.lists));
-    EXPECT_FALSE(rows.show(equal.lists));
+    EXPECT_TRUE(rows.show(one.lists, reader));
+    EXPECT_FALSE(rows.show(equal.lists, reader));
+    EXPECT_FALSE(rows.show(one.lists, writer));
     EXPECT_EQ(joined(rows.take()), "row 1\r\nrow 2\r\n");
-    EXPECT_FALSE(rows.show(one.lists));
+    EXPECT_FALSE(rows.show(one.lists, reader));
 }
 
-TEST(TableRows, AreForgottenWhenOthersAreWritten) {
+TEST_F(TableRowsTest, AreForgottenWhenOthersAreWritten) {
     const Inventory one = fans({"a"});
     const Inventory other = fans({"b"});
     TableRows rows;
-    rows.start(one.lists);
+    rows.start(one.lists, writer);
     rows.add("one");
-    rows.start(other.lists);
+    rows.start(other.lists, writer);
     rows.add("other");
-    EXPECT_FALSE(rows.show(one.lists));
-    EXPECT_TRUE(rows.show(other.lists));
+    EXPECT_FALSE(rows.show(one.lists, reader));
+    EXPECT_TRUE(rows.show(other.lists, reader));
     EXPECT_EQ(joined(rows.take()), "other");
 }
 
-TEST(TableRows, AreNotThoseOfMoreOrFewerClasses) {
+TEST_F(TableRowsTest, AreNotThoseOfMoreOrFewerClasses) {
     Array<CIMInstance> first(1, fan("a"));
     Array<CIMInstance> second(1, fan("b"));
     CimInstanceLists one;
@@ -80,19 +87,19 @@ TEST(TableRows, AreNotThoseOfMoreOrFewerClasses) {
     swapped.addInstanceList(second);
     swapped.addInstanceList(first);
     TableRows rows;
-    rows.start(both);
-    EXPECT_TRUE(rows.show(both));
-    EXPECT_FALSE(rows.show(one));
-    EXPECT_FALSE(rows.show(swapped));
-    EXPECT_FALSE(rows.show(CimInstanceLists()));
-    rows.start(CimInstanceLists());
-    EXPECT_FALSE(rows.show(CimInstanceLists()));
+    rows.start(both, writer);
+    EXPECT_TRUE(rows.show(both, reader));
+    EXPECT_FALSE(rows.show(one, reader));
+    EXPECT_FALSE(rows.show(swapped, reader));
+    EXPECT_FALSE(rows.show(CimInstanceLists(), reader));
+    rows.start(CimInstanceLists(), writer);
+    EXPECT_FALSE(rows.show(CimInstanceLists(), reader));
 }
 
-TEST(TableRows, AreAnyNumberOfAnySize) {
+TEST_F(TableRowsTest, AreAnyNumberOfAnySize) {
     const Inventory one = fans({"a"});
     TableRows rows;
-    rows.start(one.lists);
+    rows.start(one.lists, writer);
     std::string expected;
     for (int i = 0; i < 100; ++i) {
         const std::string row(i == 50 ? 200000 : 3000, static_cast<char>('!' + i % 90));
@@ -130,9 +137,6 @@ class SharedRows : public ConverterFixture {
         return rows;
     }
 
-    int abandoned = 0;
-
-  private:
     static std::string rowsIn(const std::string& document) {
         std::string rows;
         for (std::size_t at = document.find("      {"); at != std::string::npos;
@@ -141,6 +145,8 @@ class SharedRows : public ConverterFixture {
         }
         return rows;
     }
+
+    int abandoned = 0;
 };
 
 constexpr const char* kNames = "[DEFAULT]\ntitle=Names\n[CIM]\nG[0]=CIM_Fan\nA[0]=Name\n";
@@ -166,6 +172,22 @@ TEST_F(SharedRows, AreEmptyWithoutAPropertyList) {
               "{ \"1    \", }\n"
               "{ \"2    \", }\n"
               "{ \"1    \", \"c\"}\n");
+}
+
+TEST_F(SharedRows, AreNotTakenFromTheSameDocument) {
+    Inventory same = fans({"a"});
+    {
+        QveSennetConverter plain(outputName(), properties, 30);
+        QveLumoSennetConverter lumo(String(path("lumo.mif").c_str()), properties, 18);
+        plain.shareRows(lumo);
+        plain.printOutput(script(kNames), same.classes, same.lists);
+        plain.printOutput(script(kKinds), same.classes, same.lists);
+        lumo.printOutput(script(kKinds), same.classes, same.lists);
+    }
+    EXPECT_EQ(rowsIn(output()),
+              "{ \"1    \", \"a\"}\n"
+              "{ \"1    \", \"axial\",\"a\"}\n");
+    EXPECT_EQ(rowsIn(support::readFile(path("lumo.mif"))), "{ \"1    \", \"axial\",\"a\"}\n");
 }
 
 TEST_F(SharedRows, AreNotLeftOverFromAnAbandonedScript) {
