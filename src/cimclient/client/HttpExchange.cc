@@ -226,7 +226,8 @@ std::size_t HttpExchange::read(char* buffer, std::size_t capacity) {
 }
 
 void HttpExchange::skipBody() {
-    std::string ignored(kSkipOctets, '\0');
+    // Not cleared first: most often there is nothing left.
+    std::array<char, kSkipOctets> ignored;
     while (read(ignored.data(), ignored.size()) > 0) {
     }
 }

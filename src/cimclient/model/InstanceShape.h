@@ -5,6 +5,7 @@
 #include <Pegasus/Common/CIMName.h>
 #include <Pegasus/Common/CIMType.h>
 
+#include <algorithm>
 #include <utility>
 #include <vector>
 
@@ -42,9 +43,13 @@ class InstanceShape {
 
     /// The position, or PEG_NOT_FOUND.
     Uint32 find(const CIMName& name) const {
-        for (Uint32 i = 0; i < size(); ++i) {
-            if (hashes[i] == name.hash() && declarations[i].name.equal(name))
-                return i;
+        const auto end = hashes.end();
+        auto at = std::find(hashes.begin(), end, name.hash());
+        while (at != end) {
+            const auto index = static_cast<Uint32>(at - hashes.begin());
+            if (declarations[index].name.equal(name))
+                return index;
+            at = std::find(at + 1, end, name.hash());
         }
         return PEG_NOT_FOUND;
     }

@@ -104,10 +104,10 @@ CIMProperty PackedProperties::at(Uint32 index) const {
 
 CIMValue PackedProperties::value(Uint32 index) const {
     const PropertyDeclaration& property = declaration(index);
-    const auto start = Unpacker(octets.get() + index * sizeof(Uint32)).take<Uint32>();
+    const auto start = Unpacker(octets() + index * sizeof(Uint32)).take<Uint32>();
     if (start == 0)
         return CIMValue(property.type, property.isArray, property.arraySize);
-    Unpacker unpacker(octets.get() + start);
+    Unpacker unpacker(octets() + start);
     return dispatchCimType(property.type, [&]<class T>(CimTypeTag<T>) {
         if constexpr (PackableScalar<T>)
             return property.isArray ? CIMValue(unpacker.takeArray<T>())
@@ -128,15 +128,16 @@ Boolean PropertyPacker::add(const CIMValue& value) {
 
 BodyRef<PackedProperties> PropertyPacker::finish(std::shared_ptr<const InstanceShape> shape) {
     const auto head = static_cast<Uint32>(starts.size() * sizeof(Uint32));
-    std::unique_ptr<char[]> octets(new char[head + values.size()]);
+    BodyRef<PackedProperties> packed(new (head + values.size()) PackedProperties(std::move(shape)));
+    char* const octets = packed.get()->octets();
     for (Uint32& begin : starts)
         begin = begin == kNull ? 0 : head + begin;
     // Without properties there is nothing at starts.data(), not even for memcpy() to copy none of.
     char* const behindHead =
-        std::copy_n(reinterpret_cast<const char*>(starts.data()), head, octets.get());
+        std::copy_n(reinterpret_cast<const char*>(starts.data()), head, octets);
     std::copy(values.begin(), values.end(), behindHead);
     start();
-    return BodyRef<PackedProperties>(new PackedProperties(std::move(shape), std::move(octets)));
+    return packed;
 }
 
 }  // namespace Pegasus

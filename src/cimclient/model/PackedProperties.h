@@ -43,14 +43,25 @@ class PackedProperties : public SharedBody {
     /// A property of its own.
     CIMProperty at(Uint32 index) const;
 
+    static void operator delete(void* memory) { ::operator delete(memory); }
+
   private:
     friend class PropertyPacker;
-    PackedProperties(std::shared_ptr<const InstanceShape> shape, std::unique_ptr<char[]> octets)
-        : shape(std::move(shape)), octets(std::move(octets)) {}
+    explicit PackedProperties(std::shared_ptr<const InstanceShape> shape)
+        : shape(std::move(shape)) {}
+    /// The octets stand behind the object in the same piece of memory. For each property they say
+    /// where in them its value begins, 0 for null; then come the values.
+    static void* operator new(std::size_t size, std::size_t octetCount) {
+        return ::operator new(size + octetCount);
+    }
+    static void operator delete(void* memory, std::size_t /*octetCount*/) {
+        ::operator delete(memory);
+    }
+
+    char* octets() { return reinterpret_cast<char*>(this + 1); }
+    const char* octets() const { return reinterpret_cast<const char*>(this + 1); }
 
     std::shared_ptr<const InstanceShape> shape;
-    /// For each property where its value begins, 0 for null; behind them the values.
-    std::unique_ptr<char[]> octets;
 };
 
 /// Makes the packed properties of one instance after the other.

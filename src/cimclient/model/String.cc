@@ -149,19 +149,10 @@ Char16 String::operator[](Uint32 index) const {
     return getChar16Data()[index];
 }
 
-String& String::append(const Char16& character) {
-    return append(&character, 1);
-}
-
-String& String::append(const Char16* text, Uint32 n) {
+String& String::appendAfterMakingRoom(const Char16* text, Uint32 n) {
     if (n == 0)
         return *this;
     const Uint32 oldSize = size();
-    if (body && !body->isShared() && n <= body->capacity() - oldSize) {
-        std::copy_n(text, n, body->text() + oldSize);
-        body->setSize(oldSize + n);
-        return *this;
-    }
     if (n > kLargestSize - oldSize)
         throw std::bad_alloc();
     const Uint32 newSize = oldSize + n;

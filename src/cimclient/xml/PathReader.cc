@@ -111,11 +111,16 @@ bool PathReader::readKnownKey(Array<CIMKeyBinding>& keys) {
     if (known == nullptr || keys.size() >= known->size()) {
         return false;
     }
-    const KnownKey& key = (*known)[keys.size()];
+    KnownKey& key = (*known)[keys.size()];
     if (!reader.readLike(key.markup)) {
         return false;
     }
-    keys.append(makeKey(key.name, key.type, reader.takeText()));
+    const ElementText text = reader.takeText();
+    if (key.latestText != text.raw) {
+        key.latestValue = makeKey(key.name, key.type, text).getValue();
+        key.latestText = text.raw;
+    }
+    keys.append(CIMKeyBinding(key.name, key.latestValue, key.type));
     return true;
 }
 
@@ -140,7 +145,7 @@ void PathReader::learn(const CIMKeyBinding& key, Uint32 position, std::string_vi
     if (!markup || position > known->size() || position == kMostKeys) {
         return;
     }
-    KnownKey seen{key.getName(), key.getType(), std::move(*markup)};
+    KnownKey seen{key.getName(), key.getType(), std::move(*markup), {}, {}};
     if (position == known->size()) {
         known->push_back(std::move(seen));
     } else {

@@ -6,6 +6,7 @@
 #include <Pegasus/Common/CIMName.h>
 #include <Pegasus/Common/CIMObjectPath.h>
 
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -24,6 +25,9 @@ class PathReader {
         CIMName name;
         CIMKeyBinding::Type type;
         MarkupRun markup;
+        /// The latest value as it was read and as a string, for many are alike.
+        std::string latestText;
+        String latestValue;
     };
 
     /// All must outlive the path reader. With `known`, which is for the reader to fill, keys that

@@ -85,6 +85,17 @@ char* decodeXmlText(char* begin, const char* end, XmlTextKind kind) {
             p = decodeReference(p, end, out);
             continue;
         }
+        if (kind == XmlTextKind::Content) {
+            const char* const run = p;
+            while (p != end && *p != '&' && *p != '\r') {
+                ++p;
+            }
+            if (p != run) {
+                std::memmove(out, run, static_cast<std::size_t>(p - run));
+                out += p - run;
+                continue;
+            }
+        }
         char c = *p++;
         if (c == '\r') {
             c = '\n';

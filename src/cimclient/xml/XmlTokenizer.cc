@@ -25,6 +25,8 @@ constexpr OctetTable makeTable(std::string_view stops) {
 
 constexpr OctetTable kTextStops = makeTable("<>&\r");
 constexpr OctetTable kTagStops = makeTable("<>\"'");
+constexpr OctetTable kQuotedStops = makeTable("<\"'");
+constexpr OctetTable kReplacedInAttributes = makeTable("&\t\n\r");
 // What a text of known markup may not hold, references apart, is left to the general way.
 constexpr OctetTable kLeafTextStops = makeTable("<>\r");
 
@@ -363,9 +365,7 @@ void XmlTokenizer::scanTag() {
         if (quote == '\0') {
             pos = skipTo(kTagStops, window.data(), pos);
         } else {
-            while (*at(pos) != quote && *at(pos) != '<' && *at(pos) != '\0') {
-                ++pos;
-            }
+            pos = skipTo(kQuotedStops, window.data(), pos);
         }
         const char stop = *at(pos);
         if (stop == '\0') {
@@ -380,7 +380,7 @@ void XmlTokenizer::scanTag() {
         }
         ++pos;
         if (quote != '\0') {
-            quote = '\0';
+            quote = stop == quote ? '\0' : quote;
         } else if (stop == '>') {
             checkSize();
             return;
@@ -454,7 +454,7 @@ char* XmlTokenizer::parseAttribute(char* p, const char* end) {
     char* const valueBegin = p;
     bool isPlain = true;
     while (p != end && *p != quote) {
-        isPlain = isPlain && *p != '&' && (*p == ' ' || !isXmlSpace(*p));
+        isPlain &= !kReplacedInAttributes[static_cast<unsigned char>(*p)];
         ++p;
     }
     if (p == end) {

@@ -41,7 +41,7 @@ class CIMConstProperty {
     /// The position of the qualifier, or PEG_NOT_FOUND.
     Uint32 findQualifier(const CIMName& name) const;
     /// Raises IndexOutOfBoundsException.
-    CIMConstQualifier getQualifier(Uint32 index) const;
+    CIMConstQualifier getQualifier(Uint32 position) const;
     Uint32 getQualifierCount() const;
 
     Boolean isUninitialized() const { return !body; }

@@ -9,6 +9,7 @@
 #include <Pegasus/Common/Config.h>
 #include <Pegasus/Common/StringBody.h>
 
+#include <algorithm>
 #include <iosfwd>
 #include <string>
 #include <utility>
@@ -69,8 +70,14 @@ class String {
     Char16& operator[](Uint32 index);
     Char16 operator[](Uint32 index) const;
 
-    String& append(const Char16& character);
-    String& append(const Char16* text, Uint32 n);
+    String& append(const Char16& character) { return append(&character, 1); }
+    String& append(const Char16* text, Uint32 n) {
+        if (!hasRoomFor(n))
+            return appendAfterMakingRoom(text, n);
+        std::copy_n(text, n, body->text() + body->size());
+        body->setSize(body->size() + n);
+        return *this;
+    }
     String& append(const String& other);
 
     /// Takes `n` characters away, or all from `index` on. Raises IndexOutOfBoundsException when
@@ -101,6 +108,10 @@ class String {
     static Boolean equalNoCase(const String& a, const String& b);
 
   private:
+    Boolean hasRoomFor(Uint32 n) const noexcept {
+        return body && n <= body->capacity() - body->size() && !body->isShared();
+    }
+    String& appendAfterMakingRoom(const Char16* text, Uint32 n);
     void makeRoom(Uint32 capacity);
     void setUtf8(const char* bytes, Uint32 n);
 
