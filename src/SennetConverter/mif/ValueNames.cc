@@ -33,8 +33,8 @@ bool parseDecimal(const String& text, Uint64& number) {
 }  // namespace
 
 ValueNames::ValueNames(const Array<String>& theTexts, const Array<String>& theNumbers,
-                       bool theyAreMapped)
-    : texts(theTexts), numbers(theNumbers), isMapped(theyAreMapped) {
+                       bool areMapped)
+    : texts(theTexts), numbers(theNumbers), isMapped(areMapped) {
     const Array<String>& mapped = theNumbers;
     for (Uint32 i = 0; i < mapped.size(); ++i) {
         Uint64 number = 0;

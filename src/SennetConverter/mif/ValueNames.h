@@ -14,8 +14,8 @@ class ValueNames {
   public:
     /// @param texts    the elements of Values
     /// @param numbers  the elements of ValueMap
-    /// @param isMapped whether there is a ValueMap; without it a number is its own position
-    ValueNames(const Array<String>& texts, const Array<String>& numbers, bool isMapped);
+    /// @param areMapped whether there is a ValueMap; without it a number is its own position
+    ValueNames(const Array<String>& texts, const Array<String>& numbers, bool areMapped);
 
     /// The number's name, or the number in decimal when it has none.
     String nameOf(Uint64 number) const;
