@@ -29,7 +29,7 @@ class SennetConverter : public CimConverter {
                      CimInstanceLists& instanceLists) override;
 
     /// Has the rows of each table rendered once for this document and `other`, whose class must
-    /// render values as this one's does.
+    /// render values as this one's does. Each script is to be printed to both before the next.
     void shareRows(SennetConverter& other);
 
     /// Header of the group that describes instance n (0 or more), with its key attribute; before

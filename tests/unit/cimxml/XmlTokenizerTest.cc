@@ -402,5 +402,108 @@ TEST(XmlTokenizer, ExceptionsOfTheSourcePass) {
     EXPECT_THROW(tokenizer.next(), std::runtime_error);
 }
 
+constexpr const char* kOneValue = "<P><VALUE>1</VALUE></P>";
+
+TEST(XmlTokenizer, ReadsWhatIsLikeAnEarlierElement) {
+    const MarkupRun run = MarkupRun::of(kOneValue, true).value();
+    MemorySource source("<r><P><VALUE>a</VALUE></P><P><VALUE>&lt;b&#62;</VALUE></P><P/></r>");
+    XmlTokenizer tokenizer(source);
+    tokenizer.next();
+    ASSERT_TRUE(tokenizer.readLike(run));
+    ASSERT_EQ(tokenizer.textCount(), 1U);
+    const std::string_view first = tokenizer.takeText();
+    EXPECT_EQ(first, "a");
+    EXPECT_EQ(tokenizer.offsetOf(first), 13U);
+    EXPECT_EQ(tokenizer.position(), 26U);
+    ASSERT_TRUE(tokenizer.readLike(run));
+    EXPECT_EQ(tokenizer.takeText(), "<b>");
+    EXPECT_FALSE(tokenizer.readLike(run));
+    EXPECT_EQ(describe(tokenizer), "(P)/P/r");
+}
+
+TEST(XmlTokenizer, ReadsAnyNumberOfTextsInTurn) {
+    const MarkupRun run = MarkupRun::of("<P><VALUE>1</VALUE> <VALUE>2</VALUE></P>", true).value();
+    MemorySource source(
+        "<r><P><VALUE>a</VALUE> <VALUE>&amp;lt;</VALUE> <VALUE>&none;</VALUE></P></r>");
+    XmlTokenizer tokenizer(source);
+    tokenizer.next();
+    ASSERT_TRUE(tokenizer.readLike(run));
+    ASSERT_EQ(tokenizer.textCount(), 3U);
+    EXPECT_EQ(tokenizer.takeText(), "a");
+    EXPECT_EQ(tokenizer.takeText(), "&lt;");
+    try {
+        tokenizer.takeText();
+        ADD_FAILURE() << "no error";
+    } catch (const XmlError& error) {
+        EXPECT_EQ(error.message, "entity \"none\" is not defined; at byte 54");
+    }
+}
+
+TEST(XmlTokenizer, LeavesWhatDiffersToBeRead) {
+    const MarkupRun run = MarkupRun::of(kOneValue, true).value();
+    for (const char* element :
+         {"<P><VALUE>a>b</VALUE></P>", "<P><VALUE>a\rb</VALUE></P>", "<P><VALUE>1</VALUE ></P>",
+          "<P><VALUE><b/></VALUE></P>", "<P><VALUE>1</VALUE><VALUE>2</VALUE></P>",
+          " <P><VALUE>1</VALUE></P>", "<P><VALUE>1"}) {
+        const std::string document = "<r>" + std::string(element);
+        MemorySource source(document);
+        XmlTokenizer tokenizer(source);
+        tokenizer.next();
+        EXPECT_FALSE(tokenizer.readLike(run)) << element;
+        EXPECT_EQ(tokenizer.position(), 3U) << element;
+    }
+}
+
+TEST(XmlTokenizer, FindsNothingLikeItInAnElementThatIsEmpty) {
+    const MarkupRun run = MarkupRun::of("<P/>", false).value();
+    MemorySource source("<r><e/><P/></r>");
+    XmlTokenizer tokenizer(source);
+    tokenizer.next();
+    tokenizer.next();
+    EXPECT_EQ(tokenizer.name(), "e");
+    EXPECT_FALSE(tokenizer.readLike(run));
+    EXPECT_EQ(tokenizer.next(), Token::EndElement);
+    EXPECT_TRUE(tokenizer.readLike(run));
+    EXPECT_EQ(tokenizer.textCount(), 0U);
+    EXPECT_EQ(describe(tokenizer), "/r");
+}
+
+// Elements that are recognised are as deep as others, and their texts as long.
+TEST(XmlTokenizer, KeepsItsLimitsForWhatIsLikeAnEarlierElement) {
+    const MarkupRun run = MarkupRun::of(kOneValue, true).value();
+    const auto isRead = [&](XmlTokenizer::Limits limits) {
+        MemorySource source("<r><P><VALUE>123456789</VALUE></P></r>");
+        XmlTokenizer tokenizer(source, limits);
+        tokenizer.next();
+        return tokenizer.readLike(run);
+    };
+    XmlTokenizer::Limits limits;
+    limits.depth = 4;
+    limits.tokenSize = 9;
+    EXPECT_TRUE(isRead(limits));
+    limits.depth = 3;
+    EXPECT_FALSE(isRead(limits));
+    limits.depth = 4;
+    limits.tokenSize = 8;
+    EXPECT_FALSE(isRead(limits));
+}
+
+TEST(XmlTokenizer, TellsTheOctetsReadAsLongAsTheyAreAtHand) {
+    MemorySource source("<r><P N=\"1\"/><Q>&lt;</Q></r>");
+    XmlTokenizer tokenizer(source);
+    tokenizer.next();
+    const std::uint64_t begin = tokenizer.position();
+    tokenizer.next();
+    tokenizer.next();
+    EXPECT_EQ(tokenizer.readSince(begin), "<P N=\"1\"/>");
+    const std::uint64_t second = tokenizer.position();
+    tokenizer.next();
+    EXPECT_EQ(tokenizer.readSince(second), "<Q>");
+    tokenizer.next();
+    // The reference was replaced in place.
+    EXPECT_EQ(tokenizer.readSince(second), "");
+    EXPECT_EQ(tokenizer.readSince(tokenizer.position()), "");
+}
+
 }  // namespace
 }  // namespace Pegasus
