@@ -6,6 +6,7 @@
 #include <Pegasus/Common/CIMName.h>
 #include <Pegasus/Common/CIMObjectPath.h>
 
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -25,8 +26,8 @@ class PathReader {
         CIMName name;
         CIMKeyBinding::Type type;
         MarkupRun markup;
-        /// The latest value as it was read and as a string, for many are alike.
-        std::string latestText;
+        /// The latest value as it was read, if one was, and as a string, for many are alike.
+        std::optional<std::string> latestText;
         String latestValue;
     };
 

@@ -166,6 +166,29 @@ TEST(RepeatedInstances, SayWhatIsWrongFirst) {
     EXPECT_EQ(message, outcome(good + good + wrong, kInPieces));
 }
 
+std::string keyed(const std::string& type, const std::string& value) {
+    return "<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME=\"T_Thing\"><KEYBINDING NAME=\"Id\">"
+           "<KEYVALUE VALUETYPE=\"" +
+           type + "\">" + value +
+           "</KEYVALUE></KEYBINDING></INSTANCENAME><INSTANCE CLASSNAME=\"T_Thing\"/>"
+           "</VALUE.NAMEDINSTANCE>";
+}
+
+TEST(RepeatedInstances, HaveNoKeysThatAreEmptyNumbers) {
+    for (const std::string type : {"numeric", "boolean"}) {
+        const std::string value = type == "numeric" ? "1" : "true";
+        for (const std::string& members :
+             {keyed(type, value) + keyed(type, ""),
+              keyed(type, value) + keyed(type, value) + keyed(type, "")}) {
+            const std::string message = outcome(members, kAtOnce);
+            EXPECT_TRUE(message.starts_with("refused: key value \"\" is no ")) << message;
+            EXPECT_EQ(message, outcome(members, kInPieces));
+        }
+    }
+    const std::string texts = keyed("string", "a") + keyed("string", "") + keyed("string", "");
+    EXPECT_EQ(outcome(texts, kAtOnce), outcome(texts, kInPieces));
+}
+
 TEST(RepeatedInstances, AreReadStrictly) {
     const std::string good = instanceXml(property("A", "string", "a") + array("B", "uint8", {"1"}));
     for (const char* value : {"a&b;", "a]]&gt;", "a]]>", "<b/>", "&#0;", "a\rb", "a\r\nb", "a>b",
