@@ -14,8 +14,6 @@ enum class Tolerance : std::uint8_t {
     // CR and LF as they are behind a backslash in a literal: importers take the character, while
     // the escapes \r and \n reach some of them as the letters.
     RawLineEnds,
-    // CR and LF as they are in a literal, without a backslash.
-    BareLineEnds,
     // A backslash stands for itself unless CR, LF or a double quote follows it.
     PlainBackslashes,
     // A bare integer where the type is a string: row numbers, and integers that a product wants
@@ -26,10 +24,6 @@ enum class Tolerance : std::uint8_t {
     TextAsIntegers,
     // Numbers up to 4294967295 where the type is Integer: the low word of a 64-bit value.
     UnsignedIntegers,
-    // Any number of 64 bits where the type is Integer.
-    WideIntegers,
-    // Any literal or integer where the type is a date.
-    AnyDates,
     // An empty literal where the type is a date: the value of a template.
     EmptyDates,
     // A literal longer than its type says: the length comes from the class definition, which
@@ -37,6 +31,12 @@ enum class Tolerance : std::uint8_t {
     LongLiterals,
     // Two attributes of a group with one name: abbreviating comes after the names are made unique.
     RepeatedNames,
+    // CR and LF as they are in a literal, without a backslash.
+    BareLineEnds,
+    // Any number of 64 bits where the type is Integer.
+    WideIntegers,
+    // Any literal or integer where the type is a date.
+    AnyDates,
 };
 
 // The name of a tolerance in command lines: "raw-line-ends", "plain-backslashes" and so on.

@@ -17,6 +17,7 @@
 #include "report/Output.h"
 #include "report/Text.h"
 #include "script/CheckCommand.h"
+#include "script/NewCommand.h"
 #include "server/GetCommand.h"
 #include "server/ServerCommand.h"
 
@@ -96,6 +97,32 @@ void addCheck(CLI::App& app, Choice& choice) {
                       "tell names and sizes that the resource properties lack, too");
     command->callback([&choice, options] {
         choice.command = [options](const Output& output) { return checkScripts(*options, output); };
+    });
+}
+
+void addNew(CLI::App& app, Choice& choice) {
+    CLI::App* command = addCommand(
+        app, choice, "new", "Write a first inventory script for classes of the CIM server.",
+        "  sennetctl new fans.script.inv --class CIM_Fan\n"
+        "  sennetctl new own.script.inv --class OWN_Order --class OWN_Item -n root/own "
+        "--title Orders");
+    const auto options = std::make_shared<NewOptions>();
+    command->add_option("SCRIPT", options->script, "the file, whose name ends in .script.inv")
+        ->option_text("SCRIPT")
+        ->required();
+    command->add_option("--class", options->classes, "a class; at most ten of them")
+        ->option_text("CLASS")
+        ->required();
+    command
+        ->add_option("-n,--namespace", options->nameSpace,
+                     "namespace of the classes, by default root/cimv2")
+        ->option_text("NAMESPACE");
+    command->add_option("--title", options->title, "by default made of the file's name")
+        ->option_text("TITLE");
+    command->callback([&choice, options] {
+        choice.command = [options](const Output& output) {
+            return writeNewScript(*options, output);
+        };
     });
 }
 
@@ -218,6 +245,7 @@ int runCommandLine(int argc, char** argv) {
     addServer(app, choice);
     addGet(app, choice);
     addMif(app, choice);
+    addNew(app, choice);
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

@@ -5,6 +5,25 @@
 
 namespace sennetctl {
 
+namespace {
+
+constexpr std::size_t kMostFindings = 1000;
+
+}  // namespace
+
+void LintReport::add(LintRule rule, Mif::Position position, const std::string& message) {
+    const std::optional<Severity> severity = severityOf(rule, profile);
+    if (!severity || findings.size() > kMostFindings) {
+        return;
+    }
+    if (findings.size() == kMostFindings) {
+        findings.push_back({file, position.line, position.column, Severity::Note,
+                            "there are more findings, which are not told"});
+        return;
+    }
+    findings.push_back({file, position.line, position.column, *severity, message});
+}
+
 std::vector<Finding> LintReport::take() {
     std::stable_sort(findings.begin(), findings.end(),
                      [](const Finding& one, const Finding& other) {

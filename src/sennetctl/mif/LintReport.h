@@ -16,12 +16,8 @@ class LintReport {
     LintReport(std::string theFile, MifProfile theProfile)
         : file(std::move(theFile)), profile(theProfile) {}
 
-    /// Adds a finding unless the profile does not mind.
-    void add(LintRule rule, Mif::Position position, const std::string& message) {
-        if (const std::optional<Severity> severity = severityOf(rule, profile)) {
-            findings.push_back({file, position.line, position.column, *severity, message});
-        }
-    }
+    /// Adds a finding unless the profile does not mind, or there are too many for anybody to read.
+    void add(LintRule rule, Mif::Position position, const std::string& message);
 
     /// The findings in the order of their places.
     std::vector<Finding> take();

@@ -14,8 +14,8 @@ class CannotRun : public std::runtime_error {
     using std::runtime_error::runtime_error;
 };
 
-/// More than any script or MIF file that a product takes.
-constexpr std::size_t kLargestFileOctets = std::size_t(64) << 20;
+/// Far more than any MIF file that a product takes, and little enough to hold what it says.
+constexpr std::size_t kLargestFileOctets = std::size_t(16) << 20;
 
 /// The octets of a regular file, links followed. Throws CannotRun, "PATH: reason", when it cannot
 /// be read or is larger than the limit.

@@ -21,6 +21,8 @@ namespace sennetctl {
 
 namespace {
 
+constexpr std::size_t kLargestScriptOctets = std::size_t(1) << 20;
+
 std::vector<std::string> installedScripts() {
     const char* directory = Velm::PlatformUtilities::getSennetDirectory();
     const Velm::DirectoryReader reader(directory, ".script.inv");
@@ -69,7 +71,8 @@ class Progress {
 std::vector<Finding> checkScriptFile(const std::string& file, const CheckOptions& options,
                                      const Velm::Properties& texts, LocalServer* server) {
     std::vector<Finding> findings;
-    ScriptModel model = ScriptReader(file, findings).read(readWholeFile(file));
+    ScriptModel model =
+        ScriptReader(file, findings).read(readWholeFile(file, kLargestScriptOctets));
     checkScript(model, findings);
     if (options.translations) {
         checkTranslations(model, texts, findings);

@@ -50,6 +50,7 @@ TEST_F(ProgramTest, HelpHasExamplesOnEveryLevel) {
                                                {"server", "--help"},
                                                {"get", "--help"},
                                                {"check", "--help"},
+                                               {"new", "--help"},
                                                {"mif", "--help"},
                                                {"mif", "check", "--help"},
                                                {"mif", "show", "--help"},

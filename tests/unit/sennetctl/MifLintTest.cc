@@ -173,6 +173,16 @@ TEST(MifLintTest, ValuesInTablesAreChecked) {
               "21:9: error: literal where the type is an integer\n");
 }
 
+TEST(MifLintTest, NobodyReadsMoreThanAThousandFindings) {
+    std::string rows;
+    for (int i = 0; i < 2000; ++i) {
+        rows += "{ 1, 7 }\n";
+    }
+    const std::vector<Finding> findings = check(MifProfile::Sms, mifOf(tableMif(2, "Fan", rows)));
+    ASSERT_EQ(findings.size(), 1001U);
+    EXPECT_EQ(findings.back().message, "there are more findings, which are not told");
+}
+
 TEST(MifLintTest, LargeFiles) {
     LintOptions options{MifProfile::Sms, 1};
     const std::string text = withAttribute("Integer", "7");

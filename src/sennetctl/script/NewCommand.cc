@@ -1,0 +1,106 @@
+#include "script/NewCommand.h"
+
+#include <Velm/TextFile.h>
+
+#include <filesystem>
+#include <ostream>
+
+#include "cim/CimText.h"
+#include "cim/LocalServer.h"
+#include "report/Json.h"
+#include "report/Text.h"
+#include "report/WholeFile.h"
+#include "script/NewScript.h"
+#include "script/ScriptModel.h"
+
+namespace sennetctl {
+
+namespace {
+
+constexpr std::string_view kSuffix = ".script.inv";
+constexpr int kOpenForWriting = 1;
+
+/// The path without .script.inv.
+std::string pathWithoutSuffix(const std::string& script) {
+    if (script.size() <= kSuffix.size() ||
+        script.compare(script.size() - kSuffix.size(), kSuffix.size(), kSuffix) != 0) {
+        throw CannotRun(script + ": the name of a script ends in .script.inv");
+    }
+    return script.substr(0, script.size() - kSuffix.size());
+}
+
+void refuseExisting(const std::string& path) {
+    if (Velm::TextFile(path.c_str()).exists()) {
+        throw CannotRun(path + ": exists already");
+    }
+}
+
+void writeFile(const std::string& path, const std::string& text) {
+    Velm::TextFile file(path.c_str());
+    const bool written = file.open(kOpenForWriting) == 0 &&
+                         file.writeLine(text.data(), static_cast<int>(text.size())) >= 0;
+    if (file.close() != 0 || !written) {
+        throw CannotRun(path + ": cannot be written");
+    }
+}
+
+std::vector<AnsweredClass> askFor(const NewOptions& options) {
+    LocalServer server;
+    std::vector<AnsweredClass> classes;
+    for (const std::string& name : options.classes) {
+        try {
+            classes.push_back({nullptr, server.getClass(options.nameSpace, name),
+                               server.instances(options.nameSpace, name)});
+        } catch (const Pegasus::CIMException& failure) {
+            throw CannotRun(options.nameSpace + ":" + name + ": " + reasonOf(failure));
+        }
+    }
+    return classes;
+}
+
+void report(const std::string& script, const std::string& properties, const NewScript& texts,
+            const Output& output) {
+    if (output.json) {
+        Json document = Json::object();
+        document["script"] = script;
+        document["properties"] = properties;
+        document["leftOut"] = texts.leftOut;
+        printJson(document, output);
+        return;
+    }
+    for (const std::string& leftOut : texts.leftOut) {
+        output.out << "not listed: " << printable(leftOut) << '\n';
+    }
+    output.out
+        << "Written: " << printable(script) << " and " << printable(properties)
+        << "\nEdit both, append the second to the resource properties (sennet.properties), and\n"
+           "run: sennetctl check --translations "
+        << printable(script) << '\n';
+}
+
+}  // namespace
+
+int writeNewScript(const NewOptions& options, const Output& output) {
+    const std::string path = pathWithoutSuffix(options.script);
+    const std::string properties = path + ".properties";
+    if (options.classes.size() > ScriptModel::kSlots) {
+        throw CannotRun("a script has room for 10 classes");
+    }
+    refuseExisting(options.script);
+    refuseExisting(properties);
+    const std::string stem = std::filesystem::path(path).filename().string();
+    const std::string title =
+        options.title.empty() ? readableName(stem) + " Inventory" : options.title;
+    const NewScript texts = composeScript(stem, title, options.nameSpace, askFor(options));
+    writeFile(properties, texts.properties);
+    try {
+        writeFile(options.script, texts.script);
+    } catch (const CannotRun&) {
+        Velm::TextFile(properties.c_str()).remove();
+        throw;
+    }
+    report(options.script, properties, texts, output);
+    return kFine;
+}
+
+}  // namespace sennetctl

@@ -1,0 +1,115 @@
+#include "script/NewCommand.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "CapturedOutput.h"
+#include "FanServer.h"
+#include "report/WholeFile.h"
+#include "script/CheckCommand.h"
+#include "script/NewScript.h"
+#include "support/TempDirectory.h"
+
+namespace sennetctl {
+namespace {
+
+using ::testing::ElementsAre;
+using ::testing::HasSubstr;
+using ::testing::IsEmpty;
+
+class NewCommandTest : public testing::Test {
+  protected:
+    std::string failureOf(const NewOptions& wanted) {
+        try {
+            writeNewScript(wanted, output.plain());
+        } catch (const CannotRun& failure) {
+            return failure.what();
+        }
+        return "none";
+    }
+
+    FanServer fans;
+    support::TempDirectory directory;
+    CapturedOutput output;
+    NewOptions options{directory.path("coolers.script.inv"), {"CIM_Fan"}, "root/cimv2", ""};
+};
+
+TEST_F(NewCommandTest, WritesScriptAndProperties) {
+    EXPECT_EQ(writeNewScript(options, output.plain()), 0);
+    EXPECT_EQ(directory.read("coolers.script.inv"),
+              "[DEFAULT]\n"
+              "title=Coolers Inventory\n"
+              "\n"
+              "[CIM]\n"
+              "G[0]=CIM_Fan\n"
+              "N[0]=root/cimv2\n"
+              "A[0]=DeviceID,State,Bytes\n");
+    EXPECT_EQ(directory.read("coolers.properties"),
+              "# coolers.script.inv\n"
+              "title.Coolers_Inventory=Coolers\n"
+              "CIM_Fan.DeviceID=Device ID\n"
+              "CIM_Fan.State=State\n"
+              "CIM_Fan.State.Size=64\n"
+              "CIM_Fan.Bytes=Bytes\n");
+    EXPECT_THAT(output.text(),
+                HasSubstr("not listed: CIM_Fan.Spare: it has no value on this machine\n"));
+}
+
+TEST_F(NewCommandTest, WhatItWritesIsWithoutFault) {
+    options.classes = {"CIM_Fan"};
+    options.title = "Fans";
+    writeNewScript(options, output.plain());
+    CapturedOutput checked;
+    EXPECT_EQ(checkScripts({{options.script}, false, false}, checked.plain()), 0) << checked.text();
+}
+
+TEST_F(NewCommandTest, ClassesWithoutInstancesListEverything) {
+    fans.setFans("");
+    EXPECT_EQ(writeNewScript(options, output.json()), 0);
+    EXPECT_THAT(directory.read("coolers.script.inv"),
+                HasSubstr("A[0]=DeviceID,State,Bytes,Spare\n"));
+    EXPECT_EQ(output.document()["leftOut"].dump(), "[]");
+}
+
+TEST_F(NewCommandTest, LeavesOutWhatNoFileShows) {
+    fans.server.onGetClass(
+        "CIM_Fan",
+        support::Reply::ok(
+            R"(<CLASS NAME="CIM_Fan"><PROPERTY NAME="CreationClassName" TYPE="string"/>)"
+            R"(<PROPERTY.REFERENCE NAME="Other"/><PROPERTY NAME="ID" TYPE="string"/></CLASS>)"));
+    fans.setFans("");
+    writeNewScript(options, output.json());
+    EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("A[0]=ID\n"));
+    EXPECT_EQ(output.document()["leftOut"].size(), 2U);
+}
+
+TEST_F(NewCommandTest, NothingIsReplaced) {
+    directory.write("coolers.properties", "mine");
+    EXPECT_EQ(failureOf(options), directory.path("coolers.properties") + ": exists already");
+    EXPECT_EQ(directory.read("coolers.properties"), "mine");
+    EXPECT_THAT(directory.names(), ElementsAre("coolers.properties"));
+}
+
+TEST_F(NewCommandTest, NothingIsLeftBehindByAFailure) {
+    options.classes = {"CIM_Fan", "CIM_None"};
+    EXPECT_THAT(failureOf(options), HasSubstr("root/cimv2:CIM_None: CIM_ERR_NOT_FOUND (6)"));
+    options.classes.assign(11, "CIM_Fan");
+    EXPECT_EQ(failureOf(options), "a script has room for 10 classes");
+    options = {directory.path("fans.inv"), {"CIM_Fan"}, "root/cimv2", ""};
+    EXPECT_EQ(failureOf(options),
+              directory.path("fans.inv") + ": the name of a script ends in .script.inv");
+    options = {directory.path("none/fans.script.inv"), {"CIM_Fan"}, "root/cimv2", ""};
+    EXPECT_EQ(failureOf(options), directory.path("none/fans.properties") + ": cannot be written");
+    EXPECT_THAT(directory.names(), IsEmpty());
+}
+
+TEST(ReadableNameTest, WordsBeginWithCapitals) {
+    EXPECT_EQ(readableName("MaxClockSpeed"), "Max Clock Speed");
+    EXPECT_EQ(readableName("DeviceID"), "Device ID");
+    EXPECT_EQ(readableName("OSType"), "OS Type");
+    EXPECT_EQ(readableName("own_name"), "Own name");
+    EXPECT_EQ(readableName(""), "");
+}
+
+}  // namespace
+}  // namespace sennetctl
