@@ -157,7 +157,7 @@ ServerConnection connectToLocalServer(const ServerPlaces& places, const Deadline
             return connection;
         }
         log.add(path, reason);
-        reasons += (reasons.empty() ? "" : "; ") + path + ": " + reason;
+        reasons.append(reasons.empty() ? "" : "; ").append(path).append(": ").append(reason);
     }
     for (const std::string& program : places.programs) {
         if (reasons.empty() && programExists(program)) {

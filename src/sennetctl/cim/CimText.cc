@@ -18,7 +18,7 @@ const char* statusName(Pegasus::Uint32 code) {
 }  // namespace
 
 std::string reasonOf(const Pegasus::Exception& failure) {
-    const std::string message = textOf(failure.getMessage());
+    std::string message = textOf(failure.getMessage());
     const auto* reported = dynamic_cast<const Pegasus::CIMException*>(&failure);
     if (reported == nullptr) {
         return message;

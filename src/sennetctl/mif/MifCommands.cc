@@ -64,12 +64,14 @@ void printTable(const MifTable& table, const Output& output) {
                << printable(table.name) << " (" << printable(table.className) << ", "
                << counted(table.rows.size(), "row") << ")\n";
     std::vector<std::string> titles;
+    titles.reserve(table.columns.size());
     for (const MifColumn& column : table.columns) {
         titles.push_back(column.name);
     }
     TextTable shown(titles, kWidestCell);
     for (const std::vector<Mif::Value>& values : table.rows) {
         std::vector<std::string> cells;
+        cells.reserve(values.size());
         for (const Mif::Value& value : values) {
             cells.push_back(shownValue(value));
         }

@@ -27,6 +27,7 @@ std::vector<std::string> installedScripts() {
     const char* directory = Velm::PlatformUtilities::getSennetDirectory();
     const Velm::DirectoryReader reader(directory, ".script.inv");
     std::vector<std::string> scripts;
+    scripts.reserve(static_cast<std::size_t>(reader.getNumberOfFiles()));
     for (int i = 0; i < reader.getNumberOfFiles(); ++i) {
         scripts.emplace_back(reader.getFileName(i));
     }

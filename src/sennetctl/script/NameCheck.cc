@@ -126,7 +126,7 @@ class NameChecker {
 
     /// The name as QVE takes it; tells when that cuts it.
     String shortened(const NamedColumn& column, const std::string& product, unsigned limit) {
-        const String name = SennetUtilities::formatPropertyName4quvelle(column.name, limit);
+        String name = SennetUtilities::formatPropertyName4quvelle(column.name, limit);
         if (column.name.size() > limit) {
             add(column.place, "the name " + textOf(column.name) + " is cut to " + textOf(name) +
                                   " for " + product);

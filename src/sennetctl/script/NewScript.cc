@@ -59,7 +59,7 @@ class Composer {
                                          (tooLong ? "the line would be too long" : reason));
                 continue;
             }
-            list += (first ? "" : ",") + name;
+            list.append(first ? "" : ",").append(name);
             first = false;
             addNames(answered, className, name);
         }

@@ -136,7 +136,7 @@ std::string ServerCheck::reasonFor(const AnsweredClass& answered, const std::str
         return found == known.end() ? std::string() : found->second;
     };
     for (const CIMInstance& instance : answered.instances) {
-        const std::string reason = find(textOf(instance.getClassName()));
+        std::string reason = find(textOf(instance.getClassName()));
         if (!reason.empty()) {
             return reason;
         }

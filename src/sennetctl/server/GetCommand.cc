@@ -108,6 +108,7 @@ void printInstancesJson(const GetOptions& options, const ClassContent& content,
 void printTable(const ClassContent& content, const std::vector<Column>& columns,
                 const Output& output) {
     std::vector<std::string> titles;
+    titles.reserve(columns.size());
     for (const Column& column : columns) {
         titles.push_back(textOf(column.name));
     }
@@ -115,6 +116,7 @@ void printTable(const ClassContent& content, const std::vector<Column>& columns,
     ValueText values;
     for (const CIMInstance& instance : content.instances) {
         std::vector<std::string> cells;
+        cells.reserve(columns.size());
         for (const Column& column : columns) {
             cells.push_back(values.shown(valueIn(instance, column.name), pointerTo(column)));
         }
