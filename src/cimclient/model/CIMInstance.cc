@@ -70,6 +70,12 @@ CIMInstance makeInstance(std::unique_ptr<InstanceBody> body) {
     return CIMInstance(body.release());
 }
 
+CIMInstance makeInstance(const CIMName& className, BodyRef<PackedProperties> properties) {
+    auto body = std::make_unique<InstanceBody>(className);
+    body->properties = PropertyStore(std::move(properties));
+    return makeInstance(std::move(body));
+}
+
 void CIMInstance::setPath(CIMObjectPath path) {
     access().path = std::move(path);
 }

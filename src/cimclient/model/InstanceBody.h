@@ -26,5 +26,6 @@ class InstanceBody : public ObjectBody {
 
 /// A handle on `body`, which it takes.
 CIMInstance makeInstance(std::unique_ptr<InstanceBody> body);
+CIMInstance makeInstance(const CIMName& className, BodyRef<PackedProperties> properties);
 
 }  // namespace Pegasus

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <Pegasus/Common/CIMName.h>
+#include <Pegasus/Common/CIMProperty.h>
 #include <Pegasus/Common/CIMType.h>
 
 #include <algorithm>
@@ -28,6 +29,11 @@ struct PropertyDeclaration {
     }
 };
 
+inline PropertyDeclaration declarationOf(const CIMConstProperty& property) {
+    return {property.getName(),       property.getType(),      property.isArray(),
+            property.getPropagated(), property.getArraySize(), property.getClassOrigin()};
+}
+
 /// No two declarations have the same name, ignoring case.
 class InstanceShape {
   public:
@@ -38,6 +44,9 @@ class InstanceShape {
             hashes.push_back(declaration.name.hash());
     }
 
+    Boolean isOf(const std::vector<PropertyDeclaration>& properties) const {
+        return declarations == properties;
+    }
     Uint32 size() const { return static_cast<Uint32>(declarations.size()); }
     const PropertyDeclaration& at(Uint32 index) const { return declarations[index]; }
 

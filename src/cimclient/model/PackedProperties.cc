@@ -5,66 +5,17 @@
 #include <algorithm>
 
 #include "CimTypeDispatch.h"
+#include "Utf16.h"
 
 namespace Pegasus {
 
 namespace {
 
-/// Reads what a PropertyPacker put.
-class Unpacker {
-  public:
-    explicit Unpacker(const char* from) : at(from) {}
-
-    template <class T>
-    T take() {
-        T item;
-        std::memcpy(&item, at, sizeof item);
-        at += sizeof item;
-        return item;
-    }
-
-    template <PackableScalar T>
-    T takeScalar() {
-        if constexpr (std::same_as<T, String>)
-            return takeText();
-        else if constexpr (std::same_as<T, CIMDateTime>)
-            return takeDateTime();
-        else
-            return take<T>();
-    }
-
-    template <PackableScalar T>
-    Array<T> takeArray() {
-        const auto count = take<Uint32>();
-        Array<T> elements;
-        elements.reserveCapacity(count);
-        for (Uint32 i = 0; i < count; ++i)
-            elements.append(takeScalar<T>());
-        return elements;
-    }
-
-  private:
-    String takeText() {
-        const auto size = take<Uint32>();
-        const char* const text = at;
-        at += size;
-        return String(text, size);
-    }
-
-    CIMDateTime takeDateTime() {
-        const String text = takeText();
-        return text.size() == 0 ? CIMDateTime() : CIMDateTime(text);
-    }
-
-    const char* at;
-};
-
 struct Pack {
     PropertyPacker& packer;
 
     void put(const String& text) const {
-        const CString utf8 = text.getCString();
-        packer.putText(static_cast<const char*>(utf8));
+        packer.putText(encodeUtf8(text.getChar16Data(), text.size()));
     }
     template <class T>
     void put(T item) const {
@@ -104,17 +55,21 @@ CIMProperty PackedProperties::at(Uint32 index) const {
 
 CIMValue PackedProperties::value(Uint32 index) const {
     const PropertyDeclaration& property = declaration(index);
-    const auto start = Unpacker(octets() + index * sizeof(Uint32)).take<Uint32>();
-    if (start == 0)
+    std::optional<Unpacker> unpacker = unpack(index);
+    if (!unpacker)
         return CIMValue(property.type, property.isArray, property.arraySize);
-    Unpacker unpacker(octets() + start);
     return dispatchCimType(property.type, [&]<class T>(CimTypeTag<T>) {
         if constexpr (PackableScalar<T>)
-            return property.isArray ? CIMValue(unpacker.takeArray<T>())
-                                    : CIMValue(unpacker.takeScalar<T>());
+            return property.isArray ? CIMValue(unpacker->takeArray<T>())
+                                    : CIMValue(unpacker->takeScalar<T>());
         else
             return CIMValue();
     });
+}
+
+std::optional<Unpacker> PackedProperties::unpack(Uint32 index) const {
+    const auto start = Unpacker(octets() + index * sizeof(Uint32)).take<Uint32>();
+    return start == 0 ? std::nullopt : std::optional(Unpacker(octets() + start));
 }
 
 void PropertyPacker::start() {

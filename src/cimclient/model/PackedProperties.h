@@ -12,9 +12,9 @@
 #include <Pegasus/Common/Char16.h>
 #include <Pegasus/Common/SharedBody.h>
 
-#include <concepts>
 #include <cstring>
 #include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <type_traits>
@@ -22,15 +22,11 @@
 #include <vector>
 
 #include "InstanceShape.h"
+#include "Unpacker.h"
 
 namespace Pegasus {
 
-/// What a packed property can hold: everything but references and embedded objects.
-template <class T>
-concept PackableScalar = std::is_arithmetic_v<T> || std::same_as<T, Char16> ||
-    std::same_as<T, String> || std::same_as<T, CIMDateTime>;
-
-/// They never change, so that copies of an instance can share them.
+/// Their values never change, so that copies of an instance can share them.
 class PackedProperties : public SharedBody {
   public:
     Uint32 size() const { return shape->size(); }
@@ -40,8 +36,14 @@ class PackedProperties : public SharedBody {
     /// Of an index below size().
     const PropertyDeclaration& declaration(Uint32 index) const { return shape->at(index); }
     CIMValue value(Uint32 index) const;
+    /// Where the value is read from; nothing for null.
+    std::optional<Unpacker> unpack(Uint32 index) const;
     /// A property of its own.
     CIMProperty at(Uint32 index) const;
+
+    const std::shared_ptr<const InstanceShape>& getShape() const { return shape; }
+    /// `other` has properties of the same names and types as the present shape.
+    void setShape(std::shared_ptr<const InstanceShape> other) { shape = std::move(other); }
 
     static void operator delete(void* memory) { ::operator delete(memory); }
 
@@ -96,6 +98,8 @@ class PropertyPacker {
     /// The next property as a whole. False, and nothing happens, when its value cannot be packed.
     Boolean add(const CIMValue& value);
 
+    /// Makes room for so many octets of values.
+    void reserve(std::size_t octets) { values.reserve(octets); }
     /// The number of properties begun.
     Uint32 size() const { return static_cast<Uint32>(starts.size()); }
     /// False when so much was packed that positions in it might overflow with the next property.

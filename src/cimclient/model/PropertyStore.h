@@ -33,6 +33,12 @@ class PropertyStore {
         unpackedList().add(std::move(property), "property", owner);
     }
 
+    /// Null when they are in a list.
+    PackedProperties* packed() const {
+        const auto* const held = std::get_if<Packed>(&form);
+        return held ? held->get() : nullptr;
+    }
+
     /// A copy that shares nothing that can be changed.
     PropertyStore clone() const;
 
@@ -40,10 +46,6 @@ class PropertyStore {
     using List = NamedList<CIMProperty>;
     using Packed = BodyRef<PackedProperties>;
 
-    const PackedProperties* packed() const {
-        const auto* const held = std::get_if<Packed>(&form);
-        return held ? held->get() : nullptr;
-    }
     const List& list() const { return *std::get_if<List>(&form); }
     List& unpackedList();
 

@@ -1,5 +1,7 @@
 #include "XmlText.h"
 
+#include <algorithm>
+
 #include "utf8/Utf8.h"
 
 namespace Pegasus {
@@ -32,45 +34,99 @@ std::string_view escapeOf(char32_t code) {
     }
 }
 
-void appendAscii(std::string& xml, char c) {
-    const std::string_view escape = escapeOf(static_cast<char32_t>(c));
+// U+FFFE and U+FFFF in UTF-8 begin with this byte and one more.
+constexpr Uint8 kNonCharacterLead = 0xEF;
+constexpr std::size_t kNonCharacterLength = 3;
+
+constexpr bool beginsWithNonCharacter(std::string_view utf8) {
+    return utf8.substr(0, kNonCharacterLength) == "\xEF\xBF\xBE" ||
+           utf8.substr(0, kNonCharacterLength) == "\xEF\xBF\xBF";
+}
+
+/// What may not stand for itself; of 16-bit codes also all that are not ASCII.
+template <class Code>
+constexpr bool isSpecial(Code code) {
+    const bool isWide = sizeof(Code) > 1 ? code >= 0x80 : code == kNonCharacterLead;
+    return isWide || code < 0x20 || code == '"' || code == '&' || code == '\'' || code == '<' ||
+           code == '>';
+}
+
+/// How many units at the front are not special. In blocks, of which the compiler makes few
+/// instructions: most texts have nothing special in them.
+template <class Code, class Unit>
+std::size_t plainLength(const Unit* text, std::size_t n) {
+    constexpr std::size_t kBlock = 16;
+    std::size_t i = 0;
+    for (; n - i >= kBlock; i += kBlock) {
+        Code special = 0;
+        for (std::size_t k = 0; k < kBlock; ++k) {
+            special |= static_cast<Code>(isSpecial(static_cast<Code>(text[i + k])));
+        }
+        if (special != 0) {
+            break;
+        }
+    }
+    while (i < n && !isSpecial(static_cast<Code>(text[i]))) {
+        ++i;
+    }
+    return i;
+}
+
+void appendCharacter(std::string& xml, char32_t code) {
+    const std::string_view escape = code < 0x80 ? escapeOf(code) : std::string_view();
+    const bool isNonCharacter = code == 0xFFFE || code == 0xFFFF;
     if (escape.empty()) {
-        xml += c;
+        utf8::append(xml, isNonCharacter ? kReplacement : code);
     } else {
         xml += escape;
     }
 }
 
-void appendCharacter(std::string& xml, char32_t code) {
-    const bool isNonCharacter = code == 0xFFFE || code == 0xFFFF;
-    utf8::append(xml, isNonCharacter ? kReplacement : code);
+void appendNarrowed(std::string& xml, const Char16* ascii, std::size_t n) {
+    const std::size_t before = xml.size();
+    xml.resize(before + n);
+    std::transform(ascii, ascii + n, xml.data() + before,
+                   [](Char16 unit) { return static_cast<char>(Uint16{unit}); });
 }
 
 }  // namespace
 
 void appendEscaped(std::string& xml, const String& text) {
     const Char16* units = text.getChar16Data();
-    const Uint32 size = text.size();
-    for (Uint32 i = 0; i < size; ++i) {
-        const Uint16 unit = units[i];
-        if (unit < 0x80) {
-            appendAscii(xml, static_cast<char>(unit));
-        } else if (utf8::isHighSurrogate(unit) && i + 1 < size &&
-                   utf8::isLowSurrogate(units[i + 1])) {
-            ++i;
-            appendCharacter(xml, utf8::joinSurrogates(unit, units[i]));
-        } else {
-            appendCharacter(xml, unit);
+    const Char16* const end = units + text.size();
+    while (true) {
+        const std::size_t plain = plainLength<Uint16>(units, static_cast<std::size_t>(end - units));
+        appendNarrowed(xml, units, plain);
+        units += plain;
+        if (units == end) {
+            break;
         }
+        char32_t code = Uint16{*units++};
+        if (utf8::isHighSurrogate(code) && units != end && utf8::isLowSurrogate(*units)) {
+            code = utf8::joinSurrogates(code, *units++);
+        }
+        appendCharacter(xml, code);
     }
 }
 
 void appendEscaped(std::string& xml, std::string_view utf8) {
-    for (const char c : utf8) {
-        if (static_cast<unsigned char>(c) < 0x80) {
-            appendAscii(xml, c);
+    while (true) {
+        const std::size_t plain = plainLength<Uint8>(utf8.data(), utf8.size());
+        xml.append(utf8.substr(0, plain));
+        if (plain == utf8.size()) {
+            break;
+        }
+        utf8.remove_prefix(plain);
+        const auto byte = static_cast<Uint8>(utf8[0]);
+        if (byte < 0x80) {
+            appendCharacter(xml, byte);
+            utf8.remove_prefix(1);
+        } else if (beginsWithNonCharacter(utf8)) {
+            appendCharacter(xml, kReplacement);
+            utf8.remove_prefix(kNonCharacterLength);
         } else {
-            xml += c;
+            xml += utf8[0];
+            utf8.remove_prefix(1);
         }
     }
 }

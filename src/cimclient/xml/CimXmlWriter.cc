@@ -135,11 +135,16 @@ void appendError(std::string& xml, Uint32 code, const String& description) {
 }
 
 void appendNamedInstance(std::string& xml, const CIMConstInstance& instance,
-                         const ObjectXmlOptions& options) {
+                         InstanceWriter& writer) {
     xml += "<VALUE.NAMEDINSTANCE>";
     appendInstanceName(xml, instance.getPath());
-    appendInstance(xml, instance, options);
+    writer.append(xml, instance);
     xml += "</VALUE.NAMEDINSTANCE>\n";
+}
+
+void appendNamedInstance(std::string& xml, const CIMConstInstance& instance) {
+    InstanceWriter writer{ObjectXmlOptions()};
+    appendNamedInstance(xml, instance, writer);
 }
 
 }  // namespace Pegasus

@@ -15,6 +15,7 @@
 #include <string>
 #include <string_view>
 
+#include "model/InstanceWriter.h"
 #include "model/ObjectXml.h"
 
 namespace Pegasus {
@@ -58,6 +59,8 @@ void appendError(std::string& xml, Uint32 code, const String& description);
 
 /// VALUE.NAMEDINSTANCE: the instance under its path, which must be set; and a line end.
 void appendNamedInstance(std::string& xml, const CIMConstInstance& instance,
-                         const ObjectXmlOptions& options = ObjectXmlOptions());
+                         InstanceWriter& writer);
+/// The same of a single instance, all of it.
+void appendNamedInstance(std::string& xml, const CIMConstInstance& instance);
 
 }  // namespace Pegasus

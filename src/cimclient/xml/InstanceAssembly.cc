@@ -10,11 +10,6 @@ namespace {
 
 constexpr std::size_t kMostClasses = 64;
 
-PropertyDeclaration declarationOf(const CIMConstProperty& property) {
-    return {property.getName(),       property.getType(),      property.isArray(),
-            property.getPropagated(), property.getArraySize(), property.getClassOrigin()};
-}
-
 }  // namespace
 
 void InstanceAssembly::start(const CIMName& className, bool learning) {

@@ -1,5 +1,6 @@
 #include "files/TextFields.h"
 
+#include <algorithm>
 #include <charconv>
 
 #include "text/Utf8.h"
@@ -47,6 +48,7 @@ std::vector<std::string_view> fieldsOf(std::string_view line) {
 
 std::vector<std::string_view> partsOf(std::string_view text, char separator) {
     std::vector<std::string_view> parts;
+    parts.reserve(static_cast<std::size_t>(std::count(text.begin(), text.end(), separator)) + 1);
     std::size_t start = 0;
     for (std::size_t end = text.find(separator); end != std::string_view::npos;
          end = text.find(separator, start)) {

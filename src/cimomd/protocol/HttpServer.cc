@@ -36,7 +36,7 @@ struct HttpServer::State {
 namespace {
 
 // A connection's memory holds the request's head and the piece of the answer being sent.
-constexpr std::size_t kConnectionMemoryBytes = std::size_t{32} << 10;
+constexpr std::size_t kConnectionMemoryBytes = std::size_t{64} << 10;
 constexpr std::size_t kAnswerPieceBytes = std::size_t{8} << 10;
 // A body that is too long is read to its end, so that the client sees the refusal instead of a
 // reset; beyond this the connection is simply closed.

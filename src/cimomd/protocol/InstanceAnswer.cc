@@ -19,8 +19,8 @@ bool InstanceAnswer::next(std::string& xml) {
     return true;
 }
 
-Pegasus::CIMInstance InstanceAnswer::find() {
-    Pegasus::CIMInstance instance;
+Pegasus::CIMConstInstance InstanceAnswer::find() {
+    Pegasus::CIMConstInstance instance;
     while (cursor.next(instance)) {
         if (keys.match(instance.getPath()))
             return instance;

@@ -18,7 +18,7 @@ class InstanceAnswer : public Answer {
     bool next(std::string& xml) override;
 
   private:
-    Pegasus::CIMInstance find();
+    Pegasus::CIMConstInstance find();
 
     InstanceCursor cursor;
     InstanceKeys keys;

@@ -12,10 +12,9 @@
 
 namespace cimomd {
 
-using Pegasus::CIMConstProperty;
+using Pegasus::CIMConstInstance;
 using Pegasus::CIMInstance;
 using Pegasus::CIMName;
-using Pegasus::CIMProperty;
 using Pegasus::Uint32;
 
 InstanceCursor::InstanceCursor(Model servedModel, Pegasus::CIMNamespaceName instanceNamespace,
@@ -24,7 +23,7 @@ InstanceCursor::InstanceCursor(Model servedModel, Pegasus::CIMNamespaceName inst
       nameSpace(std::move(instanceNamespace)),
       classes(std::move(classNames)) {}
 
-bool InstanceCursor::next(CIMInstance& instance) {
+bool InstanceCursor::next(CIMConstInstance& instance) {
     while (cimClass.isUninitialized() || !nextOfClass(instance)) {
         if (!openNextClass())
             return false;
@@ -47,6 +46,7 @@ bool InstanceCursor::openNextClass() {
 
 void InstanceCursor::openProvider(const Provider& provider) {
     keys = keyPropertiesOf(cimClass);
+    origins.emplace(cimClass);
     try {
         stream = provider.enumerate();
     } catch (const std::exception& error) {
@@ -56,18 +56,16 @@ void InstanceCursor::openProvider(const Provider& provider) {
     }
 }
 
-bool InstanceCursor::nextOfClass(CIMInstance& instance) {
+bool InstanceCursor::nextOfClass(CIMConstInstance& instance) {
     if (declaredPosition < declared->size()) {
-        const Pegasus::CIMConstInstance& found = (*declared)[declaredPosition++];
-        instance = found.clone();
-        setOrigins(instance);
-        instance.setPath(found.getPath());
+        instance = (*declared)[declaredPosition++];
         return true;
     }
-    if (stream == nullptr || !nextProvided(instance))
+    CIMInstance provided;
+    if (stream == nullptr || !nextProvided(provided))
         return false;
-    setOrigins(instance);
-    instance.setPath(pathOf(instance));
+    provided.setPath(pathOf(provided));
+    instance = provided;
     return true;
 }
 
@@ -77,6 +75,7 @@ bool InstanceCursor::nextProvided(CIMInstance& instance) {
         if (!stream->next(provided))
             return false;
         instance = provided.instance;
+        origins->set(instance);
         return true;
     } catch (const std::exception& error) {
         fail(error.what());
@@ -85,26 +84,16 @@ bool InstanceCursor::nextProvided(CIMInstance& instance) {
     }
 }
 
-void InstanceCursor::setOrigins(CIMInstance& instance) const {
-    for (Uint32 i = 0; i < instance.getPropertyCount(); ++i) {
-        CIMProperty property = instance.getProperty(i);
-        const Uint32 index = cimClass.findProperty(property.getName());
-        if (index == Pegasus::PEG_NOT_FOUND)
-            fail(fmt::format("the class has no property {}",
-                             utf8Of(property.getName().getString())));
-        const CIMConstProperty inClass = cimClass.getProperty(index);
-        property.setClassOrigin(inClass.getClassOrigin());
-        property.setPropagated(inClass.getPropagated());
-    }
-}
-
-Pegasus::CIMObjectPath InstanceCursor::pathOf(const CIMInstance& instance) const {
+Pegasus::CIMObjectPath InstanceCursor::pathOf(const CIMConstInstance& instance) const {
     Pegasus::Array<Pegasus::CIMKeyBinding> bindings;
     for (const CIMName& key : keys) {
         const Uint32 index = instance.findProperty(key);
-        if (index == Pegasus::PEG_NOT_FOUND || instance.getProperty(index).getValue().isNull())
+        const Pegasus::CIMValue value = index == Pegasus::PEG_NOT_FOUND
+                                            ? Pegasus::CIMValue()
+                                            : instance.getProperty(index).getValue();
+        if (value.isNull())
             fail(fmt::format("an instance lacks the key {}", utf8Of(key.getString())));
-        bindings.append(Pegasus::CIMKeyBinding(key, instance.getProperty(index).getValue()));
+        bindings.append(Pegasus::CIMKeyBinding(key, value));
     }
     return Pegasus::CIMObjectPath(Pegasus::String(), nameSpace, instance.getClassName(), bindings);
 }

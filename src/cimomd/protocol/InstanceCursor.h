@@ -7,8 +7,10 @@
 #include <Pegasus/Common/CIMInstance.h>
 
 #include <memory>
+#include <optional>
 #include <vector>
 
+#include "model/PropertyOrigins.h"
 #include "protocol/Model.h"
 #include "providers/InstanceStream.h"
 
@@ -23,15 +25,14 @@ class InstanceCursor {
     /// The next instance with its path and with the class of origin of its properties; false when
     /// there is none left. Raises Pegasus::CIMException with CIM_ERR_FAILED and the name of the
     /// class whose provider failed.
-    bool next(Pegasus::CIMInstance& instance);
+    bool next(Pegasus::CIMConstInstance& instance);
 
   private:
     bool openNextClass();
     void openProvider(const Provider& provider);
-    bool nextOfClass(Pegasus::CIMInstance& instance);
+    bool nextOfClass(Pegasus::CIMConstInstance& instance);
     bool nextProvided(Pegasus::CIMInstance& instance);
-    void setOrigins(Pegasus::CIMInstance& instance) const;
-    Pegasus::CIMObjectPath pathOf(const Pegasus::CIMInstance& instance) const;
+    Pegasus::CIMObjectPath pathOf(const Pegasus::CIMConstInstance& instance) const;
     [[noreturn]] void fail(const std::string& reason) const;
 
     Model model;
@@ -43,8 +44,10 @@ class InstanceCursor {
     /// Of that class, owned by the model.
     const std::vector<Pegasus::CIMConstInstance>* declared = nullptr;
     std::size_t declaredPosition = 0;
-    std::vector<Pegasus::CIMName> keys;
+    /// The provider's instances, and what they need: those that were declared have it already.
     std::unique_ptr<InstanceStream> stream;
+    std::vector<Pegasus::CIMName> keys;
+    std::optional<Pegasus::PropertyOrigins> origins;
 };
 
 }  // namespace cimomd

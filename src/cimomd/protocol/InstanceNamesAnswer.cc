@@ -9,7 +9,7 @@ namespace cimomd {
 InstanceNamesAnswer::InstanceNamesAnswer(InstanceCursor instances) : cursor(std::move(instances)) {}
 
 bool InstanceNamesAnswer::next(std::string& xml) {
-    Pegasus::CIMInstance instance;
+    Pegasus::CIMConstInstance instance;
     if (!cursor.next(instance))
         return false;
     Pegasus::appendInstanceName(xml, instance.getPath());

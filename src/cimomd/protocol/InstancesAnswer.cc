@@ -5,13 +5,13 @@
 namespace cimomd {
 
 InstancesAnswer::InstancesAnswer(InstanceCursor instances, Pegasus::ObjectXmlOptions xmlOptions)
-    : cursor(std::move(instances)), options(std::move(xmlOptions)) {}
+    : cursor(std::move(instances)), writer(std::move(xmlOptions)) {}
 
 bool InstancesAnswer::next(std::string& xml) {
-    Pegasus::CIMInstance instance;
+    Pegasus::CIMConstInstance instance;
     if (!cursor.next(instance))
         return false;
-    Pegasus::appendNamedInstance(xml, instance, options);
+    Pegasus::appendNamedInstance(xml, instance, writer);
     return true;
 }
 

@@ -16,7 +16,7 @@ class InstancesAnswer : public Answer {
 
   private:
     InstanceCursor cursor;
-    Pegasus::ObjectXmlOptions options;
+    Pegasus::InstanceWriter writer;
 };
 
 }  // namespace cimomd

@@ -12,6 +12,7 @@
 namespace cimomd {
 namespace {
 
+/// An answer that fails before there is so much of it is an ERROR and nothing else.
 constexpr std::size_t kEnoughPending = std::size_t{32} << 10;
 
 }  // namespace
@@ -48,7 +49,7 @@ void ResponseStream::fail(const CimStatus& status) {
 
 ResponseStream::Outcome ResponseStream::read(char* buffer, std::size_t capacity,
                                              std::size_t& count) {
-    fill();
+    fill(capacity);
     if (broken)
         return Outcome::Broken;
     count = std::min(capacity, pending.size() - offset);
@@ -60,12 +61,12 @@ ResponseStream::Outcome ResponseStream::read(char* buffer, std::size_t capacity,
     return Outcome::Data;
 }
 
-void ResponseStream::fill() {
-    if (offset == pending.size()) {
-        pending.clear();
-        offset = 0;
-    }
-    while (pending.size() < kEnoughPending && !finished && !broken)
+void ResponseStream::fill(std::size_t wanted) {
+    if (pending.size() - offset >= wanted)
+        return;
+    pending.erase(0, offset);
+    offset = 0;
+    while (pending.size() < std::max(wanted, kEnoughPending) && !finished && !broken)
         step();
 }
 

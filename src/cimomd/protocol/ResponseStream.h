@@ -1,7 +1,7 @@
 #pragma once
 
-// The CIM-XML body of one answer, made while it is sent: at most some ten thousand bytes of it are
-// in memory.
+// The CIM-XML body of one answer, made while it is sent: little more of it is in memory than is
+// read at a time.
 
 #include <Pegasus/Common/Exception.h>
 
@@ -36,16 +36,17 @@ class ResponseStream {
 
     enum class Outcome { Data, End, Broken };
 
-    /// Puts the next bytes, at most `capacity`, into `buffer` and their number into `count`.
-    /// Broken: the operation failed after part of the answer was handed over, to a client without
-    /// trailers; close the connection.
+    /// Puts the next bytes, `capacity` unless the answer ends before, into `buffer` and their
+    /// number into `count`. Broken: the operation failed after part of the answer was handed over,
+    /// to a client without trailers; close the connection.
     Outcome read(char* buffer, std::size_t capacity, std::size_t& count);
 
     /// After End: the failure to be told in trailers, if any.
     const std::optional<CimStatus>& trailerStatus() const { return trailer; }
 
   private:
-    void fill();
+    /// Sees to it that so many bytes are pending, unless the answer ends before.
+    void fill(std::size_t wanted);
     void step();
     void finish();
 

@@ -4,11 +4,14 @@
 
 #include <Pegasus/Common/CIMValue.h>
 
+#include <concepts>
 #include <initializer_list>
 #include <string>
 #include <string_view>
 #include <vector>
 
+#include "model/PackedProperties.h"
+#include "providers/BuiltShapes.h"
 #include "providers/ProvidedInstance.h"
 
 namespace cimomd {
@@ -18,6 +21,7 @@ namespace cimomd {
 /// carry becomes U+FFFD.
 class InstanceBuilder {
   public:
+    /// The names of the class and, below, of properties are static texts.
     explicit InstanceBuilder(const char* className);
 
     /// The keys of CIM_LogicalDevice.
@@ -37,6 +41,10 @@ class InstanceBuilder {
     /// A string property; only the first `maxLength` characters are kept when that is not 0.
     InstanceBuilder& text(const char* name, const Fact<std::string>& value,
                           std::size_t maxLength = 0);
+    template <std::convertible_to<std::string_view> Text>
+    InstanceBuilder& text(const char* name, const Text& value, std::size_t maxLength = 0) {
+        return addText(name, value, maxLength);
+    }
     InstanceBuilder& texts(const char* name, const Fact<std::vector<std::string>>& values);
 
     /// A property of the scalar type T, one of the client library's types.
@@ -44,7 +52,7 @@ class InstanceBuilder {
     InstanceBuilder& value(const char* name, const Fact<T>& scalar) {
         if (!scalar)
             return addMissing(name, Pegasus::kCimTypeOf<T>, false, scalar.reason());
-        return add(name, Pegasus::CIMValue(*scalar));
+        return add<T>(name, *scalar);
     }
 
     /// A number that the schema has words for. The reason for a missing one is kept as well, but
@@ -54,7 +62,7 @@ class InstanceBuilder {
                                 Pegasus::Uint16 unknown = 0) {
         if (!number)
             provided.missing.push_back({name, number.reason()});
-        return add(name, Pegasus::CIMValue(number.value_or(unknown)));
+        return add<Pegasus::Uint16>(name, number.value_or(unknown));
     }
 
     /// An array property of that element type.
@@ -69,23 +77,35 @@ class InstanceBuilder {
         return addArray<T>(name, elements);
     }
 
-    ProvidedInstance take() { return std::move(provided); }
+    /// Raises std::logic_error when a property was added twice.
+    ProvidedInstance take();
 
   private:
     template <typename T, typename Elements>
     InstanceBuilder& addArray(const char* name, const Elements& elements) {
-        Pegasus::Array<T> array;
-        for (const T& element : elements)
-            array.append(element);
-        return add(name, Pegasus::CIMValue(array));
+        properties.push_back({name, Pegasus::kCimTypeOf<T>, true});
+        packer.beginArray(static_cast<Pegasus::Uint32>(elements.size()));
+        for (const T element : elements)
+            packer.put(element);
+        return *this;
     }
 
-    InstanceBuilder& add(const char* name, const Pegasus::CIMValue& value);
+    template <typename T>
+    InstanceBuilder& add(const char* name, const T& value) {
+        properties.push_back({name, Pegasus::kCimTypeOf<T>, false});
+        packer.beginScalar();
+        packer.put(value);
+        return *this;
+    }
+    InstanceBuilder& addText(const char* name, std::string_view value, std::size_t maxLength);
     InstanceBuilder& addMissing(const char* name, Pegasus::CIMType type, bool isArray,
                                 Absence reason);
     InstanceBuilder& systemKeys(const std::string& hostName);
 
     const char* creationClass;
+    std::vector<BuiltProperty> properties;
+    /// Their values.
+    Pegasus::PropertyPacker packer;
     ProvidedInstance provided;
 };
 

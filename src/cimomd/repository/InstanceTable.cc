@@ -49,7 +49,7 @@ bool InstanceTable::add(const Pegasus::CIMInstance& instance) {
     const auto [place, added] =
         indexByKeys.emplace(textOf(path.getNameSpace(), path.getKeyBindings()), instances.size());
     if (added)
-        instances.push_back(instance);
+        instances.push_back(packer.packed(instance));
     return added;
 }
 

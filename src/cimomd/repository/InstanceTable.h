@@ -8,6 +8,8 @@
 #include <string>
 #include <vector>
 
+#include "model/InstancePacker.h"
+
 namespace cimomd {
 
 class InstanceTable {
@@ -23,6 +25,7 @@ class InstanceTable {
                                           const Pegasus::Array<Pegasus::CIMKeyBinding>& keys) const;
 
   private:
+    Pegasus::InstancePacker packer;
     std::vector<Pegasus::CIMConstInstance> instances;
     std::map<std::string, std::size_t> indexByKeys;
 };

@@ -2,19 +2,31 @@
 
 #include <sys/utsname.h>
 
+#include <atomic>
 #include <ctime>
 
 #include "system/network/AddressDump.h"
 
 namespace cimomd {
+namespace {
+
+/// The administrator may change the zone at any time. Looking for that means looking at a file:
+/// once a second is enough for the thousands of times of a list of packages.
+void followZone() {
+    static std::atomic<std::time_t> latestLook{-1};
+    const std::time_t now = std::time(nullptr);
+    if (latestLook.exchange(now) != now)
+        ::tzset();
+}
+
+}  // namespace
 
 std::int64_t LiveSystemCalls::now() const {
     return std::time(nullptr);
 }
 
 int LiveSystemCalls::utcOffsetMinutes(std::int64_t time) const {
-    // The administrator may have changed the zone since the last call.
-    ::tzset();
+    followZone();
     const std::time_t seconds = time;
     std::tm local{};
     if (::localtime_r(&seconds, &local) == nullptr)

@@ -18,21 +18,37 @@ char lowerCaseOf(char c) {
     return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
 }
 
+/// All of it characters of ASCII, none of them forbidden.
+bool isCleanAscii(std::string_view bytes) {
+    bool isClean = true;
+    for (const char c : bytes)
+        isClean &= (c >= 0x20 && c < 0x7F) || c == '\t' || c == '\n' || c == '\r';
+    return isClean;
+}
+
 }  // namespace
 
 std::string cleanText(std::string_view bytes) {
-    std::string out;
-    out.reserve(bytes.size());
+    std::string room;
+    return std::string(cleanText(bytes, room));
+}
+
+std::string_view cleanText(std::string_view bytes, std::string& room) {
+    if (isCleanAscii(bytes))
+        return bytes;
+    room.clear();
     for (const char c : utf8::clean(bytes)) {
         if (isForbiddenControl(c))
-            out += utf8::kReplacement;
+            room += utf8::kReplacement;
         else
-            out += c;
+            room += c;
     }
-    return out;
+    return room;
 }
 
 std::string_view firstCharacters(std::string_view text, std::size_t maxCharacters) {
+    if (text.size() <= maxCharacters)
+        return text;
     std::size_t offset = 0;
     std::size_t units = 0;
     while (offset < text.size()) {

@@ -15,6 +15,10 @@ using Pegasus::equalsIgnoringCase;
 /// characters other than tab, LF and CR: what CIM-XML can carry.
 std::string cleanText(std::string_view bytes);
 
+/// The same without a copy of what is clean already: the result is `bytes` then, and otherwise in
+/// `room`.
+std::string_view cleanText(std::string_view bytes, std::string& room);
+
 /// At most `maxCharacters` characters from the front of well-formed UTF-8, counted in UTF-16 units
 /// as MaxLen counts them.
 std::string_view firstCharacters(std::string_view text, std::size_t maxCharacters);

@@ -21,10 +21,10 @@ std::string listed(std::initializer_list<std::string> fields) {
 TEST(DebianPackages, readsTheInstalledOnes) {
     const auto packages = parseDebianPackages(
         listed({"installed", "vim", "amd64", "2:9.0.1378-2+deb12u2", "Maintainers <m@example.org>",
-                "editors", "3738", "Vi IMproved\tan editor"}) +
-        listed({"config-files", "nano", "amd64", "7.2-1", "M", "editors", "1", "gone"}) +
-        listed({"half-installed", "joe", "amd64", "1", "M", "editors", "1", "broken"}) +
-        listed({"installed", "odd", "all", "1-2-3", "", "", "many", ""}));
+                "editors", "3738", "Vi IMproved\tan editor", "1718000000"}) +
+        listed({"config-files", "nano", "amd64", "7.2-1", "M", "editors", "1", "gone", ""}) +
+        listed({"half-installed", "joe", "amd64", "1", "M", "editors", "1", "broken", ""}) +
+        listed({"installed", "odd", "all", "1-2-3", "", "", "many", "", ""}));
     ASSERT_EQ(packages.size(), 2U);
     EXPECT_EQ(packages[0].name, "vim");
     EXPECT_EQ(packages[0].architecture, "amd64");
@@ -35,19 +35,21 @@ TEST(DebianPackages, readsTheInstalledOnes) {
     EXPECT_EQ(packages[0].section, "editors");
     EXPECT_EQ(packages[0].installedKB, 3738U);
     EXPECT_EQ(packages[0].summary, "Vi IMproved\tan editor");
+    EXPECT_EQ(packages[0].installTime, 1718000000);
     EXPECT_EQ(packages[1].upstreamVersion, "1-2");
     EXPECT_EQ(packages[1].manufacturer, std::nullopt);
     EXPECT_EQ(packages[1].section, std::nullopt);
     EXPECT_EQ(packages[1].installedKB, std::nullopt);
     EXPECT_EQ(packages[1].summary, std::nullopt);
+    EXPECT_EQ(packages[1].installTime, std::nullopt);
 }
 
 TEST(DebianPackages, dropsRecordsThatAreNone) {
     EXPECT_TRUE(parseDebianPackages("").empty());
     EXPECT_TRUE(parseDebianPackages("no database\n").empty());
     EXPECT_TRUE(parseDebianPackages(listed({"installed", "vim", "amd64"})).empty());
-    EXPECT_TRUE(
-        parseDebianPackages(listed({"installed", "", "amd64", "1", "M", "s", "1", "t"})).empty());
+    EXPECT_TRUE(parseDebianPackages(listed({"installed", "", "amd64", "1", "M", "s", "1", "t", ""}))
+                    .empty());
 }
 
 class DebianDatabaseTest : public testing::Test {

@@ -58,5 +58,32 @@ TEST(InstanceBuilder, saysThatANumberWithWordsIsUnknown) {
     EXPECT_EQ(provided.missing[1].reason, Absence::Absent);
 }
 
+TEST(InstanceBuilder, replacesWhatCimXmlCannotCarry) {
+    const auto provided = InstanceBuilder("Test_Thing")
+                              .text("Name", "a\x01\x62\x7F\xFF")
+                              .texts("More", std::vector<std::string>{"plain", "\xC3\xA4\x02"})
+                              .text("Short", "\u00e4\u00f6\u00fc", 2)
+                              .take();
+    EXPECT_EQ(textOf(provided.instance, "Name"), "a\uFFFDb\uFFFD\uFFFD");
+    EXPECT_EQ(textOf(provided.instance, "More"), "plain \u00e4\uFFFD ");
+    EXPECT_EQ(textOf(provided.instance, "Short"), "\u00e4\u00f6");
+}
+
+TEST(InstanceBuilder, makesInstancesOfAClassThatDiffer) {
+    const auto first = InstanceBuilder("Test_Thing").text("Name", "a").take();
+    const auto second =
+        InstanceBuilder("Test_Thing").value<Pegasus::Uint32>("Size", 5).text("Name", "b").take();
+    EXPECT_EQ(first.instance.getPropertyCount(), 1U);
+    EXPECT_EQ(textOf(first.instance, "Name"), "a");
+    EXPECT_EQ(textOf(second.instance, "Size"), "5");
+    EXPECT_EQ(textOf(second.instance, "Name"), "b");
+}
+
+TEST(InstanceBuilder, takesEachPropertyOnce) {
+    InstanceBuilder builder("Test_Thing");
+    builder.text("Name", "a").text("NAME", "b");
+    EXPECT_THROW(builder.take(), std::logic_error);
+}
+
 }  // namespace
 }  // namespace cimomd

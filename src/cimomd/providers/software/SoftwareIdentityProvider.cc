@@ -33,12 +33,22 @@ auto orderOf(const SoftwarePackage& package) {
 }
 
 void sortAndUnite(std::vector<SoftwarePackage>& packages) {
-    std::sort(packages.begin(), packages.end(),
-              [](const auto& a, const auto& b) { return orderOf(a) < orderOf(b); });
-    packages.erase(
-        std::unique(packages.begin(), packages.end(),
-                    [](const auto& a, const auto& b) { return orderOf(a) == orderOf(b); }),
-        packages.end());
+    // The packages are large: each is moved once.
+    std::vector<SoftwarePackage*> order;
+    order.reserve(packages.size());
+    for (SoftwarePackage& package : packages)
+        order.push_back(&package);
+    std::sort(order.begin(), order.end(),
+              [](const auto* a, const auto* b) { return orderOf(*a) < orderOf(*b); });
+    order.erase(
+        std::unique(order.begin(), order.end(),
+                    [](const auto* a, const auto* b) { return orderOf(*a) == orderOf(*b); }),
+        order.end());
+    std::vector<SoftwarePackage> sorted;
+    sorted.reserve(order.size());
+    for (SoftwarePackage* package : order)
+        sorted.push_back(std::move(*package));
+    packages = std::move(sorted);
 }
 
 Fact<std::vector<Uint16>> classificationsOf(const SoftwarePackage& package) {
@@ -58,7 +68,9 @@ SoftwareIdentityProvider::Listing SoftwareIdentityProvider::read() const {
     bool isAnyThere = false;
     const auto take = [&](Fact<std::vector<SoftwarePackage>> found) {
         isAnyThere = isAnyThere || found.has_value();
-        if (found)
+        if (found && listing.packages.empty())
+            listing.packages = std::move(*found);
+        else if (found)
             std::move((*found).begin(), (*found).end(), std::back_inserter(listing.packages));
         else if (found.reason() != Absence::Absent)
             listing.whyNotAll = found.reason();

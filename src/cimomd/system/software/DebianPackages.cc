@@ -3,6 +3,7 @@
 #include "files/FileTime.h"
 #include "files/TextFields.h"
 #include "system/BoundedCommand.h"
+#include "system/Narrowing.h"
 #include "system/software/PackageRecords.h"
 
 namespace cimomd {
@@ -18,6 +19,7 @@ enum Field : std::size_t {
     kSection,
     kInstalledSize,
     kSummary,
+    kListTime,
     kFieldCount
 };
 
@@ -41,9 +43,10 @@ SoftwarePackage packageOf(const std::vector<std::string_view>& fields) {
     out.manufacturer = packageField(fields[kMaintainer]);
     out.section = packageField(fields[kSection]);
     out.summary = packageField(fields[kSummary]);
-    out.installedKB = packageField(fields[kInstalledSize]).then([](const std::string& text) {
-        return parseUnsigned(text);
-    });
+    out.installedKB = packageField(fields[kInstalledSize]).then(parseUnsigned);
+    out.installTime = packageField(fields[kListTime])
+                          .then(parseUnsigned)
+                          .then(narrowedTo<std::int64_t, std::uint64_t>);
     return out;
 }
 
@@ -60,13 +63,15 @@ Fact<std::int64_t> installTimeOf(const SoftwarePackage& package,
 std::string debianPackageFormat() {
     return packageFormat("${",
                          {"db:Status-Status", "Package", "Architecture", "Version", "Maintainer",
-                          "Section", "Installed-Size", "binary:Summary"},
+                          "Section", "Installed-Size", "binary:Summary", "db-fsys:Last-Modified"},
                          "}");
 }
 
 std::vector<SoftwarePackage> parseDebianPackages(std::string_view listing) {
+    const auto records = packageRecords(listing, kFieldCount);
     std::vector<SoftwarePackage> packages;
-    for (const auto& fields : packageRecords(listing, kFieldCount)) {
+    packages.reserve(records.size());
+    for (const auto& fields : records) {
         if (fields[kStatus] == "installed" && !fields[kName].empty())
             packages.push_back(packageOf(fields));
     }
@@ -82,8 +87,11 @@ Fact<std::vector<SoftwarePackage>> readDebianPackages(const std::filesystem::pat
     if (!listing)
         return listing.reason();
     std::vector<SoftwarePackage> packages = parseDebianPackages(*listing);
-    for (SoftwarePackage& package : packages)
-        package.installTime = installTimeOf(package, directory / "info");
+    for (SoftwarePackage& package : packages) {
+        // dpkg-query tells it since 1.19.3.
+        if (!package.installTime)
+            package.installTime = installTimeOf(package, directory / "info");
+    }
     return packages;
 }
 

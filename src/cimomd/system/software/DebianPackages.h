@@ -10,7 +10,8 @@
 
 namespace cimomd {
 
-/// The installed ones of a listing by `debianPackageFormat`, in its order, without their times.
+/// The installed ones of a listing by `debianPackageFormat`, in its order. Versions
+/// of dpkg-query before 1.19.3 leave the install times out.
 std::vector<SoftwarePackage> parseDebianPackages(std::string_view listing);
 
 /// What dpkg-query is asked to write of each package.

@@ -18,8 +18,10 @@ std::string packageFormat(std::string_view open, const std::vector<std::string>&
 
 std::vector<std::vector<std::string_view>> packageRecords(std::string_view output,
                                                           std::size_t fieldCount) {
+    const std::vector<std::string_view> parts = partsOf(output, kPackageRecordEnd);
     std::vector<std::vector<std::string_view>> records;
-    for (const std::string_view record : partsOf(output, kPackageRecordEnd)) {
+    records.reserve(parts.size());
+    for (const std::string_view record : parts) {
         std::vector<std::string_view> fields = partsOf(record, kPackageFieldEnd);
         if (fields.size() == fieldCount)
             records.push_back(std::move(fields));

@@ -10,6 +10,8 @@
 namespace Pegasus {
 
 class InstanceBody;
+class InstanceWriter;
+class PropertyOrigins;
 class CIMInstance;
 class CIMObject;
 class CIMConstProperty;
@@ -49,6 +51,8 @@ class CIMConstInstance {
 
   private:
     friend class CIMObject;
+    friend class InstanceWriter;
+    friend class PropertyOrigins;
     BodyRef<InstanceBody> body;
 };
 
