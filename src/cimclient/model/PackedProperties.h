@@ -87,8 +87,11 @@ class PropertyPacker {
         values.append(reinterpret_cast<const char*>(&item), sizeof item);
     }
     void put(const CIMDateTime& time) {
-        const CString text = time.toString().getCString();
-        putText(static_cast<const char*>(text));
+        const String text = time.toString();
+        put(text.size());
+        // All of it ASCII.
+        for (Uint32 i = 0; i < text.size(); ++i)
+            values += static_cast<char>(Uint16{text.getChar16Data()[i]});
     }
     /// A string, in UTF-8.
     void putText(std::string_view utf8) {

@@ -95,7 +95,7 @@ TEST_F(SoftwareIdentityProviderTest, joinsBothKindsAndKeepsNoPackageTwice) {
     };
     const SoftwareIdentityProvider provider(
         tree.paths(), calls,
-        {tool("dpkg-query", "installed\\037a\\037all\\0371\\037M\\037s\\0371\\037t\\036"),
+        {tool("dpkg-query", "installed\\037a\\037all\\0371\\037M\\037s\\0371\\037t\\037\\036"),
          tool("rpm", "b\\037(none)\\0371\\0372\\037x\\037v\\037p\\037g\\0371\\0371\\037t\\036")});
     const auto instances = all(provider.enumerate());
     ASSERT_EQ(instances.size(), 2U);
@@ -113,7 +113,8 @@ TEST_F(SoftwareIdentityProviderTest, saysWhenADatabaseCannotBeRead) {
     };
     const SoftwareIdentityProvider provider(
         tree.paths(), calls,
-        {tool("dpkg-query", "printf 'installed\\037a\\037all\\0371\\037M\\037s\\0371\\037t\\036'"),
+        {tool("dpkg-query",
+              "printf 'installed\\037a\\037all\\0371\\037M\\037s\\0371\\037t\\037\\036'"),
          tool("rpm", "exit 1")});
     const auto stream = provider.enumerate();
     ProvidedInstance provided;
