@@ -55,8 +55,7 @@ class Composer {
             const std::string reason = reasonToLeaveOut(answered, name);
             const bool tooLong = list.size() + 1 + name.size() > kLineLimit;
             if (!reason.empty() || tooLong) {
-                result.leftOut.push_back(className + "." + name + ": " +
-                                         (tooLong ? "the line would be too long" : reason));
+                leaveOut(className, name, tooLong ? "the line would be too long" : reason);
                 continue;
             }
             list.append(first ? "" : ",").append(name);
@@ -65,6 +64,12 @@ class Composer {
         }
         result.script +=
             "G[" + slot + "]=" + className + "\nN[" + slot + "]=" + nameSpace + "\n" + list + "\n";
+    }
+
+    void leaveOut(const std::string& className, const std::string& name,
+                  const std::string& reason) {
+        std::string text = className;
+        result.leftOut.push_back(text.append(".").append(name).append(": ").append(reason));
     }
 
     static std::string reasonToLeaveOut(const AnsweredClass& answered, const std::string& name) {
