@@ -87,7 +87,7 @@ class PropertyPacker {
         values.append(reinterpret_cast<const char*>(&item), sizeof item);
     }
     void put(const CIMDateTime& time) {
-        const String text = time.toString();
+        const String& text = time.toString();
         put(text.size());
         // All of it ASCII.
         for (Uint32 i = 0; i < text.size(); ++i)
