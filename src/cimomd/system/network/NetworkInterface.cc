@@ -123,6 +123,7 @@ Fact<std::vector<NetworkInterface>> readNetworkInterfaces(const std::filesystem:
     }
     const FileTexts links = readLinks(places, calls);
     std::vector<NetworkInterface> out;
+    out.reserve(places.size());
     for (const std::filesystem::path& place : places)
         out.push_back(readInterface(place, place.filename().string(), links));
     std::sort(out.begin(), out.end(),
