@@ -89,6 +89,24 @@ GuardedChild::Reading GuardedChild::read(void* bytes, std::size_t size) const {
     return Reading::Complete;
 }
 
+std::optional<Absence> askGuarded(SilentSources& sources, const std::string& source,
+                                  GuardedChild::Task task, const void* question, void* answer,
+                                  std::size_t size) {
+    if (!sources.mayAsk(source))
+        return Absence::TimedOut;
+    const GuardedChild child(sources, task, question);
+    switch (child.read(answer, size)) {
+        case GuardedChild::Reading::Silent:
+            sources.note(source);
+            return Absence::TimedOut;
+        case GuardedChild::Reading::Ended:
+            return Absence::Unreadable;
+        case GuardedChild::Reading::Complete:
+            break;
+    }
+    return std::nullopt;
+}
+
 bool writeAnswer(int answers, const void* bytes, std::size_t size) {
     std::size_t length = 0;
     while (length < size) {

@@ -7,7 +7,10 @@
 #include <sys/types.h>
 
 #include <cstddef>
+#include <optional>
+#include <string>
 
+#include "system/Fact.h"
 #include "system/SilentSources.h"
 
 namespace cimomd {
@@ -37,6 +40,13 @@ class GuardedChild {
     pid_t child = -1;
     int answers = -1;
 };
+
+/// Has a child put `size` bytes of answer into `answer`, unless `source` keeps it. Nothing when
+/// they came; TimedOut when they did not, or when `source` did not answer lately; Unreadable when
+/// the child ended without them.
+std::optional<Absence> askGuarded(SilentSources& sources, const std::string& source,
+                                  GuardedChild::Task task, const void* question, void* answer,
+                                  std::size_t size);
 
 /// For tasks: writes all of it; false when the reader is gone.
 bool writeAnswer(int answers, const void* bytes, std::size_t size);

@@ -20,20 +20,12 @@ void answerQuestion(const void* asked, int answers) {
 }  // namespace
 
 LinkSettings LinkSettingsGuard::ask(const std::string& interfaceName) {
-    if (!silent.mayAsk(interfaceName))
-        return {Absence::TimedOut, Absence::TimedOut};
     const Question question{call, interfaceName.c_str()};
-    const GuardedChild child(silent, answerQuestion, &question);
     DriverAnswer answer;
-    switch (child.read(&answer, sizeof answer)) {
-        case GuardedChild::Reading::Silent:
-            silent.note(interfaceName);
-            return {Absence::TimedOut, Absence::TimedOut};
-        case GuardedChild::Reading::Ended:
-            return {Absence::Unreadable, Absence::Unreadable};
-        case GuardedChild::Reading::Complete:
-            break;
-    }
+    const auto absence =
+        askGuarded(silent, interfaceName, answerQuestion, &question, &answer, sizeof answer);
+    if (absence)
+        return {*absence, *absence};
     return linkSettingsOf(answer);
 }
 

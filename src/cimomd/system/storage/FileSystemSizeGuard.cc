@@ -48,20 +48,12 @@ Absence absenceOfSize(int error) {
 
 Fact<FileSystemSize> FileSystemSizeGuard::ask(const std::string& device,
                                               const std::string& mountPoint) {
-    if (!silent.mayAsk(device))
-        return Absence::TimedOut;
     const Question question{call, mountPoint.c_str()};
-    const GuardedChild child(silent, answerQuestion, &question);
     Answer answer;
-    switch (child.read(&answer, sizeof answer)) {
-        case GuardedChild::Reading::Silent:
-            silent.note(device);
-            return Absence::TimedOut;
-        case GuardedChild::Reading::Ended:
-            return Absence::Unreadable;
-        case GuardedChild::Reading::Complete:
-            break;
-    }
+    const auto absence =
+        askGuarded(silent, device, answerQuestion, &question, &answer, sizeof answer);
+    if (absence)
+        return *absence;
     if (answer.error != 0)
         return absenceOfSize(answer.error);
     return answer.size;
