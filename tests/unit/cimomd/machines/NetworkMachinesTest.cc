@@ -2,9 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "InstanceText.h"
-#include "SchemaConformance.h"
-#include "machines/Machine.h"
+#include "machines/MachineInstances.h"
 #include "providers/network/DnsSettingDataProvider.h"
 #include "providers/network/EthernetPortProvider.h"
 #include "providers/network/IpProtocolEndpointProvider.h"
@@ -15,21 +13,6 @@
 
 namespace cimomd {
 namespace {
-
-using Row = std::vector<std::string>;
-using Table = std::vector<Row>;
-
-/// The named properties of all instances.
-Table tableOf(const Provider& provider, const std::vector<const char*>& properties) {
-    Table table;
-    for (const Pegasus::CIMInstance& instance : all(provider.enumerate())) {
-        Row row;
-        for (const char* property : properties)
-            row.push_back(textOf(instance, property));
-        table.push_back(row);
-    }
-    return table;
-}
 
 class NetworkMachine {
     SystemPaths paths;

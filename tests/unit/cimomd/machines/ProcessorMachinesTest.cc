@@ -2,28 +2,12 @@
 
 #include <gtest/gtest.h>
 
-#include "InstanceText.h"
-#include "SchemaConformance.h"
-#include "machines/Machine.h"
+#include "machines/MachineInstances.h"
 #include "providers/processor/CacheMemoryProvider.h"
 #include "providers/processor/ProcessorProvider.h"
 
 namespace cimomd {
 namespace {
-
-using Row = std::vector<std::string>;
-using Table = std::vector<Row>;
-
-Table tableOf(const Provider& provider, const std::vector<const char*>& properties) {
-    Table table;
-    for (const Pegasus::CIMInstance& instance : all(provider.enumerate())) {
-        Row row;
-        for (const char* property : properties)
-            row.push_back(textOf(instance, property));
-        table.push_back(row);
-    }
-    return table;
-}
 
 Table processorsOf(const char* name, const std::vector<const char*>& properties) {
     return tableOf(ProcessorProvider(machine(name)), properties);

@@ -2,9 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "InstanceText.h"
-#include "SchemaConformance.h"
-#include "machines/Machine.h"
+#include "machines/MachineInstances.h"
 #include "providers/storage/CDROMDriveProvider.h"
 #include "providers/storage/DiskDriveProvider.h"
 #include "providers/storage/DiskPackageProvider.h"
@@ -18,19 +16,10 @@
 namespace cimomd {
 namespace {
 
-using Row = std::vector<std::string>;
-using Table = std::vector<Row>;
-
-/// What the instances have in the named properties, a row for each.
+/// What the instances have in the named properties, of a provider that is held against the schema.
 Table valuesOf(const Provider& provider, const std::vector<const char*>& properties) {
     expectServesItsClass(provider);
-    Table rows;
-    for (const auto& instance : all(provider.enumerate())) {
-        Row& row = rows.emplace_back();
-        for (const char* property : properties)
-            row.push_back(textOf(instance, property));
-    }
-    return rows;
+    return tableOf(provider, properties);
 }
 
 template <typename OneProvider>
