@@ -1,7 +1,7 @@
 // The part of SennetConverter that renders types and values.
 
-#include <algorithm>
 #include <cstdio>
+#include <cstring>
 #include <utility>
 
 #include "SennetConverter/framework/SennetUtilities.h"
@@ -19,6 +19,10 @@ constexpr char kUnknownDateTime[] = "\"19800101000000.000000+000\"";
 
 bool isPrintableAscii(Uint16 character) {
     return character >= ' ' && character <= '~';
+}
+
+bool isOneOf(Uint16 character, const char* characters) {
+    return character != 0 && character <= '~' && std::strchr(characters, character) != nullptr;
 }
 
 // Whether escaping changes nothing. Without a branch in the loop, so that the compiler makes vector
@@ -206,30 +210,20 @@ String SennetConverter::formatString(String text) {
 }
 
 String SennetConverter::escape(const String& text, const char* escapedCharacters) {
-    constexpr Uint32 kPiece = 256;
-    Char16 piece[2 * kPiece];
     const Char16* const data = text.getChar16Data();
     if (isPlain(data, text.size(), escapedCharacters)) {
         return text;
     }
-    bool isEscaped[128] = {};
-    for (const char* character = escapedCharacters; *character != '\0'; ++character) {
-        isEscaped[static_cast<unsigned char>(*character)] = true;
-    }
     String escaped;
-    for (Uint32 begin = 0; begin < text.size(); begin += kPiece) {
-        const Uint32 end = std::min(text.size(), begin + kPiece);
-        Uint32 size = 0;
-        for (Uint32 i = begin; i < end; ++i) {
-            const Uint16 character = data[i];
-            if (character < 128 && isEscaped[character]) {
-                piece[size++] = Char16('\\');
-                piece[size++] = Char16(character);
-            } else {
-                piece[size++] = Char16(isPrintableAscii(character) ? character : Uint16(' '));
-            }
+    escaped.reserveCapacity(2 * text.size());
+    for (Uint32 i = 0; i < text.size(); ++i) {
+        const Uint16 character = data[i];
+        if (isOneOf(character, escapedCharacters)) {
+            escaped.append(Char16('\\'));
+            escaped.append(Char16(character));
+        } else {
+            escaped.append(Char16(isPrintableAscii(character) ? character : Uint16(' ')));
         }
-        escaped.append(piece, size);
     }
     return escaped;
 }
