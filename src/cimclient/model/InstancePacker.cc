@@ -21,8 +21,7 @@ CIMConstInstance InstancePacker::packed(const CIMConstInstance& instance) {
 }
 
 Boolean InstancePacker::take(const CIMConstProperty& property) {
-    if (property.getQualifierCount() != 0 || property.getType() >= CIMTYPE_REFERENCE ||
-        !packing.hasRoom() || !packing.add(property.getValue()))
+    if (!canBePacked(property) || !packing.hasRoom() || !packing.add(property.getValue()))
         return false;
     taken.push_back(declarationOf(property));
     return true;

@@ -66,6 +66,12 @@ class PackedProperties : public SharedBody {
     std::shared_ptr<const InstanceShape> shape;
 };
 
+/// Whether packing keeps all of the property.
+inline Boolean canBePacked(const CIMConstProperty& property) {
+    return property.getQualifierCount() == 0 && property.getReferenceClassName().isNull() &&
+           property.getType() < CIMTYPE_REFERENCE;
+}
+
 /// Makes the packed properties of one instance after the other.
 ///
 /// Between start() and finish() each property is begun with beginNull(), beginScalar() or

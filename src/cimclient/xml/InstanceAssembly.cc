@@ -48,14 +48,10 @@ void InstanceAssembly::addProperty(const CIMProperty& property, std::string_view
 // False when the property can only be had in an unpacked instance.
 bool InstanceAssembly::pack(const CIMProperty& property, std::string_view element) {
     const CIMConstProperty& read = property;
-    const bool isPlain = read.getQualifierCount() == 0 && read.getReferenceClassName().isNull();
-    if (known == nullptr || !isPlain || !packing.hasRoom() || hasPacked(read.getName())) {
+    if (known == nullptr || !canBePacked(read) || !packing.hasRoom() || hasPacked(read.getName())) {
         return false;
     }
     const CIMValue value = read.getValue();
-    if (value.getType() >= CIMTYPE_REFERENCE) {
-        return false;
-    }
     const std::optional<std::size_t> position =
         known->note(declarationOf(read), next, element, value.isNull());
     if (!position) {
