@@ -1,8 +1,13 @@
 #include "cim/ValueText.h"
 
 #include <Pegasus/Common/CIMDateTime.h>
+#include <Pegasus/Common/CIMInstance.h>
+#include <Pegasus/Common/CIMObject.h>
 #include <Pegasus/Common/CIMObjectPath.h>
 
+#include <variant>
+
+#include "SennetConverter/framework/CimConverter.h"
 #include "cim/CimText.h"
 
 namespace sennetctl {
@@ -26,62 +31,38 @@ Json plain(const CIMDateTime& time) {
 Json plain(const CIMObjectPath& path) {
     return textOf(path.toString());
 }
+// Only for completeness: they are shown as a whole.
+Json plain(const CIMObject& object) {
+    return textOf(CIMValue(object).toString());
+}
+Json plain(const CIMInstance& instance) {
+    return textOf(CIMValue(instance).toString());
+}
 template <typename Number>
 Json plain(Number number) {
     return number;
 }
 
-template <typename T>
-Json read(const CIMValue& value) {
-    if (!value.isArray()) {
-        T element{};
-        value.get(element);
+struct Plain {
+    Json operator()(std::monostate) const { return nullptr; }
+    template <typename T>
+    Json operator()(const T& element) const {
         return plain(element);
     }
-    Array<T> elements;
-    value.get(elements);
-    Json list = Json::array();
-    for (Uint32 i = 0; i < elements.size(); ++i) {
-        list.push_back(plain(static_cast<const Array<T>&>(elements)[i]));
+    template <typename T>
+    Json operator()(const Array<T>& elements) const {
+        Json list = Json::array();
+        for (const T& element : elements) {
+            list.push_back(plain(element));
+        }
+        return list;
     }
-    return list;
-}
+};
 
 Json withoutNames(const CIMValue& value) {
-    switch (value.getType()) {
-        case CIMTYPE_BOOLEAN:
-            return read<Boolean>(value);
-        case CIMTYPE_UINT8:
-            return read<Uint8>(value);
-        case CIMTYPE_SINT8:
-            return read<Sint8>(value);
-        case CIMTYPE_UINT16:
-            return read<Uint16>(value);
-        case CIMTYPE_SINT16:
-            return read<Sint16>(value);
-        case CIMTYPE_UINT32:
-            return read<Uint32>(value);
-        case CIMTYPE_SINT32:
-            return read<Sint32>(value);
-        case CIMTYPE_UINT64:
-            return read<Uint64>(value);
-        case CIMTYPE_SINT64:
-            return read<Sint64>(value);
-        case CIMTYPE_REAL32:
-            return read<Real32>(value);
-        case CIMTYPE_REAL64:
-            return read<Real64>(value);
-        case CIMTYPE_CHAR16:
-            return read<Char16>(value);
-        case CIMTYPE_STRING:
-            return read<String>(value);
-        case CIMTYPE_DATETIME:
-            return read<CIMDateTime>(value);
-        case CIMTYPE_REFERENCE:
-            return read<CIMObjectPath>(value);
-        default:
-            return textOf(value.toString());
-    }
+    // Embedded objects have one text, arrays of them included.
+    return value.getType() > CIMTYPE_REFERENCE ? Json(textOf(value.toString()))
+                                               : value.visit(Plain());
 }
 
 std::string elementText(const Json& element) {
@@ -128,8 +109,7 @@ Json ValueText::json(const CIMValue& value, const CIMProperty* declared) {
 
 /// The names of an integer or of those of an array; null when the property has none.
 Json ValueText::names(const CIMValue& value, const CIMProperty* declared) {
-    const CIMType type = value.getType();
-    if (declared == nullptr || type < CIMTYPE_UINT8 || type > CIMTYPE_SINT64) {
+    if (declared == nullptr || !CimConverter::isInteger(value.getType())) {
         return nullptr;
     }
     const Uint32 position = declared->findQualifier(CIMName("Values"));

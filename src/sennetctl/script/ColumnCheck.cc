@@ -2,6 +2,7 @@
 
 #include <cstdlib>
 
+#include "SennetConverter/framework/CimConverter.h"
 #include "SennetConverter/framework/PropertyLookup.h"
 #include "cim/CimText.h"
 #include "report/Text.h"
@@ -14,10 +15,6 @@ namespace {
 
 constexpr std::size_t kLongestText = 255;
 constexpr std::size_t kLongestOther = 32;
-
-bool isInteger(CIMType type) {
-    return type >= CIMTYPE_UINT8 && type <= CIMTYPE_SINT64;
-}
 
 bool hasQualifier(const Column& column, const char* name) {
     return column.declared && column.declared->findQualifier(CIMName(name)) != PEG_NOT_FOUND;
@@ -71,7 +68,7 @@ void countLosses(const CIMValue& value, bool hasNames, std::size_t size, Losses&
     if (value.isNull()) {
         return;
     }
-    if (isInteger(value.getType())) {
+    if (CimConverter::isInteger(value.getType())) {
         losses.wide += !value.isArray() && !hasNames && !survives(value) ? 1 : 0;
         return;
     }
@@ -145,7 +142,7 @@ bool lacksSize(const Column& column, const AnsweredClass& answered, const Velm::
     }
     const CIMType type = column.declared->getType();
     const bool isText =
-        type == CIMTYPE_STRING || (isInteger(type) && hasQualifier(column, "Values"));
+        type == CIMTYPE_STRING || (CimConverter::isInteger(type) && hasQualifier(column, "Values"));
     // What the class says about the length of a number's name is about the number.
     const std::size_t size = declaredSize(column, answered, texts);
     return isText && size == 0;
