@@ -111,7 +111,10 @@ int ReplacingFile::readPreviousMode() {
         return errno == ENOENT ? 0 : errno;
     }
     if (S_ISREG(previous.st_mode)) {
-        previousMode = previous.st_mode & kPermissionBits;
+        // Somebody else who may write into the directory must not choose who may write to our file.
+        if (previous.st_uid == ::geteuid() && previous.st_nlink == 1) {
+            previousMode = previous.st_mode & kPermissionBits;
+        }
         return 0;
     }
     if (S_ISLNK(previous.st_mode)) {

@@ -33,8 +33,9 @@ class ReplacingFile {
     // Appends bytes. Returns false once any write has failed.
     bool write(std::string_view bytes);
 
-    // Puts the file in its place, with the permissions of the regular file it replaces. Returns
-    // false, the previous file untouched, when this or any write failed. Ends the object's use.
+    // Puts the file in its place, with the permissions of the regular file it replaces if that
+    // belongs to the effective user and has this one name. Returns false, the previous file
+    // untouched, when this or any write failed. Ends the object's use.
     bool commit();
 
   private:

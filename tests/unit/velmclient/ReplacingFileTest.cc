@@ -8,6 +8,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <cstdio>
 #include <string>
 #include <vector>
 
@@ -91,6 +92,44 @@ TEST(ReplacingFile, ANamelessFileIsNotSeenAtAll) {
     EXPECT_THAT(directory.names(), ElementsAre("a"));
 }
 
+unsigned int modeOf(const std::string& path) {
+    struct stat status {};
+    return ::lstat(path.c_str(), &status) == 0 ? status.st_mode & 07777U : 0U;
+}
+
+std::string modeOfReplacement(const std::string& path) {
+    const mode_t umaskBefore = ::umask(022);
+    ReplacingFile file(path);
+    const bool replaced = file.open() && file.commit();
+    ::umask(umaskBefore);
+    char text[8];
+    std::snprintf(text, sizeof text, "%04o", modeOf(path));
+    return replaced ? text : "not replaced";
+}
+
+// Whoever may write into the directory once left a file there that all may write to, and could then
+// change the inventory that root wrote over it.
+TEST(ReplacingFile, AStrangersFileDoesNotGiveItsMode) {
+    if (::geteuid() != 0) {
+        GTEST_SKIP() << "only root can give a file to somebody else";
+    }
+    const TempDirectory directory;
+    const std::string path = directory.write("a", "planted");
+    ASSERT_EQ(::chown(path.c_str(), 12345, 12345), 0);
+    ASSERT_EQ(::chmod(path.c_str(), 0666), 0);
+    EXPECT_EQ(modeOfReplacement(path), "0644");
+}
+
+TEST(ReplacingFile, AFileOfTwoNamesDoesNotGiveItsMode) {
+    const TempDirectory directory;
+    const std::string elsewhere = directory.write("elsewhere", "open to all");
+    ASSERT_EQ(::chmod(elsewhere.c_str(), 0666), 0);
+    ASSERT_EQ(::link(elsewhere.c_str(), directory.path("a").c_str()), 0);
+    EXPECT_EQ(modeOfReplacement(directory.path("a")), "0644");
+    EXPECT_EQ(modeOf(elsewhere), 0666U);
+    EXPECT_EQ(directory.read("elsewhere"), "open to all");
+}
+
 TEST(ReplacingFile, TheModeIsKeptOnBothRoads) {
     const TempDirectory directory;
     const std::string path = directory.write("a", "old");
@@ -100,9 +139,7 @@ TEST(ReplacingFile, TheModeIsKeptOnBothRoads) {
         ReplacingFile file(path, temporary);
         ASSERT_TRUE(file.open());
         ASSERT_TRUE(file.commit());
-        struct stat status {};
-        ASSERT_EQ(::stat(path.c_str(), &status), 0);
-        EXPECT_EQ(status.st_mode & 07777U, 0604U);
+        EXPECT_EQ(modeOf(path), 0604U);
     }
 }
 
