@@ -7,11 +7,24 @@ if(CMAKE_CXX_COMPILER_ID STREQUAL "GNU")
     target_compile_options(sennet_compile INTERFACE -Wno-restrict -Wno-maybe-uninitialized)
 endif()
 
-if(CMAKE_BUILD_TYPE STREQUAL "Release")
-    # Level 2 of the fortified library functions and the stack protector: the programs run as root.
-    target_compile_options(sennet_compile INTERFACE -fstack-protector-strong)
+# The programs run as root and read what others send: addresses differ from run to run, and what the
+# loader has resolved cannot be written to afterwards. tests/hardening looks at the built files.
+include(CheckPIESupported)
+check_pie_supported(LANGUAGES CXX)
+target_link_options(sennet_compile INTERFACE -Wl,-z,relro,-z,now,-z,noexecstack)
+
+if(NOT CMAKE_BUILD_TYPE STREQUAL "Debug" AND NOT SENNET_SANITIZE)
+    # The fortified library functions need an optimising compiler.
     target_compile_definitions(sennet_compile INTERFACE _FORTIFY_SOURCE=2)
-    target_link_options(sennet_compile INTERFACE -Wl,-z,relro,-z,now)
+    target_compile_options(sennet_compile INTERFACE -fstack-protector-strong)
+    # Not for every processor.
+    include(CheckCXXCompilerFlag)
+    foreach(protection stack-clash-protection cf-protection)
+        check_cxx_compiler_flag(-f${protection} SENNET_HAS_${protection})
+        if(SENNET_HAS_${protection})
+            target_compile_options(sennet_compile INTERFACE -f${protection})
+        endif()
+    endforeach()
 endif()
 
 if(SENNET_SANITIZE)
