@@ -180,7 +180,8 @@ class Program:
         return self._child.pid
 
     def signal(self, number):
-        self._child.send_signal(number)
+        # Popen would reap a child that has ended, and its use of memory would be lost.
+        signal.pidfd_send_signal(self._ended, number)
 
     def wait(self, patience_s=PATIENCE_S):
         """Finished, or Failure when it did not end in time; it is killed then."""

@@ -1,0 +1,165 @@
+"""What a private child of the generator gets from it, and what an environment may do."""
+
+import os
+import pathlib
+import signal
+
+import neighbours
+import rows
+from neighbours import STRANGER, Generator, Listener
+from rows import expect, expect_equal
+
+from cimomd_server import waited
+
+SUITE = rows.Suite(__doc__)
+SECRET = "the-value-of-a-variable"
+
+
+def child_of(program):
+    """The cimomd that the running generator has started, or nothing yet."""
+    try:
+        children = pathlib.Path(f"/proc/{program.pid}/task/{program.pid}/children").read_text()
+        for child in map(int, children.split()):
+            if os.readlink(f"/proc/{child}/exe").endswith("/cimomd"):
+                return child
+    except OSError:
+        pass
+    return None
+
+
+def is_running(process):
+    try:
+        return pathlib.Path(f"/proc/{process}/stat").read_text().rsplit(")", 1)[1].split()[0] != "Z"
+    except OSError:
+        return False
+
+
+def descriptors_of(process):
+    return {int(entry.name): os.readlink(entry)
+            for entry in pathlib.Path(f"/proc/{process}/fd").iterdir()}
+
+
+def with_running_child(trial, look):
+    """Calls `look` with the stopped generator, its child, and what the generator had inherited."""
+    with rows.place() as place:
+        generator = Generator(trial, place)
+        kept = open(pathlib.Path(place) / "kept open", "w+b")
+        inside, outside = os.pipe()
+        program = rows.Program(generator.command(), generator.environment(SECRET_WORD=SECRET),
+                               pass_fds=(kept.fileno(), inside, outside))
+        inherited = {os.readlink(f"/proc/self/fd/{number}")
+                     for number in (kept.fileno(), inside, outside)}
+        try:
+            expect(waited(lambda: child_of(program) is not None), "no child was started")
+            program.signal(signal.SIGSTOP)
+            look(program, child_of(program), inherited)
+        finally:
+            program.kill()
+            kept.close()
+            os.close(inside)
+            os.close(outside)
+
+
+def look_at_child(program, child, inherited):
+    expect(child is not None, "the child ended while its parent was stopped")
+    expect(inherited & set(descriptors_of(program.pid).values()) == inherited,
+           "the generator itself did not inherit what it was given")
+    found = descriptors_of(child)
+    expect_equal([found.get(number) for number in range(3)], ["/dev/null"] * 3,
+                 "the child's standard streams")
+    expect(found.get(3, "").startswith("socket:"), f"the child's descriptor 3 is {found.get(3)}")
+    expect(not inherited & set(found.values()), f"inherited by the child: {found}")
+    environment = pathlib.Path(f"/proc/{child}/environ").read_bytes()
+    expect_equal(environment, b"PATH=/usr/sbin:/usr/bin:/sbin:/bin\0", "the child's environment")
+
+
+@SUITE.case("the private child is looked at for what it could have inherited")
+def _(trial):
+    for _ in trial.repeat(20):
+        trial.count()
+        with_running_child(trial, look_at_child)
+    return "nothing but its connection: no file, pipe, standard stream or variable"
+
+
+def kill_parent(program, child, _):
+    expect(child is not None, "the child ended while its parent was stopped")
+    program.signal(signal.SIGKILL)
+    expect(waited(lambda: not is_running(child)), "the child outlives its parent")
+
+
+@SUITE.case("the generator is killed while its private child serves")
+def _(trial):
+    for _ in trial.repeat(50):
+        trial.count()
+        with_running_child(trial, kill_parent)
+    return "the child ends with it"
+
+
+def evil_program(directory):
+    """Something to be run in the place of cimomd, and the trace that it leaves."""
+    program, trace = directory / "evil", directory / "trace"
+    program.write_text(f"#!/bin/sh\nid -u >'{trace}'\n")
+    program.chmod(0o755)
+    return program, trace
+
+
+def hostile_environment(directory, listener):
+    program, _ = evil_program(directory)
+    configuration = directory / "evil.properties"
+    configuration.write_text(f"sennet.directory={directory}\nmif.directory={directory}\n")
+    return {"CIM_COMMAND": str(program), "VELM_CONFIG": str(configuration),
+            "TMPDIR": str(directory), "HOME": str(directory), "PATH": str(directory),
+            **({"CIM_LOCAL_SOCKET": str(listener.path)} if listener else {})}
+
+
+@SUITE.case("an unprivileged caller's environment meets a program that runs as root for it")
+def _(trial):
+    neighbours.need()
+    with neighbours.place_for_programs() as place, Listener("/var/tmp/any.socket") as listener:
+        directory = pathlib.Path(place)
+        if os.statvfs(directory).f_flag & os.ST_NOSUID:
+            raise rows.Skip("temporary files cannot be set-user-id here")
+        programs = neighbours.public_programs(trial, place)
+        program = programs / "sennet"
+        options = {"patience_s": 30, **neighbours.stranger_options()}
+        directory.chmod(0o777)
+        _, trace = evil_program(directory)
+
+        # Without the set-user-id bit it is the caller's own program and does as it is told.
+        for chosen in (None, listener):
+            trial.count()
+            rows.run([program, "/SMS", directory / "out"], hostile_environment(directory, chosen),
+                     **options)
+        expect_equal(trace.read_text(), f"{STRANGER}\n", "who ran the caller's program")
+        trace.unlink()
+        before = listener.heard()
+        expect(before[0] == 1, f"the caller's server was not asked: {before}")
+
+        program.chmod(0o4755)
+        for chosen in (None, listener):
+            trial.count()
+            finished = rows.run([program, "/SMS", directory / "out"],
+                                hostile_environment(directory, chosen), **options)
+            expect_equal(finished.status, 0, f"status of {finished}")
+        expect(not trace.exists(), "the caller's program ran as another user")
+        expect_equal(listener.heard(), before, "what the caller's server heard")
+    return "CIM_COMMAND, CIM_LOCAL_SOCKET and VELM_CONFIG are ignored"
+
+
+@SUITE.case("TMPDIR and HOME lead into another user's directory")
+def _(trial):
+    neighbours.need()
+    with rows.place() as place, rows.place() as foreign:
+        trial.count()
+        os.chown(foreign, STRANGER, STRANGER)
+        generator = Generator(trial, place)
+        finished = generator.run(more={"TMPDIR": foreign, "HOME": foreign})
+        generator.expect_inventory(finished)
+        expect_equal(os.listdir(foreign), [], "what was left in the other user's directory")
+        expect_equal(sorted(os.listdir(generator.output)), [neighbours.SCRIPT + ".mif"],
+                     "the files of the run")
+    return "nothing is written there"
+
+
+if __name__ == "__main__":
+    neighbours.main(SUITE)
