@@ -1,7 +1,7 @@
 # The packages that cpack makes: Debian's (DEB) and RPM's (RPM) from one description.
 
-set(SENNET_PACKAGE_CONTACT "The sennet maintainers <maintainers@sennet.invalid>"
-    CACHE STRING "Who maintains the packages: name and mail address")
+set(SENNET_PACKAGE_CONTACT "" CACHE STRING
+    "Who answers for the packages that cpack makes: Name <address>")
 set(SENNET_PACKAGE_RELEASE 1 CACHE STRING "Release of the packages of this version")
 
 set(debian "${CMAKE_CURRENT_BINARY_DIR}/debian")
@@ -34,6 +34,7 @@ install(DIRECTORY "${PROJECT_SOURCE_DIR}/docs/examples"
 set(CPACK_PACKAGE_NAME sennet)
 set(CPACK_PACKAGE_VENDOR "The sennet maintainers")
 set(CPACK_PACKAGE_CONTACT "${SENNET_PACKAGE_CONTACT}")
+set(CPACK_PROJECT_CONFIG_FILE "${CMAKE_CURRENT_SOURCE_DIR}/BeforePacking.cmake")
 set(CPACK_PACKAGE_DIRECTORY "${CMAKE_BINARY_DIR}/packages")
 set(CPACK_STRIP_FILES ON)
 # Some files go below the system configuration directory, outside the prefix.
