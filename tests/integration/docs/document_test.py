@@ -1,10 +1,12 @@
 """The reader of the documents, and the comparison of what they show with what is printed."""
 
 import pathlib
+import subprocess
 import tempfile
 import unittest
 
 import document
+import root_commands
 
 TEXT = """\
 # Title
@@ -105,6 +107,44 @@ class ShapeTest(unittest.TestCase):
         self.assertShape("a|...|c|...|e", "a|b|d|e", False)
         self.assertShape("...|c", "c|d", False)
         self.assertShape("a|...|a", "a", False)
+
+
+class RootCommandsTest(unittest.TestCase):
+    def setUp(self):
+        directory = tempfile.TemporaryDirectory(prefix="sennet-root-commands-")
+        self.addCleanup(directory.cleanup)
+        self.path = pathlib.Path(directory.name) / "some.md"
+        self.place = pathlib.Path(directory.name) / "told"
+
+    def judged(self, shown, command="echo 7 timers"):
+        """What is said of a command after it has run; None is nothing."""
+        self.path.write_text(f"## One\n\n```console\n# {command}\n{shown}\n```\n")
+        script = subprocess.run(
+            ["python3", "-B", root_commands.__file__, "script", self.path, "One", self.place],
+            capture_output=True, check=True, timeout=60).stdout
+        subprocess.run(["sh"], input=script, check=True, timeout=60)
+        try:
+            return root_commands.judge(self.path, "One", self.place)
+        except SystemExit as end:
+            return str(end)
+
+    def test_what_is_shown_is_compared(self):
+        self.assertIsNone(self.judged("8 timers"))
+        self.assertIn("prints another thing", self.judged("8 services"))
+
+    def test_a_failure_is_told(self):
+        self.assertIn("ends with status 1", self.judged("", "false"))
+
+    def test_a_command_that_did_not_run_is_told(self):
+        self.judged("8 timers")
+        (self.place / "0.status").unlink()
+        with self.assertRaises(SystemExit):
+            root_commands.judge(self.path, "One", self.place)
+
+    def test_a_section_without_commands_is_told(self):
+        self.judged("8 timers")
+        with self.assertRaises(SystemExit):
+            root_commands.judge(self.path, "Two", self.place)
 
 
 if __name__ == "__main__":
