@@ -1,6 +1,7 @@
 """A system as the documents tell of it, below a directory: the commands of the documents run there
 unchanged but for that directory before its places."""
 
+import contextlib
 import os
 import pathlib
 import pwd
@@ -17,8 +18,8 @@ from installation import Cimomd, Programs
 
 PATIENCE_S = 120
 # Places of an installed system that are written to or hold what the packages bring.
-PLACES = re.compile(r"(?<![\w.~/$-])(?=/(etc/(velmira|sennet|cimomd|systemd)|usr/share/sennet|usr/sbin/cimomd"
-                    r"|var/lib/sennet|srv|run|tmp)\b)")
+PLACES = re.compile(r"(?<![\w.~/$-])(?=/(etc/(velmira|sennet|cimomd|systemd)|usr/share/sennet|"
+                    r"usr/sbin/cimomd|var/lib/sennet|srv|run|tmp)\b)")
 DIRECTORIES = ("etc/velmira", "etc/cimomd/mof.d", "usr/share/sennet", "usr/sbin", "var/lib", "srv",
                "run", "tmp", "bin", "work")
 # What root alone may read of the recorded laptop.
@@ -43,26 +44,25 @@ class Place:
 
     def __init__(self, sources):
         self.sources = sources
-        self.directory = tempfile.TemporaryDirectory(prefix="sennet-docs-")
-        self.root = pathlib.Path(self.directory.name)
+        self.stack = contextlib.ExitStack()
+        self.root = pathlib.Path(
+            self.stack.enter_context(tempfile.TemporaryDirectory(prefix="sennet-docs-")))
         self.root.chmod(0o755)
         for name in DIRECTORIES:
             (self.root / name).mkdir(parents=True)
         self.work = self.root / "work"
-        self.servers = []
+        self.other_socket = None
         shutil.copytree(sources.programs.inventory, self.root / "usr/share/sennet",
                         dirs_exist_ok=True)
         self._write_configuration()
         # What it does when everything is built; that alone is no matter of the documents.
-        self._write_program("work/run", 'exec sennet "${@:-/SMS}" ./out')
+        self._write_program("work/run", "exec sennet /SMS ./out")
 
     def __enter__(self):
         return self
 
     def __exit__(self, *_):
-        for server in self.servers:
-            server.end()
-        self.directory.cleanup()
+        self.stack.close()
 
     def _write_configuration(self):
         """The one of the packages, with the places of this system."""
@@ -123,13 +123,12 @@ class Place:
 
     def other_server(self):
         """One that an administrator named, on another machine's record."""
-        if not self.servers:
+        if self.other_socket is None:
             place = self.root / "other"
             place.mkdir()
             server = Cimomd(self.sources.programs, place, self.sources.machines / "virtual", place)
-            self.servers.append(server)
-            server.__enter__()
-        return {"CIM_LOCAL_SOCKET": str(self.servers[0].socket)}
+            self.other_socket = self.stack.enter_context(server).socket
+        return {"CIM_LOCAL_SOCKET": str(self.other_socket)}
 
     def plain_user(self):
         """The object manager may not read what is root's."""
