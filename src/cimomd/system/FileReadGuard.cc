@@ -1,6 +1,7 @@
 #include "system/FileReadGuard.h"
 
 #include <array>
+#include <cstdint>
 
 #include "files/TextFile.h"
 #include "system/GuardedChild.h"
@@ -17,7 +18,7 @@ struct Question {
 /// Comes before the bytes of a file.
 struct Head {
     FileStatus status = FileStatus::Absent;
-    std::size_t length = 0;
+    std::uint32_t length = 0;
 };
 
 void sendFiles(const void* asked, int answers) {
@@ -25,9 +26,10 @@ void sendFiles(const void* asked, int answers) {
     std::array<char, kMaxGuardedBytes> buffer;
     for (std::size_t i = 0; i < question.count; ++i) {
         Head head;
-        head.status = question.call(question.paths[i], buffer.data(), buffer.size(), head.length);
-        if (!writeAnswer(answers, &head, sizeof head) ||
-            !writeAnswer(answers, buffer.data(), head.length))
+        std::size_t length = 0;
+        head.status = question.call(question.paths[i], buffer.data(), buffer.size(), length);
+        head.length = static_cast<std::uint32_t>(length);
+        if (!writeAnswer(answers, head) || !writeAnswer(answers, buffer.data(), length))
             return;
     }
 }

@@ -9,6 +9,7 @@
 #include <cstddef>
 #include <optional>
 #include <string>
+#include <type_traits>
 
 #include "system/Fact.h"
 #include "system/SilentSources.h"
@@ -50,5 +51,12 @@ std::optional<Absence> askGuarded(SilentSources& sources, const std::string& sou
 
 /// For tasks: writes all of it; false when the reader is gone.
 bool writeAnswer(int answers, const void* bytes, std::size_t size);
+
+/// The same for an answer without padding, which is memory that nobody has set.
+template <typename Answer>
+bool writeAnswer(int answers, const Answer& answer) {
+    static_assert(std::has_unique_object_representations_v<Answer>);
+    return writeAnswer(answers, &answer, sizeof answer);
+}
 
 }  // namespace cimomd

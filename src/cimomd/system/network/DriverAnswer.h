@@ -18,10 +18,10 @@ struct DriverAnswer {
     /// The errno value of the question for the permanent address, 0 for none; then the address.
     int addressError = 0;
     std::array<char, kMaxAddressBytes> address{};
-    std::size_t addressBytes = 0;
+    std::uint32_t addressBytes = 0;
     /// The same for the connector: a PORT_ number of linux/ethtool.h.
     int portError = 0;
-    std::uint8_t port = 0;
+    std::uint32_t port = 0;
 };
 
 /// Asks the driver of an interface of the machine this runs on. May block for ever. Safe between

@@ -14,7 +14,7 @@ void answerQuestion(const void* asked, int answers) {
     const Question& question = *static_cast<const Question*>(asked);
     DriverAnswer answer;
     question.call(question.interfaceName, answer);
-    writeAnswer(answers, &answer, sizeof answer);
+    writeAnswer(answers, answer);
 }
 
 }  // namespace

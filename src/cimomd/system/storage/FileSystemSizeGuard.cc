@@ -3,6 +3,7 @@
 #include <sys/statfs.h>
 
 #include <cerrno>
+#include <cstdint>
 
 #include "system/GuardedChild.h"
 
@@ -15,7 +16,7 @@ struct Question {
 };
 
 struct Answer {
-    int error = 0;
+    std::int64_t error = 0;
     FileSystemSize size;
 };
 
@@ -23,7 +24,7 @@ void answerQuestion(const void* asked, int answers) {
     const Question& question = *static_cast<const Question*>(asked);
     Answer answer;
     answer.error = question.call(question.mountPoint, answer.size);
-    writeAnswer(answers, &answer, sizeof answer);
+    writeAnswer(answers, answer);
 }
 
 }  // namespace
@@ -55,7 +56,7 @@ Fact<FileSystemSize> FileSystemSizeGuard::ask(const std::string& device,
     if (absence)
         return *absence;
     if (answer.error != 0)
-        return absenceOfSize(answer.error);
+        return absenceOfSize(static_cast<int>(answer.error));
     return answer.size;
 }
 
