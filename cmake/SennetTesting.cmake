@@ -1,8 +1,9 @@
 # sennet_add_test(NAME SOURCES file... [LIBS target...])
 #   One GoogleTest program, registered case by case with CTest.
-# sennet_add_fuzz_target(NAME SOURCES file... [LIBS target...])
-#   A source with LLVMFuzzerTestOneInput. With SENNET_BUILD_FUZZERS a libFuzzer program fuzz-NAME;
-#   otherwise a program that replays tests/fuzz/corpus/NAME/* once, registered as a test.
+# sennet_add_fuzz_target(NAME SOURCES file... [LIBS target...] [DICTIONARY name])
+#   A source with LLVMFuzzerTestOneInput. With SENNET_BUILD_FUZZERS a libFuzzer program fuzz-NAME,
+#   beside it the dictionary as fuzz-NAME.dict; otherwise a program that replays
+#   tests/fuzz/corpus/NAME/* once, registered as a test.
 
 find_package(GTest REQUIRED)
 include(GoogleTest)
@@ -34,11 +35,15 @@ function(sennet_add_test NAME)
 endfunction()
 
 function(sennet_add_fuzz_target NAME)
-    cmake_parse_arguments(ARG "" "" "SOURCES;LIBS" ${ARGN})
+    cmake_parse_arguments(ARG "" "DICTIONARY" "SOURCES;LIBS" ${ARGN})
     set(corpus "${PROJECT_SOURCE_DIR}/tests/fuzz/corpus/${NAME}")
     if(SENNET_BUILD_FUZZERS)
         add_executable(fuzz-${NAME} ${ARG_SOURCES})
         target_link_options(fuzz-${NAME} PRIVATE -fsanitize=fuzzer)
+        if(ARG_DICTIONARY)
+            configure_file("${PROJECT_SOURCE_DIR}/tests/fuzz/dictionaries/${ARG_DICTIONARY}.dict"
+                           "${CMAKE_BINARY_DIR}/fuzz/fuzz-${NAME}.dict" COPYONLY)
+        endif()
     else()
         add_executable(fuzz-${NAME} ${ARG_SOURCES}
                        "${PROJECT_SOURCE_DIR}/tests/fuzz/ReplayMain.cc")

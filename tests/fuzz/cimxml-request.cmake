@@ -1,2 +1,0 @@
-sennet_add_fuzz_target(cimxml-request SOURCES "${CMAKE_CURRENT_LIST_DIR}/cimxml-request.cc"
-                       LIBS cimxml)

@@ -1,1 +1,0 @@
-sennet_add_fuzz_target(edid SOURCES "${CMAKE_CURRENT_LIST_DIR}/edid.cc" LIBS cimomdcore)

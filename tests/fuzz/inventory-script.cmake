@@ -1,1 +1,0 @@
-sennet_add_fuzz_target(inventory-script SOURCES inventory-script.cc LIBS CimScriptParser)
