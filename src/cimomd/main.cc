@@ -2,6 +2,7 @@
 // of its sockets, until it is told to stop.
 
 #include <fmt/format.h>
+#include <malloc.h>
 #include <sys/prctl.h>
 #include <sys/socket.h>
 #include <unistd.h>
@@ -101,6 +102,14 @@ void runEmbedded(int descriptor, MainLoop& loop, const SchemaLoader& loader,
     loop.run([&] { reload(loader, repository); });
 }
 
+/// Each thread's heap would keep what a large source once needed, and there are many threads.
+void giveLargeMemoryBack() {
+#ifdef __GLIBC__
+    constexpr int kLargeBytes = 256 << 10;
+    ::mallopt(M_MMAP_THRESHOLD, kLargeBytes);
+#endif
+}
+
 HttpLimits limitsFor(const Options& options) {
     // The parent may be as slow as it likes.
     return options.connectedDescriptor ? HttpLimits{1, std::chrono::seconds(0)} : options.limits;
@@ -150,6 +159,7 @@ int main(int argc, char** argv) {
         std::signal(SIGPIPE, SIG_IGN);
         if (!parsed.options.checkedFiles.empty())
             return cimomd::check(parsed.options);
+        cimomd::giveLargeMemoryBack();
         cimomd::serve(parsed.options);
         return 0;
     } catch (const std::exception& error) {

@@ -45,7 +45,7 @@ class Daemon(Server):
         self.program = trial.bin / "cimomd"
         socket_path = str(place / "s")
         super().__init__(place, self.program, "--http", "127.0.0.1:0", "--socket", socket_path,
-                         "--root", self.machine, "--mof-dir", self.own, "--idle-timeout", "2")
+                         "--root", self.machine, "--mof-dir", self.own, "--idle-timeout", "20")
         self.http_port = self.port()
         self.places = [socket_path, ("127.0.0.1", self.http_port)]
         self.client = Client(self.http_port)
@@ -309,6 +309,37 @@ def _(trial):
                 connection.close()
             daemon.expect_end()
     return "only who asked for it waits; the others are served; cimomd ends when told to"
+
+
+@SUITE.case("sources of 1 GiB, asked for by 16 clients at once")
+def _(trial):
+    with rows.place() as place:
+        daemon = Daemon(trial, pathlib.Path(place))
+        for name in daemon.classes():
+            expect_complete(daemon, name, "sources as they are")
+        before = daemon.memory("VmRSS")
+        for name in ("etc/passwd", "etc/group"):
+            sparse_gigabyte(daemon.machine / name, None)
+        for _ in trial.repeat(20):
+            trial.count(16)
+            ask_at_once(daemon, ["Velmira_Account", "Velmira_Group"] * 8)
+        growth = daemon.memory("VmRSS") - before
+        expect(rows.is_sanitized(daemon.program) or growth < MAX_GROWTH_BYTES,
+               f"memory grew by {growth / MIB:.1f} MiB")
+        daemon.expect_end()
+    return f"refused; afterwards the memory is what it was, within {MAX_GROWTH_BYTES // MIB} MiB"
+
+
+def ask_at_once(daemon, names):
+    connections = []
+    for name in names:
+        connections.append(socket.create_connection(("127.0.0.1", daemon.http_port)))
+        connections[-1].sendall(post(instances_of(name)))
+    for connection in connections:
+        with connection:
+            octets = exchange(connection, b"", rows.PATIENCE_S)
+            expect(octets.startswith(b"HTTP/1.1 200") and b"</CIM>" in octets,
+                   f"no complete answer: {octets[-300:]!r}")
 
 
 def at_hand(connection):
