@@ -1,6 +1,7 @@
 #include "Sennet/ConverterFactory.h"
 
 #include "SennetConverter/framework/CimConverter.h"
+#include "SennetConverter/framework/NameRules.h"
 #include "SennetConverter/mif/CaSennetConverter.h"
 #include "SennetConverter/mif/LdmsSennetConverter.h"
 #include "SennetConverter/mif/QveLumoSennetConverter.h"
@@ -17,13 +18,11 @@ using namespace Pegasus;
 
 namespace {
 
-constexpr unsigned int kMaxName = 30;
-constexpr unsigned int kMaxLumoName = 18;
 constexpr int kCombinedQveConverters = 2;
 
 template <typename Converter>
 void add(CimConverterList& converters, const String& file, const Velm::Properties& properties,
-         unsigned int maxNameLength = kMaxName) {
+         unsigned int maxNameLength = kLongestName) {
     converters.addConverter(new Converter(file, properties, maxNameLength));
 }
 
@@ -44,10 +43,10 @@ void createQveConverters(CimConverterList& converters, const String& mifDirector
                          const Velm::Properties& properties) {
     if (converters.getNumberOfConverters() == 0) {
         auto* const qve =
-            new QveSennetConverter(mifDirectory + "/kwvinv.mif", properties, kMaxName);
+            new QveSennetConverter(mifDirectory + "/kwvinv.mif", properties, kLongestName);
         converters.addConverter(qve);
-        auto* const lumo =
-            new QveLumoSennetConverter(mifDirectory + "/kwinvlumo.mif", properties, kMaxLumoName);
+        auto* const lumo = new QveLumoSennetConverter(mifDirectory + "/kwinvlumo.mif", properties,
+                                                      kLongestLumoName);
         converters.addConverter(lumo);
         // They differ in names only.
         qve->shareRows(*lumo);
@@ -58,9 +57,9 @@ void createQveConverters(CimConverterList& converters, const String& mifDirector
     add<MSCim2SqlConverter>(converters, stem + "_ms_schema.sql", properties);
     add<OracleCim2SqlConverter>(converters, stem + "_oracle_schema.sql", properties);
     add<SybaseCim2SqlConverter>(converters, stem + "_sybase_schema.sql", properties);
-    add<LumoCim2SqlConverter>(converters, stem + "_lumo_schema.sql", properties, kMaxLumoName);
+    add<LumoCim2SqlConverter>(converters, stem + "_lumo_schema.sql", properties, kLongestLumoName);
     add<Cim2ShConverter>(converters, stem + "_queries.sh", properties);
-    add<LumoCim2ShConverter>(converters, stem + "_queries_lumo.sh", properties, kMaxLumoName);
+    add<LumoCim2ShConverter>(converters, stem + "_queries_lumo.sh", properties, kLongestLumoName);
 }
 
 }  // namespace

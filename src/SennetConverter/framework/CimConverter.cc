@@ -2,6 +2,7 @@
 
 #include <cstring>
 
+#include "SennetConverter/framework/NameRules.h"
 #include "SennetConverter/framework/PropertyLookup.h"
 #include "SennetConverter/framework/SennetUtilities.h"
 
@@ -54,20 +55,11 @@ void CimConverter::closeFile() {
 }
 
 String CimConverter::getTranslatedPropertyName(String section, String propertyName) {
-    const String name = SennetUtilities::replaceAll(propertyName, ' ', '_');
-    const String key = section.size() > 0 ? section + "." + name : name;
-    const char* translation = properties.getPropertyValue(key.getCString());
-    return SennetUtilities::trim(translation != nullptr ? String(translation) : propertyName);
+    return translatedPropertyName(properties, section, propertyName);
 }
 
 String CimConverter::formatTitle(String title) {
-    return substituteValues(hashString(SennetUtilities::trim(translateTitle(title))));
-}
-
-String CimConverter::translateTitle(const String& title) {
-    const String name = SennetUtilities::replaceAll(title, ' ', '_');
-    const char* translation = properties.getPropertyValue((String("title.") + name).getCString());
-    return translation != nullptr ? String(translation) : name;
+    return substituteValues(hashString(SennetUtilities::trim(translatedTitle(properties, title))));
 }
 
 void CimConverter::forEachColumn(CimScriptParser& parser, Array<CIMClass>& classes,

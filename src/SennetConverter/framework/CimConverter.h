@@ -49,8 +49,7 @@ class CimConverter {
     /// Closes the file if it is open, and removes it if nothing was ever written.
     void closeFile();
 
-    /// Display text of a property: its entry under "section.property" (or "property" when section
-    /// is empty) with blanks in the name as "_", else the name itself; trimmed.
+    /// See translatedPropertyName.
     String getTranslatedPropertyName(String section, String propertyName);
 
     /// Name under which a title is written: blanks as "_", translated, trimmed, shortened by
@@ -94,9 +93,6 @@ class CimConverter {
     void forEachColumn(CimScriptParser& parser, Array<CIMClass>& classes,
                        const std::function<String(const String&)>& format,
                        const std::function<void(const Column&)>& visit);
-
-    /// The title with blanks as "_", or what the resource properties say in its place; untrimmed.
-    String translateTitle(const String& title);
 
     Velm::TextFile outputFile;
     int fileOpen = 0;

@@ -2,6 +2,7 @@
 
 #include "CimScriptParser/CimScriptParser.h"
 #include "SennetConverter/framework/CimInstanceLists.h"
+#include "SennetConverter/framework/NameRules.h"
 #include "SennetConverter/framework/SennetUtilities.h"
 
 namespace Pegasus {
@@ -21,7 +22,7 @@ String Cim2ShConverter::hashString(String text) {
 void Cim2ShConverter::PrintBashScript(CimScriptParser& parser, Array<CIMClass>& classes,
                                       CimInstanceLists& /*instanceLists*/) {
     const String title = parser.getTitle();
-    const String displayTitle = translateTitle(title);
+    const String displayTitle = translatedTitle(properties, title);
     const String viewStem =
         SennetUtilities::substituteValues(hashString(SennetUtilities::trim(displayTitle)));
 

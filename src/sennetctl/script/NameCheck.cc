@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "CimScriptParser/CimScriptParser.h"
+#include "SennetConverter/framework/NameRules.h"
 #include "SennetConverter/framework/SennetUtilities.h"
 #include "cim/CimText.h"
 
@@ -11,9 +12,6 @@ namespace sennetctl {
 using namespace Pegasus;
 
 namespace {
-
-constexpr unsigned kQveName = 30;
-constexpr unsigned kLumoName = 18;
 
 /// A column before a product's rules.
 struct NamedColumn {
@@ -26,22 +24,16 @@ String pegasusText(const std::string& text) {
     return String(text.c_str());
 }
 
-/// What the resource properties have under the key, else the other text; trimmed.
-String readable(const Velm::Properties& texts, const std::string& key, const std::string& other) {
-    const char* text = texts.getPropertyValue(key.c_str());
-    return SennetUtilities::trim(text != nullptr ? String(text) : pegasusText(other));
-}
-
 std::vector<NamedColumn> columnsOf(const std::vector<AnsweredClass>& classes,
                                    const Velm::Properties& texts) {
     std::vector<NamedColumn> columns;
     for (const AnsweredClass& answered : classes) {
-        const std::string className = textOf(answered.definition.getClassName());
+        const String className = answered.definition.getClassName().getString();
         for (const ScriptText& property : answered.slot->properties) {
             const auto number = static_cast<Uint32>(columns.size() + 2);
-            columns.push_back({property,
-                               readable(texts, className + "." + property.value, property.value),
-                               number});
+            columns.push_back(
+                {property, translatedPropertyName(texts, className, pegasusText(property.value)),
+                 number});
         }
     }
     return columns;
@@ -63,7 +55,7 @@ class NameChecker {
     void checkQve(const std::vector<NamedColumn>& columns) {
         Array<String> used;
         for (const NamedColumn& column : columns) {
-            const String name = shortened(column, "QVE", kQveName);
+            const String name = shortened(column, "QVE", kLongestName);
             // What collides for all products has been told.
             if (!collidesPlainly(columns, column)) {
                 tellRepeated(column, "QVE", name, used);
@@ -77,7 +69,7 @@ class NameChecker {
         std::vector<String> written;
         for (const NamedColumn& column : columns) {
             const String name = SennetUtilities::substituteValues(SennetUtilities::makeUnique(
-                shortened(column, "QVE with Lumo", kLumoName), number(column), used));
+                shortened(column, "QVE with Lumo", kLongestLumoName), number(column), used));
             const bool taken =
                 std::any_of(written.begin(), written.end(),
                             [&](const String& other) { return String::equalNoCase(other, name); });
@@ -90,11 +82,11 @@ class NameChecker {
     }
 
     void checkTitle(const ScriptText& place, const String& title) {
-        for (const unsigned limit : {kQveName, kLumoName}) {
+        for (const unsigned limit : {kLongestName, kLongestLumoName}) {
             const String name = SennetUtilities::hashString(title, limit);
             if (name.size() > 0 && !String::equal(name, withUnderscores(title))) {
                 add(place, "the title " + textOf(title) + " is shortened to " + textOf(name) +
-                               " for QVE" + (limit == kLumoName ? " with Lumo" : ""));
+                               " for QVE" + (limit == kLongestLumoName ? " with Lumo" : ""));
             }
         }
     }
@@ -152,11 +144,9 @@ void checkNames(const ScriptModel& model, const std::vector<AnsweredClass>& clas
     checker.checkQve(columns);
     checker.checkLumo(columns);
     CimScriptParser parser(pegasusText(model.file));
-    const std::string title =
-        model.title.value.empty() ? textOf(parser.getTitle()) : model.title.value;
-    std::string key = title;
-    std::replace(key.begin(), key.end(), ' ', '_');
-    checker.checkTitle(model.title, readable(texts, "title." + key, title));
+    const String title =
+        model.title.value.empty() ? parser.getTitle() : pegasusText(model.title.value);
+    checker.checkTitle(model.title, SennetUtilities::trim(translatedTitle(texts, title)));
 }
 
 }  // namespace sennetctl
