@@ -1,5 +1,7 @@
 #include "report/WholeFile.h"
 
+#include <Velm/TextFile.h>
+
 #include <cerrno>
 #include <filesystem>
 #include <fstream>
@@ -34,6 +36,22 @@ std::string readWholeFile(const std::string& path, std::size_t limitOctets) {
         throw CannotRun(path + ": cannot be read to its end");
     }
     return octets;
+}
+
+void refuseExisting(const std::string& path) {
+    if (Velm::TextFile(path.c_str()).exists()) {
+        throw CannotRun(path + ": exists already");
+    }
+}
+
+void writeWholeFile(const std::string& path, const std::string& octets) {
+    constexpr int kOpenForWriting = 1;
+    Velm::TextFile file(path.c_str());
+    const bool written = file.open(kOpenForWriting) == 0 &&
+                         file.writeLine(octets.data(), static_cast<int>(octets.size())) >= 0;
+    if (file.close() != 0 || !written) {
+        throw CannotRun(path + ": cannot be written");
+    }
 }
 
 }  // namespace sennetctl

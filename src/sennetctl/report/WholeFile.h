@@ -1,6 +1,6 @@
 #pragma once
 
-// Files read whole, within bounds.
+// Files read and written whole.
 
 #include <cstddef>
 #include <stdexcept>
@@ -20,5 +20,12 @@ constexpr std::size_t kLargestFileOctets = std::size_t(16) << 20;
 /// The octets of a regular file, links followed. Throws CannotRun, "PATH: reason", when it cannot
 /// be read or is larger than the limit.
 std::string readWholeFile(const std::string& path, std::size_t limitOctets = kLargestFileOctets);
+
+/// Throws CannotRun, "PATH: exists already", when anything stands at the path.
+void refuseExisting(const std::string& path);
+
+/// Writes a file, which is seen under its name only when it is complete, and takes the place of an
+/// earlier one. Throws CannotRun, "PATH: cannot be written", and then changes nothing.
+void writeWholeFile(const std::string& path, const std::string& octets);
 
 }  // namespace sennetctl

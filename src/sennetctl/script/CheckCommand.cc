@@ -11,8 +11,10 @@
 
 #include "cim/LocalServer.h"
 #include "report/Finding.h"
+#include "report/Progress.h"
 #include "report/Text.h"
 #include "report/WholeFile.h"
+#include "script/MissingValues.h"
 #include "script/ScriptLint.h"
 #include "script/ScriptReader.h"
 #include "script/ServerCheck.h"
@@ -37,13 +39,18 @@ std::vector<std::string> installedScripts() {
     return scripts;
 }
 
-std::unique_ptr<LocalServer> connectUnlessOffline(const CheckOptions& options,
-                                                  const Output& output) {
+/// What is asked of the server for all scripts.
+struct Answers {
+    LocalServer server;
+    MissingValues missing{server};
+};
+
+std::unique_ptr<Answers> connectUnlessOffline(const CheckOptions& options, const Output& output) {
     if (options.offline) {
         return nullptr;
     }
     try {
-        return std::make_unique<LocalServer>();
+        return std::make_unique<Answers>();
     } catch (const CannotRun& failure) {
         output.err << "sennetctl: " << printable(failure.what())
                    << "\nsennetctl: only the scripts themselves are checked\n";
@@ -51,26 +58,8 @@ std::unique_ptr<LocalServer> connectUnlessOffline(const CheckOptions& options,
     }
 }
 
-/// One line that is written over and taken away at the end.
-class Progress {
-  public:
-    explicit Progress(const Output& theOutput) : output(theOutput) {}
-    ~Progress() { show(""); }
-    Progress(const Progress&) = delete;
-    Progress& operator=(const Progress&) = delete;
-
-    void show(const std::string& text) const {
-        if (output.progress) {
-            output.err << "\r\x1B[K" << printable(text) << std::flush;
-        }
-    }
-
-  private:
-    const Output& output;
-};
-
 std::vector<Finding> checkScriptFile(const std::string& file, const CheckOptions& options,
-                                     const Velm::Properties& texts, LocalServer* server) {
+                                     const Velm::Properties& texts, Answers* answers) {
     std::vector<Finding> findings;
     ScriptModel model =
         ScriptReader(file, findings).read(readWholeFile(file, kLargestScriptOctets));
@@ -78,8 +67,9 @@ std::vector<Finding> checkScriptFile(const std::string& file, const CheckOptions
     if (options.translations) {
         checkTranslations(model, texts, findings);
     }
-    if (server != nullptr && !model.givenUp) {
-        ServerCheck(*server, texts, options.translations, findings).check(model);
+    if (answers != nullptr && !model.givenUp) {
+        ServerCheck(answers->server, answers->missing, texts, options.translations, findings)
+            .check(model);
     }
     std::stable_sort(findings.begin(), findings.end(), [](const Finding& one, const Finding& two) {
         return std::tie(one.line, one.column) < std::tie(two.line, two.column);
@@ -94,7 +84,7 @@ int checkScripts(const CheckOptions& options, const Output& output) {
         options.scripts.empty() ? installedScripts() : options.scripts;
     Velm::PropertiesFile texts(Velm::PlatformUtilities::getSennetResourceFile());
     texts.load();
-    const std::unique_ptr<LocalServer> server = connectUnlessOffline(options, output);
+    const std::unique_ptr<Answers> answers = connectUnlessOffline(options, output);
     std::vector<Finding> findings;
     {
         const Progress progress(output);
@@ -102,7 +92,7 @@ int checkScripts(const CheckOptions& options, const Output& output) {
             progress.show("script " + std::to_string(i + 1) + " of " +
                           std::to_string(files.size()) + ": " + files[i]);
             const std::vector<Finding> found =
-                checkScriptFile(files[i], options, texts.getProperties(), server.get());
+                checkScriptFile(files[i], options, texts.getProperties(), answers.get());
             findings.insert(findings.end(), found.begin(), found.end());
         }
     }

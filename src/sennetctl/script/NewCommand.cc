@@ -18,7 +18,6 @@ namespace sennetctl {
 namespace {
 
 constexpr std::string_view kSuffix = ".script.inv";
-constexpr int kOpenForWriting = 1;
 
 /// The path without .script.inv.
 std::string pathWithoutSuffix(const std::string& script) {
@@ -27,21 +26,6 @@ std::string pathWithoutSuffix(const std::string& script) {
         throw CannotRun(script + ": the name of a script ends in .script.inv");
     }
     return script.substr(0, script.size() - kSuffix.size());
-}
-
-void refuseExisting(const std::string& path) {
-    if (Velm::TextFile(path.c_str()).exists()) {
-        throw CannotRun(path + ": exists already");
-    }
-}
-
-void writeFile(const std::string& path, const std::string& text) {
-    Velm::TextFile file(path.c_str());
-    const bool written = file.open(kOpenForWriting) == 0 &&
-                         file.writeLine(text.data(), static_cast<int>(text.size())) >= 0;
-    if (file.close() != 0 || !written) {
-        throw CannotRun(path + ": cannot be written");
-    }
 }
 
 std::vector<AnsweredClass> askFor(const NewOptions& options) {
@@ -92,9 +76,9 @@ int writeNewScript(const NewOptions& options, const Output& output) {
     const std::string title =
         options.title.empty() ? readableName(stem) + " Inventory" : options.title;
     const NewScript texts = composeScript(stem, title, options.nameSpace, askFor(options));
-    writeFile(properties, texts.properties);
+    writeWholeFile(properties, texts.properties);
     try {
-        writeFile(options.script, texts.script);
+        writeWholeFile(options.script, texts.script);
     } catch (const CannotRun&) {
         Velm::TextFile(properties.c_str()).remove();
         throw;

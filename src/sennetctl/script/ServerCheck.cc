@@ -1,7 +1,6 @@
 #include "script/ServerCheck.h"
 
 #include "cim/CimText.h"
-#include "cim/ValueText.h"
 #include "report/Text.h"
 #include "script/ColumnCheck.h"
 #include "script/NameCheck.h"
@@ -11,23 +10,6 @@ namespace sennetctl {
 using namespace Pegasus;
 
 namespace {
-
-std::string textIn(const CIMInstance& instance, const char* property) {
-    const Uint32 position = instance.findProperty(CIMName(property));
-    return position == PEG_NOT_FOUND ? std::string()
-                                     : textOf(instance.getProperty(position).getValue().toString());
-}
-
-/// The name of the reason, such as "Needs Root".
-std::string reasonIn(const CIMInstance& missing, const CIMClass& definition) {
-    const Uint32 inInstance = missing.findProperty(CIMName("Reason"));
-    const Uint32 inClass = definition.findProperty(CIMName("Reason"));
-    if (inInstance == PEG_NOT_FOUND || inClass == PEG_NOT_FOUND) {
-        return {};
-    }
-    const CIMProperty declared = CIMClass(definition).getProperty(inClass);
-    return ValueText().shown(missing.getProperty(inInstance).getValue(), &declared);
-}
 
 std::string nameOf(const AnsweredClass& answered) {
     return textOf(answered.definition.getClassName());
@@ -75,7 +57,8 @@ std::optional<AnsweredClass> ServerCheck::ask(const ScriptModel& model, const Sc
                 ", so sennet takes it for empty: " + reasonOf(failure));
         return answered;
     }
-    const std::string reason = answered.instances.empty() ? reasonFor(answered, {}) : std::string();
+    const std::string reason =
+        answered.instances.empty() ? missing.reasonFor(answered, {}) : std::string();
     add(model, slot.className, Severity::Note,
         slot.className.value + ": " + counted(answered.instances.size(), "instance") +
             (reason.empty() ? "" : " (" + reason + ")"));
@@ -120,48 +103,12 @@ void ServerCheck::checkColumns(const ScriptModel& model, const AnsweredClass& an
                     property.value + ".Size) give a size: 255 are taken");
         }
         if (!answered.instances.empty() && isEmpty(*column, answered)) {
-            const std::string reason = reasonFor(answered, property.value);
+            const std::string reason = missing.reasonFor(answered, property.value);
             add(model, property, Severity::Note,
                 "the column " + property.value + " is empty" +
                     (reason.empty() ? "" : ": " + reason));
         }
     }
-}
-
-// What the server itself knows about it; other servers than cimomd do not tell.
-std::string ServerCheck::reasonFor(const AnsweredClass& answered, const std::string& property) {
-    const Reasons& known = missingValues();
-    const auto find = [&](const std::string& className) {
-        const auto found = known.find({className, property});
-        return found == known.end() ? std::string() : found->second;
-    };
-    for (const CIMInstance& instance : answered.instances) {
-        std::string reason = find(textOf(instance.getClassName()));
-        if (!reason.empty()) {
-            return reason;
-        }
-    }
-    return find(nameOf(answered));
-}
-
-const ServerCheck::Reasons& ServerCheck::missingValues() {
-    constexpr const char* kNamespace = "root/cimv2";
-    constexpr const char* kClass = "Velmira_MissingValue";
-    if (reasons) {
-        return *reasons;
-    }
-    reasons.emplace();
-    try {
-        const CIMClass definition = server.getClass(kNamespace, kClass);
-        for (const CIMInstance& missing : server.instances(kNamespace, kClass)) {
-            reasons->insert({{textIn(missing, "TargetClassName"), textIn(missing, "PropertyName")},
-                             reasonIn(missing, definition)});
-        }
-    } catch (const CIMException&) {
-        // Only cimomd has this class.
-        return *reasons;
-    }
-    return *reasons;
 }
 
 void ServerCheck::add(const ScriptModel& model, const ScriptText& place, Severity severity,

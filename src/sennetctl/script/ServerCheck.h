@@ -4,7 +4,6 @@
 
 #include <Velm/Properties.h>
 
-#include <map>
 #include <optional>
 #include <string>
 #include <vector>
@@ -12,6 +11,7 @@
 #include "cim/LocalServer.h"
 #include "report/Finding.h"
 #include "script/AnsweredClass.h"
+#include "script/MissingValues.h"
 #include "script/ScriptModel.h"
 
 namespace sennetctl {
@@ -19,30 +19,30 @@ namespace sennetctl {
 class ServerCheck {
   public:
     /// All must outlive the check. Where `wantSizes`, columns without a size are told, too.
-    ServerCheck(LocalServer& server, const Velm::Properties& texts, bool wantSizes,
-                std::vector<Finding>& findings)
-        : server(server), texts(texts), wantSizes(wantSizes), findings(findings) {}
+    ServerCheck(LocalServer& server, MissingValues& missing, const Velm::Properties& texts,
+                bool wantSizes, std::vector<Finding>& findings)
+        : server(server),
+          missing(missing),
+          texts(texts),
+          wantSizes(wantSizes),
+          findings(findings) {}
 
     /// Appends the findings for a script that the generator does not give up. Throws CannotRun when
     /// the server breaks down.
     void check(const ScriptModel& model);
 
   private:
-    using Reasons = std::map<std::pair<std::string, std::string>, std::string>;
-
     std::optional<AnsweredClass> ask(const ScriptModel& model, const ScriptSlot& slot);
     void checkPairing(const ScriptModel& model, const std::vector<AnsweredClass>& classes);
     void checkColumns(const ScriptModel& model, const AnsweredClass& answered);
-    std::string reasonFor(const AnsweredClass& answered, const std::string& property);
-    const Reasons& missingValues();
     void add(const ScriptModel& model, const ScriptText& place, Severity severity,
              const std::string& message);
 
     LocalServer& server;
+    MissingValues& missing;
     const Velm::Properties& texts;
     bool wantSizes;
     std::vector<Finding>& findings;
-    std::optional<Reasons> reasons;
 };
 
 }  // namespace sennetctl

@@ -54,6 +54,22 @@ TEST_F(CheckCommandTest, AServerIsNotAskedForAScriptThatIsGivenUp) {
     EXPECT_TRUE(fans.server.requests().empty());
 }
 
+// To tell why values are missing, the server looks at the whole machine.
+TEST_F(CheckCommandTest, TheServerIsAskedOnceWhyValuesAreMissing) {
+    const std::string text = "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=CIM_Fan\nA[0]=Spare\n";
+    const std::string one = directory.write("one.script.inv", text);
+    const std::string two = directory.write("two.script.inv", text);
+    fans.server.onGetClass("Velmira_MissingValue",
+                           support::Reply::ok("<CLASS NAME=\"Velmira_MissingValue\"/>"));
+    fans.server.onEnumerateInstances("Velmira_MissingValue", support::Reply::ok(""));
+    EXPECT_EQ(checkScripts({{one, two}, false, false}, output.plain()), 0);
+    int asked = 0;
+    for (const support::RecordedRequest& request : fans.server.requests()) {
+        asked += request.className == "Velmira_MissingValue" ? 1 : 0;
+    }
+    EXPECT_EQ(asked, 2) << "the class, and its instances";
+}
+
 TEST_F(CheckCommandTest, AScriptThatCannotBeReadEndsTheCommand) {
     EXPECT_THROW(checkScripts({{directory.path("none")}, true, false}, output.plain()), CannotRun);
 }

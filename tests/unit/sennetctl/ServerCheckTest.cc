@@ -22,7 +22,8 @@ class ServerCheckTest : public testing::Test {
         checkScript(model, findings);
         EXPECT_TRUE(findings.empty()) << findings[0].message;
         LocalServer server;
-        ServerCheck(server, texts, wantSizes, findings).check(model);
+        MissingValues missing(server);
+        ServerCheck(server, missing, texts, wantSizes, findings).check(model);
         std::string text;
         for (const Finding& finding : findings) {
             if (finding.severity != Severity::Note || wantNotes) {
@@ -182,7 +183,7 @@ TEST_F(ServerCheckTest, NamesThatCollideWhereWordsAreAbbreviated) {
 TEST_F(ServerCheckTest, TitlesThatAreShortened) {
     EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n", "Thirteen char"), "");
     const std::string told = check("G[0]=CIM_Fan\nA[0]=DeviceID\n", "Fourteen chars");
-    EXPECT_EQ(told.rfind("2:7: warning: the title Fourteen chars is shortened to Fourteen_c", 0),
+    EXPECT_EQ(told.rfind("2:7: warning: the title Fourteen_chars is shortened to Fourteen_c", 0),
               0U);
     EXPECT_EQ(told.substr(told.size() - 19), " for QVE with Lumo\n");
 }

@@ -1,0 +1,65 @@
+#include "script/MissingValues.h"
+
+#include "cim/CimText.h"
+#include "cim/ValueText.h"
+
+namespace sennetctl {
+
+using namespace Pegasus;
+
+namespace {
+
+std::string textIn(const CIMInstance& instance, const char* property) {
+    const Uint32 position = instance.findProperty(CIMName(property));
+    return position == PEG_NOT_FOUND ? std::string()
+                                     : textOf(instance.getProperty(position).getValue().toString());
+}
+
+/// The name of the reason.
+std::string reasonIn(const CIMInstance& missing, const CIMClass& definition) {
+    const Uint32 inInstance = missing.findProperty(CIMName("Reason"));
+    const Uint32 inClass = definition.findProperty(CIMName("Reason"));
+    if (inInstance == PEG_NOT_FOUND || inClass == PEG_NOT_FOUND) {
+        return {};
+    }
+    const CIMProperty declared = CIMClass(definition).getProperty(inClass);
+    return ValueText().shown(missing.getProperty(inInstance).getValue(), &declared);
+}
+
+}  // namespace
+
+std::string MissingValues::reasonFor(const AnsweredClass& answered, const std::string& property) {
+    const auto find = [&](const std::string& className) {
+        const auto found = known().find({className, property});
+        return found == known().end() ? std::string() : found->second;
+    };
+    for (const CIMInstance& instance : answered.instances) {
+        std::string reason = find(textOf(instance.getClassName()));
+        if (!reason.empty()) {
+            return reason;
+        }
+    }
+    return find(textOf(answered.definition.getClassName()));
+}
+
+const MissingValues::Reasons& MissingValues::known() {
+    constexpr const char* kNamespace = "root/cimv2";
+    constexpr const char* kClass = "Velmira_MissingValue";
+    if (reasons) {
+        return *reasons;
+    }
+    reasons.emplace();
+    try {
+        const CIMClass definition = server.getClass(kNamespace, kClass);
+        for (const CIMInstance& missing : server.instances(kNamespace, kClass)) {
+            reasons->insert({{textIn(missing, "TargetClassName"), textIn(missing, "PropertyName")},
+                             reasonIn(missing, definition)});
+        }
+    } catch (const CIMException&) {
+        // Other servers do not have this class.
+        return *reasons;
+    }
+    return *reasons;
+}
+
+}  // namespace sennetctl
