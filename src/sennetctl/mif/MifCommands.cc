@@ -72,8 +72,8 @@ void printTable(const MifTable& table, const Output& output) {
     for (const std::vector<Mif::Value>& values : table.rows) {
         std::vector<std::string> cells;
         cells.reserve(values.size());
-        for (const Mif::Value& value : values) {
-            cells.push_back(shownValue(value));
+        for (std::size_t i = 0; i < values.size(); ++i) {
+            cells.push_back(shownValue(values[i], table.columns[i]));
         }
         shown.addRow(std::move(cells));
     }
@@ -158,20 +158,19 @@ int checkMifFiles(const std::vector<std::string>& files, const LintOptions& opti
 }
 
 int showMifFile(const std::string& file, const Output& output) {
-    const Mif::Component component = readMifFile(file);
-    const std::vector<MifTable> tables = tablesOf(component);
+    const MifContent content = readMifFile(file);
     if (output.json) {
         Json document = Json::object();
-        document["component"] = fromLatin1(component.name);
+        document["component"] = content.component;
         document["tables"] = Json::array();
-        for (const MifTable& table : tables) {
+        for (const MifTable& table : content.tables) {
             document["tables"].push_back(jsonOf(table));
         }
         printJson(document, output);
         return kFine;
     }
-    output.out << "Component " << printable(fromLatin1(component.name)) << '\n';
-    for (const MifTable& table : tables) {
+    output.out << "Component " << printable(content.component) << '\n';
+    for (const MifTable& table : content.tables) {
         printTable(table, output);
     }
     return kFine;
@@ -179,7 +178,7 @@ int showMifFile(const std::string& file, const Output& output) {
 
 int compareMifFiles(const std::string& oldFile, const std::string& newFile, const Output& output) {
     const std::vector<MifChange> changes =
-        differencesOf(tablesOf(readMifFile(oldFile)), tablesOf(readMifFile(newFile)));
+        differencesOf(readMifFile(oldFile).tables, readMifFile(newFile).tables);
     if (output.json) {
         Json document = Json::object();
         document["changes"] = Json::array();

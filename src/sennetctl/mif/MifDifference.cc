@@ -11,11 +11,6 @@ namespace {
 
 using Texts = std::vector<std::string>;
 
-/// The row number that the generator puts first; it says nothing about the machine.
-bool isRowNumber(const MifColumn& column) {
-    return column.isKey && (column.name == "Index" || column.name == "Row_Index");
-}
-
 /// One of the tables with what is compared: its columns without row numbers, its values as texts.
 struct ComparedTable {
     explicit ComparedTable(const MifTable& table) {
@@ -30,7 +25,7 @@ struct ComparedTable {
         for (const std::vector<Mif::Value>& values : table.rows) {
             Texts row;
             for (const std::size_t place : places) {
-                row.push_back(shownValue(values[place]));
+                row.push_back(shownValue(values[place], table.columns[place]));
             }
             rows.push_back(std::move(row));
         }

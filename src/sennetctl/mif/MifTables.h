@@ -2,7 +2,8 @@
 
 // The tables of a MIF file as an importing product would keep them.
 
-#include <cstddef>
+#include <cstdint>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -14,6 +15,8 @@ struct MifColumn {
     std::string name;  // in UTF-8, and no two of a table are alike
     Mif::Type type;
     bool isKey = false;
+    std::string description;                         // in UTF-8
+    std::map<std::int64_t, std::string> valueNames;  // of an enumeration, in UTF-8
 };
 
 struct MifTable {
@@ -21,17 +24,29 @@ struct MifTable {
     std::string className;  // in UTF-8
     std::vector<MifColumn> columns;
     std::vector<std::vector<Mif::Value>> rows;  // as many values as there are columns
+    std::string description;                    // in UTF-8
 };
 
-/// One table per class: the rows of its tables and of its groups that are instances themselves, in
-/// the order of the file.
-std::vector<MifTable> tablesOf(const Mif::Component& component);
+/// What a MIF file holds.
+struct MifContent {
+    std::string component;  // its name, in UTF-8
+    /// One table per class: the rows of its tables and of its groups that are instances
+    /// themselves, in the order of the file.
+    std::vector<MifTable> tables;
+};
 
-/// The component of a file with everything tolerated that leaves a meaning. Throws CannotRun,
-/// "PATH:line:column: reason", when there is none, and as readWholeFile does.
-Mif::Component readMifFile(const std::string& path);
+/// Reads a file with everything tolerated that leaves a meaning. Throws CannotRun,
+/// "PATH:line:column: reason", when there is none, "PATH: reason" when its tables are too large to
+/// be held, and as readWholeFile does.
+MifContent readMifFile(const std::string& path);
+
+/// Whether this is the row number that the generator puts first; it says nothing about the machine.
+bool isRowNumber(const MifColumn& column);
 
 /// The value for people, in UTF-8; empty when there is none.
 std::string shownValue(const Mif::Value& value);
+
+/// The same; a number that has a name in the column is shown by it.
+std::string shownValue(const Mif::Value& value, const MifColumn& column);
 
 }  // namespace sennetctl

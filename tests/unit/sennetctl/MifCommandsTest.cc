@@ -84,6 +84,42 @@ TEST_F(MifCommandsTest, ShowsGroupsOfOneClassAsOneTable) {
               R"("type":"Integer","key":true}],"rows":[{"Index":1},{"Index":-2}]}])");
 }
 
+TEST_F(MifCommandsTest, NumbersAreShownByTheirNames) {
+    const std::string fan =
+        kMifStart +
+        "Start Group Name = \"Fan\" Class = \"Own|Fan|001\" Id = 2\n"
+        "Start Attribute Name = \"State\" Id = 1 Type = Integer Value = -2\n"
+        "Start Enum -2 = \"Off\" 3 = \"On\" End Enum End Attribute\n"
+        "Start Attribute Name = \"Speed\" Id = 2 Type = Integer Value = 3 End Attribute\n"
+        "End Group\n" +
+        kMifEnd;
+    EXPECT_EQ(showMifFile(file("fan", fan), output.plain()), 0);
+    EXPECT_THAT(output.text(), HasSubstr("State  Speed\nOff    3\n"));
+    CapturedOutput json;
+    showMifFile(file("fan", fan), json.json());
+    EXPECT_EQ(json.document()["tables"][0]["rows"][0].dump(), R"({"State":-2,"Speed":3})");
+}
+
+// Rows may leave out what the template has, so that a small file can have a huge table.
+TEST_F(MifCommandsTest, TablesThatCannotBeHeldAreRefused) {
+    std::string rows;
+    for (int i = 0; i < 300; ++i) {
+        rows += "{ }\n";
+    }
+    const std::string className = "\"Own|Big|001\"";
+    const std::string path = file(
+        "big", kMifStart + "Start Group Name = \"Big\" Class = " + className + " Key = 1\n" +
+                   attributeMif(1, "Text", "String(9)", "\"" + std::string(1 << 20, 'x') + "\"") +
+                   "End Group\nStart Table Name = \"Big\" Class = " + className + " Id = 2\n" +
+                   rows + "End Table\n" + kMifEnd);
+    try {
+        showMifFile(path, output.plain());
+        ADD_FAILURE() << "300 MiB of values";
+    } catch (const CannotRun& failure) {
+        EXPECT_EQ(failure.what(), path + ": its tables are larger than 256 MiB");
+    }
+}
+
 TEST_F(MifCommandsTest, JsonKeepsNumbersTextsAndWhatIsMissing) {
     const std::string path =
         file("odd", kMifStart +
