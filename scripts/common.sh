@@ -42,13 +42,26 @@ BUILD_PACKAGES=(g++ cmake ninja-build libcurl4-openssl-dev libmicrohttpd-dev lib
     libfmt-dev libmnl-dev libsystemd-dev nlohmann-json3-dev)
 # shellcheck disable=SC2034
 TEST_PACKAGES=(libgtest-dev libgmock-dev rpm python3 mariadb-server postgresql-15 shellcheck
-    sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode mandoc)
+    sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode mandoc
+    chromium)
 # shellcheck disable=SC2034
 PACKAGING_PACKAGES=(dpkg-dev file fakeroot rpm lintian debootstrap pkg-config systemd-container)
 # shellcheck disable=SC2034
 BENCHMARK_PACKAGES=(libexpat1-dev libbenchmark-dev python3)
 # shellcheck disable=SC2034
 COMPARED_PACKAGES=(fusioninventory-agent lshw)
+
+# Installs the checker of accessibility that the test of the HTML page runs in a browser. It is not
+# in Debian; without npm, or without a registry, that one test is skipped.
+want_axe_core() {
+    local version=4.14.1 place=$ROOT/build/axe
+    [ -f "$place/node_modules/axe-core/axe.min.js" ] && return
+    mkdir -p "$place"
+    step "fetching axe-core"
+    npm install --silent --no-audit --no-fund --ignore-scripts --prefix "$place" \
+        "axe-core@$version" >/dev/null 2>&1 </dev/null ||
+        step "axe-core is not to be had: the page's accessibility will not be checked"
+}
 
 # Runs a command whose output is shown only when it fails; the first argument says what it does.
 quietly() {

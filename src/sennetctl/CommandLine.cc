@@ -13,6 +13,7 @@
 #include <vector>
 
 #include "cim/CimText.h"
+#include "html/HtmlCommand.h"
 #include "mif/MifCommands.h"
 #include "report/Output.h"
 #include "report/Text.h"
@@ -193,16 +194,42 @@ void addMifDiff(CLI::App& mif, Choice& choice) {
     });
 }
 
+void addMifHtml(CLI::App& mif, Choice& choice) {
+    CLI::App* command = addCommand(mif, choice, "html", "Write a page that shows MIF files.",
+                                   "  sennetctl mif html out/*.mif -o page\n"
+                                   "  sennetctl mif html out/*.mif -o page --title \"$(hostname)\" "
+                                   "--force");
+    const auto options = std::make_shared<HtmlOptions>();
+    command->add_option("FILE", options->files, "the files, in the order of the page")
+        ->option_text("FILE...")
+        ->required();
+    command
+        ->add_option("-o,--output", options->directory,
+                     "where inventory.html goes; made if it is missing")
+        ->option_text("DIR")
+        ->required();
+    command->add_option("--title", options->title, "what the page is called, by default Inventory")
+        ->option_text("TITLE");
+    command->add_flag("--force", options->replace, "replace the page of an earlier run");
+    command->callback([&choice, options] {
+        choice.command = [options](const Output& output) {
+            return writeHtmlPage(*options, output);
+        };
+    });
+}
+
 void addMif(CLI::App& app, Choice& choice) {
     CLI::App* mif = app.add_subcommand("mif", "Check, show and compare MIF files.");
     mif->require_subcommand(1);
     mif->footer(
         "Examples:\n"
         "  sennetctl mif check --profile sms out/*.mif\n"
-        "  sennetctl mif show out/processor.mif");
+        "  sennetctl mif show out/processor.mif\n"
+        "  sennetctl mif html out/*.mif -o page");
     addMifCheck(*mif, choice);
     addMifShow(*mif, choice);
     addMifDiff(*mif, choice);
+    addMifHtml(*mif, choice);
 }
 
 int runCommand(const Choice& choice) {

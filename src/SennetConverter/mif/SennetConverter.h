@@ -17,6 +17,9 @@ namespace Pegasus {
 /// The MIF document and the steps that a product dialect may replace.
 class SennetConverter : public CimConverter {
   public:
+    /// Stands in most products' files where there is no date: they take no empty one.
+    static constexpr const char* kUnknownDate = "19800101000000.000000+000";
+
     /// See CimConverter.
     SennetConverter(const String& fileName, const Velm::Properties& properties,
                     unsigned int maxNameLength);

@@ -15,7 +15,6 @@ constexpr Uint32 kMaxText = 255;
 constexpr Uint32 kMaxOtherText = 32;
 constexpr Uint32 kDateTimeLength = 25;
 constexpr Uint32 kMicrosecondsPoint = 14;
-constexpr char kUnknownDateTime[] = "\"19800101000000.000000+000\"";
 
 bool isPrintableAscii(Uint16 character) {
     return character >= ' ' && character <= '~';
@@ -136,7 +135,7 @@ String SennetConverter::getValueString(CIMValue value, CIMType type, CIMProperty
         CIMDateTime time;
         value.get(time);
         const String text = time.toString();
-        return isCalendarDateTime(text) ? quote(text) : String(kUnknownDateTime);
+        return isCalendarDateTime(text) ? quote(text) : quote(kUnknownDate);
     }
     if (type == CIMTYPE_STRING) {
         String text;

@@ -9,6 +9,7 @@
 #include <string>
 #include <vector>
 
+#include "support/Files.h"
 #include "support/RunProgram.h"
 #include "support/TempDirectory.h"
 
@@ -55,7 +56,8 @@ TEST_F(ProgramTest, HelpHasExamplesOnEveryLevel) {
                                                {"mif", "check", "--help"},
                                                {"mif", "show", "--help"},
                                                {"mif", "json", "--help"},
-                                               {"mif", "diff", "--help"}}) {
+                                               {"mif", "diff", "--help"},
+                                               {"mif", "html", "--help"}}) {
         const ProgramResult result = runWithoutServer(arguments);
         EXPECT_EQ(result.exitStatus, 0);
         EXPECT_THAT(result.out, HasSubstr("Examples:\n  sennetctl "));
@@ -101,6 +103,27 @@ TEST_F(ProgramTest, ChecksMifFilesByTheirProfile) {
     EXPECT_EQ(runWithoutServer({"mif", "diff", file, file}).exitStatus, 0);
     EXPECT_THAT(runWithoutServer({"mif", "json", file}).out, HasSubstr("\"component\": \"a\""));
     EXPECT_THAT(runWithoutServer({"mif", "show", file}).out, HasSubstr("Component a\n"));
+}
+
+TEST_F(ProgramTest, WritesAPageOfMifFiles) {
+    const std::string file = directory.write(
+        "f.mif",
+        "Start Component Name = \"a\" Start Group Name = \"b\" Class = \"c|b|1\" Id = 1\n"
+        "Start Attribute Name = \"d\" Id = 1 Type = Integer Value = 7 End Attribute\n"
+        "End Group End Component");
+    const std::string page = directory.path("page/inventory.html");
+    const std::vector<std::string> arguments = {"mif", "html", file, "-o", directory.path("page")};
+    const ProgramResult first = runWithoutServer(arguments);
+    EXPECT_EQ(first.exitStatus, 0) << first.err;
+    EXPECT_EQ(first.out, "Written: " + page + ", 1 table from 1 file with 1 row\n");
+    const ProgramResult second = runWithoutServer(arguments);
+    EXPECT_EQ(second.exitStatus, 2);
+    EXPECT_EQ(second.err, "sennetctl: " + page + ": exists already\n");
+    std::vector<std::string> forced = arguments;
+    forced.insert(forced.end(), {"--force", "--json", "--title", "Machine 7"});
+    EXPECT_THAT(runWithoutServer(forced).out, HasSubstr("\"page\": \"" + page + "\""));
+    EXPECT_THAT(support::readFile(page), HasSubstr("<h1>Machine 7</h1>"));
+    EXPECT_EQ(runWithoutServer({"mif", "html", file}).exitStatus, 2) << "there is no directory";
 }
 
 TEST_F(ProgramTest, TheShippedScriptsAreClean) {

@@ -1,0 +1,45 @@
+#pragma once
+
+// One page of HTML that shows the tables of MIF files. It needs no other file and no network, and
+// is read without script; a little of it searches and sorts. A content security policy (CSP Level
+// 3) allows this script and style sheet and nothing else, so that no text of a file can do more
+// than be read.
+
+#include <cstddef>
+#include <ctime>
+#include <string>
+
+#include "mif/MifTables.h"
+
+namespace sennetctl {
+
+class InventoryPage {
+  public:
+    /// The title in UTF-8.
+    explicit InventoryPage(std::string theTitle) : title(std::move(theTitle)) {}
+
+    /// Appends a file's tables.
+    /// @param file      its name for people
+    /// @param modified  when it was written
+    /// Throws CannotRun when the page becomes larger than kLargestPageOctets.
+    void add(const std::string& file, std::time_t modified, const MifContent& content);
+
+    /// The whole page.
+    std::string text() const;
+
+    std::size_t files() const { return fileCount; }
+    std::size_t tables() const { return tableCount; }
+    std::size_t rows() const { return rowCount; }
+
+  private:
+    void addTable(const MifTable& table, const std::string& origin, int level);
+
+    std::string title;
+    std::string links;     // items of the list of tables
+    std::string sections;  // the tables
+    std::size_t fileCount = 0;
+    std::size_t tableCount = 0;
+    std::size_t rowCount = 0;
+};
+
+}  // namespace sennetctl
