@@ -5,7 +5,7 @@ import subprocess
 import tempfile
 import unittest
 
-from places import Places, options_of_cimomd, run_tests
+from places import Places, commands_of, options_of, run_tests
 
 SCRIPT = """
 . "$1"
@@ -26,6 +26,8 @@ class CompletionTest(unittest.TestCase):
         (self.directory / "out").mkdir()
         (self.directory / "own.mof").touch()
         (self.directory / "own.txt").touch()
+        (self.directory / "own.mif").touch()
+        (self.directory / "own.script.inv").touch()
 
     def offered(self, *words):
         """For the last of the words, in the order of the alphabet."""
@@ -36,7 +38,7 @@ class CompletionTest(unittest.TestCase):
         return sorted(line for line in result.stdout.splitlines() if line)
 
     def test_bash_knows_the_function(self):
-        for name in ("sennet", "cimomd"):
+        for name in ("sennet", "cimomd", "sennetctl"):
             result = subprocess.run(
                 ["bash", "-c", '. "$1"; complete -p "$2"', "bash",
                  Places.source / "completion" / name, name],
@@ -53,11 +55,11 @@ class CompletionTest(unittest.TestCase):
         self.assertEqual(self.offered("sennet", "/SMS", "out", "o"), [])
 
     def test_all_options_of_cimomd(self):
-        self.assertEqual(self.offered("cimomd", "-"), options_of_cimomd())
+        self.assertEqual(self.offered("cimomd", "-"), options_of("cimomd"))
 
     def test_what_an_option_takes(self):
         self.assertEqual(self.offered("cimomd", "--root", "o"), ["out"])
-        self.assertEqual(self.offered("cimomd", "--socket", "own"), ["own.mof", "own.txt"])
+        self.assertEqual(self.offered("cimomd", "--socket", "own"), ["own.mif", "own.mof", "own.script.inv", "own.txt"])
         self.assertIn("root", self.offered("cimomd", "--socket-group", "roo"))
         self.assertEqual(self.offered("cimomd", "--idle-timeout", ""), [])
 
@@ -65,6 +67,32 @@ class CompletionTest(unittest.TestCase):
         self.assertEqual(self.offered("cimomd", "--check", "o"), ["out", "own.mof"])
         self.assertEqual(self.offered("cimomd", "--check", "own.mof", "o"), ["out", "own.mof"])
         self.assertEqual(self.offered("cimomd", "--check", "own.mof", "--schema", "o"), ["out"])
+
+    def test_all_commands_of_sennetctl(self):
+        for command in (["sennetctl"], ["sennetctl", "mif"]):
+            names = commands_of(*command)
+            self.assertIn("check", names)
+            self.assertEqual([word for word in self.offered(*command, "") if word[0] != "-"],
+                             sorted(names))
+
+    def test_all_options_of_sennetctl(self):
+        self.assertEqual(self.offered("sennetctl", "-"), options_of("sennetctl"))
+        self.assertEqual(self.offered("sennetctl", "mif", "-"), options_of("sennetctl", "mif"))
+        for command in (["sennetctl"], ["sennetctl", "mif"]):
+            for name in set(commands_of(*command)) - {"mif"}:
+                with self.subTest(command=name):
+                    self.assertEqual(self.offered(*command, name, "-"),
+                                     options_of(*command, name))
+
+    def test_what_commands_of_sennetctl_take(self):
+        self.assertEqual(self.offered("sennetctl", "check", "o"), ["out", "own.script.inv"])
+        self.assertEqual(self.offered("sennetctl", "mif", "diff", "a.mif", "o"), ["out", "own.mif"])
+        self.assertEqual(self.offered("sennetctl", "mif", "html", "own.mif", "-o", "o"), ["out"])
+        self.assertEqual(self.offered("sennetctl", "mif", "check", "--profile", ""),
+                         ["ca", "dmi", "landesk", "sms"])
+        self.assertEqual(self.offered("sennetctl", "get", "o"), [])
+        self.assertEqual(self.offered("sennetctl", "get", "CIM_Fan", "-n", ""), [])
+        self.assertEqual(self.offered("sennetctl", "nothing", ""), [])
 
 
 if __name__ == "__main__":

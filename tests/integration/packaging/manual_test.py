@@ -4,9 +4,10 @@ import re
 import subprocess
 import unittest
 
-from places import Places, options_of_cimomd, run_tests
+from places import Places, commands_of, options_of, run_tests
 
-PAGES = ["cimomd.8", "script.inv.5", "sennet.8", "sennet.properties.5", "velm.properties.5"]
+PAGES = ["cimomd.8", "script.inv.5", "sennet.8", "sennet.properties.5", "sennetctl.1",
+         "velm.properties.5"]
 
 
 def page(name):
@@ -41,7 +42,32 @@ class ManualTest(unittest.TestCase):
     def test_cimomd_8_has_the_options_that_the_program_tells(self):
         items = re.findall(r"(?m)^\.It (Fl .*)$", page("cimomd.8").read_text())
         told = sorted("-" + flag for item in items for flag in re.findall(r"Fl (\S+)", item))
-        self.assertEqual(told, options_of_cimomd())
+        self.assertEqual(told, options_of("cimomd"))
+
+    def test_sennetctl_1_has_the_commands_and_options_that_the_program_tells(self):
+        text = page("sennetctl.1").read_text()
+        synopsis = text.partition(".Sh SYNOPSIS\n")[2].partition(".Sh ")[0]
+        for command in (["sennetctl"], ["sennetctl", "mif"]):
+            for name in set(commands_of(*command)) - {"mif"}:
+                with self.subTest(command=name):
+                    words = " ".join([*command[1:], name])
+                    usage = synopsis.partition(f".Cm {words}\n")[2].partition(".Nm\n")[0]
+                    told = {option.lstrip("-") for option in options_of(*command, name)
+                            if option.startswith("--")} - {"help"}
+                    told -= {name}  # "mif json" is JSON anyhow
+                    item = text.partition(f".It Cm {words}\n")[2].partition(".It Cm")[0]
+                    for option in told:
+                        self.assertRegex(usage + item, rf"(Fl|,) -{option}\b")
+                    self.assertEqual("Fl -json" in usage, "json" in told)
+
+    def test_sennetctl_1_names_no_option_that_the_program_lacks(self):
+        commands = [["sennetctl", name] for name in set(commands_of("sennetctl")) - {"mif"}]
+        commands += [["sennetctl", "mif", name] for name in commands_of("sennetctl", "mif")]
+        told = {option for command in commands for option in options_of(*command)}
+        told |= set(options_of("sennetctl"))
+        lines = re.findall(r"(?m)^\.(?:It |Op )?Fl .*$", page("sennetctl.1").read_text())
+        named = set(re.findall(r"(?:Fl|,) (-?[a-z][a-z-]*)", "\n".join(lines)))
+        self.assertLessEqual({"-" + option for option in named}, told)
 
 
 if __name__ == "__main__":

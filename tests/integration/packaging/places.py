@@ -26,9 +26,19 @@ def run_tests():
     unittest.main(module="__main__", argv=[sys.argv[0], *rest])
 
 
-def options_of_cimomd():
+def help_of(*command):
+    result = subprocess.run([Places.programs / command[0], *command[1:], "--help"],
+                            capture_output=True, text=True, timeout=60, check=True)
+    return result.stdout
+
+
+def options_of(*command):
     """The options that the program itself tells, in both spellings."""
-    result = subprocess.run([Places.programs / "cimomd", "--help"], capture_output=True, text=True,
-                            timeout=60, check=True)
-    heads = re.findall(r"(?m)^  (-\S+)", result.stdout)
+    heads = re.findall(r"(?m)^  (-\S+)", help_of(*command))
     return sorted(option for head in heads for option in head.split(","))
+
+
+def commands_of(*command):
+    """The names of the program's commands, as it tells them itself."""
+    return re.findall(r"(?m)^  (\w+)", help_of(*command).partition("Subcommands:\n")[2]
+                      .partition("\n\n")[0])
