@@ -6,7 +6,9 @@ import signal
 import subprocess
 import time
 
-PATIENCE_S = 10
+# Programs are slower under valgrind.
+SLOWNESS = int(os.environ.get("SENNET_TEST_SLOWNESS", "1"))
+PATIENCE_S = 10 * SLOWNESS
 NAMESPACE = "root/cimv2"
 
 

@@ -31,7 +31,8 @@ class Checks:
         # These build and test: a test that runs them would run itself.
         self.builders = {"./run": self.check_script, "./test": self.check_script,
                          ".ci/run": self.check_script, "bench/compare": self.check_script,
-                         "packaging/test-packages": self.check_script, "cmake": self.check_cmake,
+                         "packaging/test-packages": self.check_script,
+                         "tests/valgrind": self.check_script, "cmake": self.check_cmake,
                          "cpack": self.check_cmake, "ctest": self.check_ctest,
                          "build/release/bin/inner-parts": self.check_benchmark}
         self.others = {"systemctl": self.check_systemctl, "journalctl": self.check_journalctl,

@@ -9,9 +9,9 @@ import sys
 
 HERE = pathlib.Path(__file__).resolve().parent
 sys.path.insert(0, str(HERE.parent / "cimomd"))
-from cimomd_server import Server, waited
+from cimomd_server import SLOWNESS, Server, waited
 
-PATIENCE_S = 60
+PATIENCE_S = 60 * SLOWNESS
 PRODUCTS = ("SMS", "CA", "LD", "QVE")
 # Where the files of each product leave the grammar whatever the inventory holds.
 TOLERANCES = {
