@@ -16,6 +16,7 @@ from cimomd_server import PATIENCE_S, Server, waited
 
 SUITE = rows.Suite(__doc__)
 # CIM_ManagedSystemElement.OperationalStatus
+UNKNOWN = 0
 NO_CONTACT = 12
 TIMED_OUT = 5
 REMOTE = "fuse.sshfs"
@@ -117,6 +118,23 @@ def _(trial):
             dead.abort()
         expect_gone(session, situation)
     return "No Contact and no size; the other file systems have theirs; it ends when told to"
+
+
+@SUITE.case("cimomd tells of a mount that another user keeps for himself, its server dead")
+def _(trial):
+    neighbours.need()
+    with rows.place() as place, \
+            SilentMount(pathlib.Path(place) / "private", REMOTE, False, neighbours.STRANGER) as mount:
+        trial.count()
+        server = Server(pathlib.Path(place), trial.bin / "cimomd", "--http", "127.0.0.1:0")
+        try:
+            found = dead_instance(Client(server.port()), mount)
+            expect_equal((found["OperationalStatus"], found["FileSystemSize"],
+                          found["AvailableSpace"], found["BlockSize"]), ([UNKNOWN], None, None, None),
+                         "what is told of the mount")
+        finally:
+            server.end()
+    return "no size, also not 0, and an unknown status"
 
 
 @SUITE.case("sennet makes an inventory beside a mount whose server is dead")

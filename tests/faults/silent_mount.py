@@ -21,12 +21,15 @@ _INIT_ANSWER = struct.Struct("=IiQ" "IIII" "HHII" "HHI" "7I")
 class SilentMount:
     """To be used in a with statement, in mounts of one's own."""
 
-    def __init__(self, place, kind, takes_requests):
+    def __init__(self, place, kind, takes_requests, owner=None):
         """`kind` is what the table of mounts says. When requests are taken and not answered, who
-        asks cannot even be killed."""
+        asks cannot even be killed. An owner keeps it for himself, as is usual for FUSE; without one
+        everybody may ask."""
         self.path = pathlib.Path(place)
         self.kind = kind
         self._takes_requests = takes_requests
+        self._users = (f"user_id={owner or 0},group_id={owner or 0}" +
+                       (",allow_other" if owner is None else ""))
         self._device = os.open("/dev/fuse", os.O_RDWR | os.O_CLOEXEC)
         self._stop, self._stopping = os.pipe()
         self._thread = threading.Thread(target=self._take)
@@ -35,7 +38,7 @@ class SilentMount:
         self.path.mkdir()
         try:
             neighbours.mount("user@server.example:/srv", self.path, self.kind, _NODEV_NOSUID,
-                             f"fd={self._device},rootmode=40000,user_id=0,group_id=0,allow_other")
+                             f"fd={self._device},rootmode=40000,{self._users}")
         except OSError:
             self._close()
             raise

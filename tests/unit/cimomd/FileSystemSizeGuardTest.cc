@@ -153,6 +153,16 @@ TEST(FileSystemSizeGuard, readsTheSizeOfARealFileSystem) {
     EXPECT_EQ(asked->blocks, size.blocks);
 }
 
+// Root looked at what a user had mounted with sshfs and told of a size of 0: to all but its owner
+// the kernel answers for such a file system, with nothing but zeros.
+TEST(FileSystemSizeGuard, takesAnAnswerOfZerosForNone) {
+    const SilentFileSystem ofAnother(12345);
+    if (!ofAnother.obstacle().empty())
+        GTEST_SKIP() << "no FUSE file system can be mounted here: " << ofAnother.obstacle();
+    FileSystemSizeGuard guard;
+    EXPECT_EQ(reasonOf(guard.ask("0:40", ofAnother.mountPoint())), Absence::Absent);
+}
+
 TEST(FileSystemSizeGuard, survivesAFileSystemWhoseProgramHangs) {
     const SilentFileSystem silent;
     if (!silent.obstacle().empty())

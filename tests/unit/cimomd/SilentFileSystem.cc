@@ -33,14 +33,15 @@ void answerInit(int connection, const fuse_in_header& request) {
 
 }  // namespace
 
-SilentFileSystem::SilentFileSystem() {
+SilentFileSystem::SilentFileSystem(unsigned owner) {
     connection = ::open("/dev/fuse", O_RDWR | O_CLOEXEC | O_NONBLOCK);
     if (connection < 0) {
         failure = std::string("/dev/fuse: ") + std::strerror(errno);
         return;
     }
-    const std::string options =
-        "fd=" + std::to_string(connection) + ",rootmode=40000,user_id=0,group_id=0";
+    const std::string options = "fd=" + std::to_string(connection) +
+                                ",rootmode=40000,user_id=" + std::to_string(owner) +
+                                ",group_id=" + std::to_string(owner);
     if (::mount("silent", place.path().c_str(), "fuse.silent", MS_NODEV | MS_NOSUID,
                 options.c_str()) != 0) {
         failure = std::string("mount: ") + std::strerror(errno);

@@ -1,7 +1,8 @@
 #pragma once
 
 // A FUSE file system whose program reads the question for its size and never answers: whoever asks
-// hangs and cannot be killed until this object goes.
+// hangs and cannot be killed until this object goes. Only its owner may ask: others are told
+// nothing by the kernel itself.
 
 #include <string>
 #include <thread>
@@ -12,7 +13,7 @@ namespace cimomd {
 
 class SilentFileSystem {
   public:
-    SilentFileSystem();
+    explicit SilentFileSystem(unsigned owner = 0);
     ~SilentFileSystem();
     SilentFileSystem(const SilentFileSystem&) = delete;
     SilentFileSystem& operator=(const SilentFileSystem&) = delete;

@@ -34,6 +34,9 @@ int readFileSystemSize(const char* mountPoint, FileSystemSize& size) {
     if (::statfs(mountPoint, &status) != 0)
         return errno;
     const auto fragment = status.f_frsize != 0 ? status.f_frsize : status.f_bsize;
+    // What FUSE answers for a file system that its owner keeps for himself, even from root.
+    if (fragment == 0)
+        return ENODATA;
     size = {static_cast<std::uint64_t>(fragment), status.f_blocks, status.f_bavail, status.f_files,
             status.f_ffree};
     return 0;
@@ -42,7 +45,7 @@ int readFileSystemSize(const char* mountPoint, FileSystemSize& size) {
 Absence absenceOfSize(int error) {
     if (error == EACCES || error == EPERM)
         return Absence::NeedsRoot;
-    if (error == ENOENT || error == ENOTDIR)
+    if (error == ENOENT || error == ENOTDIR || error == ENODATA)
         return Absence::Absent;
     return error == ETIMEDOUT ? Absence::TimedOut : Absence::Unreadable;
 }
