@@ -3,6 +3,8 @@
 #include <Pegasus/Client/ClientExceptions.h>
 
 #include <algorithm>
+#include <string>
+#include <vector>
 
 #include "client/WireText.h"
 
@@ -38,6 +40,17 @@ int statusOf(std::string_view line) {
         return 0;
     }
     return (code[0] - '0') * 100 + (code[1] - '0') * 10 + (code[2] - '0');
+}
+
+// Where two lengths differ nobody knows where the answer ends (RFC 9112, section 6.3).
+void refuseTwoLengths(const HttpFields& header) {
+    const std::vector<const std::string*> lengths = header.findAll("Content-Length");
+    for (const std::string* length : lengths) {
+        if (*length != *lengths.front()) {
+            throw CIMClientMalformedHTTPException(printableText(
+                "HTTP answer has the lengths " + *lengths.front() + " and " + *length));
+        }
+    }
 }
 
 }  // namespace
@@ -76,6 +89,7 @@ void HttpAnswer::endHead() {
         status_ = 0;
         header_.clear();
     } else {
+        refuseTwoLengths(header_);
         headComplete = true;
     }
 }

@@ -17,7 +17,8 @@ class HttpAnswer {
     explicit HttpAnswer(std::size_t octetLimit) : octetsLeft(octetLimit) {}
 
     /// The next line, with or without its line end. Interim answers (status 1xx) are dropped.
-    /// Throws CIMClientMalformedHTTPException when the line is malformed or the limit is passed.
+    /// Throws CIMClientMalformedHTTPException when the line is malformed, the limit is passed or
+    /// the header gives two different lengths.
     void addLine(std::string_view line);
 
     /// Whether the empty line after the header has come.

@@ -52,6 +52,23 @@ TEST(HttpAnswerTest, RefusesBadStatusLines) {
     }
 }
 
+TEST(HttpAnswerTest, RefusesTwoLengths) {
+    HttpAnswer answer(1000);
+    answer.addLine("HTTP/1.1 200 OK\r\n");
+    answer.addLine("Content-Length: 20\r\n");
+    answer.addLine("content-length: 400\r\n");
+    EXPECT_THROW(answer.addLine("\r\n"), CIMClientMalformedHTTPException);
+}
+
+TEST(HttpAnswerTest, AcceptsOneLengthTwice) {
+    HttpAnswer answer(1000);
+    answer.addLine("HTTP/1.1 200 OK\r\n");
+    answer.addLine("Content-Length: 20\r\n");
+    answer.addLine("Content-Length: 20\r\n");
+    answer.addLine("\r\n");
+    EXPECT_TRUE(answer.isHeadComplete());
+}
+
 TEST(HttpAnswerTest, RefusesMoreOctetsThanTheLimit) {
     HttpAnswer exact(17 + 6);
     exact.addLine("HTTP/1.1 200 OK\r\n");
