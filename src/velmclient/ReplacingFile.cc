@@ -1,16 +1,14 @@
 #include "velmclient/ReplacingFile.h"
 
 #include <fcntl.h>
-#include <sys/random.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
 #include <cerrno>
-#include <cstdint>
-#include <cstdio>
 #include <utility>
 
 #include "velmclient/SystemLog.h"
+#include "velmclient/TemporaryNames.h"
 
 namespace Velm {
 
@@ -21,17 +19,6 @@ constexpr int kNameAttempts = 100;
 constexpr unsigned int kNewFileMode = 0666;
 constexpr unsigned int kPermissionBits = 0777;
 
-// Does not hold the target's name, which may be as long as a name can be.
-std::string randomHiddenName() {
-    std::uint64_t number = 0;
-    if (::getrandom(&number, sizeof number, 0) != static_cast<ssize_t>(sizeof number)) {
-        return {};
-    }
-    char text[64];
-    std::snprintf(text, sizeof text, ".velm-%016llx.tmp", static_cast<unsigned long long>(number));
-    return text;
-}
-
 std::string descriptorPath(int descriptor) {
     return "/proc/self/fd/" + std::to_string(descriptor);
 }
@@ -40,7 +27,7 @@ std::string descriptorPath(int descriptor) {
 template <typename Make>
 int withFreeName(std::string& hiddenName, Make make) {
     for (int attempt = 0; attempt < kNameAttempts; ++attempt) {
-        std::string candidate = randomHiddenName();
+        std::string candidate = randomTemporaryName();
         if (candidate.empty()) {
             return errno;
         }
@@ -76,6 +63,7 @@ int ReplacingFile::prepare() {
     if (error != 0) {
         return error;
     }
+    removeAbandonedFiles(directory.get());
     const unsigned int mode = previousMode.value_or(kNewFileMode);
     if (temporary == Temporary::kNamelessWherePossible) {
         openNameless(mode);
@@ -136,7 +124,10 @@ int ReplacingFile::openHidden(unsigned int mode) {
     return withFreeName(hiddenName, [&](const char* candidate) {
         file = FileDescriptor(::openat(directory.get(), candidate,
                                        O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC, mode));
-        return file.isOpen() ? 0 : errno;
+        if (!file.isOpen()) {
+            return errno;
+        }
+        return lockTemporaryFile(file.get()) ? 0 : EEXIST;
     });
 }
 
@@ -182,6 +173,8 @@ int ReplacingFile::finish() {
     if (error == 0 && hiddenName.empty()) {
         error = linkHidden();
     }
+    // Keeps the lock until the hidden name is gone. Without it the worst is a rename that fails.
+    const FileDescriptor lock(::fcntl(file.get(), F_DUPFD_CLOEXEC, 0));
     if (error == 0) {
         error = file.close();
     }
@@ -198,6 +191,7 @@ int ReplacingFile::finish() {
 // A link cannot replace a file, so the nameless file gets a hidden name first.
 int ReplacingFile::linkHidden() {
     const std::string source = descriptorPath(file.get());
+    (void)lockTemporaryFile(file.get());
     return withFreeName(hiddenName, [&](const char* candidate) {
         const int result =
             ::linkat(AT_FDCWD, source.c_str(), directory.get(), candidate, AT_SYMLINK_FOLLOW);
