@@ -1,5 +1,11 @@
 #include "Sennet/Driver.h"
+#include "process/ProcessGuards.h"
 
 int main(int argc, char** argv) {
+    if (!holdStandardStreams()) {
+        return 1;
+    }
+    outliveFileSizeLimit();
+    endWhenMemoryIsShort("sennet");
     return runSennet(argc, argv);
 }

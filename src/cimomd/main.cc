@@ -14,6 +14,7 @@
 #include "Options.h"
 #include "mof/MofCheck.h"
 #include "mof/MofCompiler.h"
+#include "process/ProcessGuards.h"
 #include "protocol/CimService.h"
 #include "providers/ProviderList.h"
 #include "repository/CurrentRepository.h"
@@ -152,6 +153,8 @@ int check(const Options& options) {
 }  // namespace cimomd
 
 int main(int argc, char** argv) {
+    if (!holdStandardStreams())
+        return 1;
     const cimomd::ParsedOptions parsed = cimomd::parseOptions(argc, argv);
     if (parsed.exitStatus)
         return *parsed.exitStatus;
