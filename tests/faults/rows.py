@@ -17,6 +17,7 @@ A suite is a program:
 """
 
 import argparse
+import contextlib
 import os
 import pathlib
 import re
@@ -180,8 +181,12 @@ class Program:
         return self._child.pid
 
     def signal(self, number):
-        # Popen would reap a child that has ended, and its use of memory would be lost.
-        signal.pidfd_send_signal(self._ended, number)
+        # Popen would look whether the child has ended, and wait() would find none.
+        with contextlib.suppress(ProcessLookupError):
+            signal.pidfd_send_signal(self._ended, number)
+
+    def is_running(self):
+        return self._finished is None and not select.select([self._ended], [], [], 0)[0]
 
     def wait(self, patience_s=PATIENCE_S):
         """Finished, or Failure when it did not end in time; it is killed then."""
@@ -229,8 +234,11 @@ def expect_memory_below(finished, bytes_limit, program):
 
 
 def place():
-    """A temporary directory, to be used in a with statement; yields its path as text."""
-    return tempfile.TemporaryDirectory(prefix="faults.")
+    """A temporary directory, to be used in a with statement; yields its path as text. In memory
+    where that can be: thousands of runs would wait for the disk."""
+    memory = "/dev/shm"
+    return tempfile.TemporaryDirectory(
+        prefix="faults.", dir=memory if os.access(memory, os.W_OK | os.X_OK) else None)
 
 
 def is_root():
