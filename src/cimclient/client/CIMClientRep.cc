@@ -108,11 +108,10 @@ void CIMClientRep::makeReady(const Deadline& deadline) {
 
 // The exchange with its answer's head read.
 std::unique_ptr<HttpExchange> CIMClientRep::start(const HttpRequest& request,
-                                                  const Deadline& deadline) {
+                                                  const Deadline& deadline, Uint64 answerLimit) {
     makeReady(deadline);
-    auto started =
-        std::make_unique<HttpExchange>(connection.socket.get(), request, deadline,
-                                       HttpLimits{settings.bodyLimit, settings.headLimit});
+    auto started = std::make_unique<HttpExchange>(connection.socket.get(), request, deadline,
+                                                  HttpLimits{answerLimit, settings.headLimit});
     started->awaitHead();
     return started;
 }
@@ -134,9 +133,9 @@ bool CIMClientRep::answerChallenge(const HttpExchange& refused, HttpRequest& req
     return true;
 }
 
-std::unique_ptr<HttpExchange> CIMClientRep::exchange(HttpRequest& request,
-                                                     const Deadline& deadline) {
-    std::unique_ptr<HttpExchange> current = start(request, deadline);
+std::unique_ptr<HttpExchange> CIMClientRep::exchange(HttpRequest& request, const Deadline& deadline,
+                                                     Uint64 answerLimit) {
+    std::unique_ptr<HttpExchange> current = start(request, deadline, answerLimit);
     if (!answerChallenge(*current, request)) {
         return current;
     }
@@ -150,19 +149,19 @@ std::unique_ptr<HttpExchange> CIMClientRep::exchange(HttpRequest& request,
     if (!open) {
         connection.close();
     }
-    return start(request, deadline);
+    return start(request, deadline, answerLimit);
 }
 
 template <typename Decode>
 auto CIMClientRep::perform(const char* method, const CIMNamespaceName& nameSpace, std::string body,
-                           Decode decode) {
+                           Uint64 answerLimit, Decode decode) {
     if (!connected) {
         throw NotConnectedException("The CIM client is not connected");
     }
     const Deadline deadline(timeoutMilliseconds);
     ConnectionGuard guard(connection);
     HttpRequest request = makeRequest(method, nameSpace, std::move(body));
-    const std::unique_ptr<HttpExchange> current = exchange(request, deadline);
+    const std::unique_ptr<HttpExchange> current = exchange(request, deadline, answerLimit);
     checkHead(current->answer());
     try {
         auto result = decode(*current);
@@ -193,6 +192,7 @@ CIMClass CIMClientRep::getClass(const CIMNamespaceName& nameSpace, const CIMName
         perform("GetClass", nameSpace,
                 encodeGetClassRequest(id, nameSpace, className, localOnly, includeQualifiers,
                                       includeClassOrigin, propertyList),
+                settings.classBodyLimit,
                 [&](ByteSource& source) { return decodeGetClassResponse(source, id); });
     if (found.isUninitialized()) {
         connection.close();
@@ -213,6 +213,7 @@ Array<CIMInstance> CIMClientRep::enumerateInstances(const CIMNamespaceName& name
         "EnumerateInstances", nameSpace,
         encodeEnumerateInstancesRequest(id, nameSpace, className, deepInheritance, localOnly,
                                         includeQualifiers, includeClassOrigin, propertyList),
+        settings.bodyLimit,
         [&](ByteSource& source) { return decodeEnumerateInstancesResponse(source, id); });
 }
 
@@ -220,10 +221,11 @@ Array<CIMName> CIMClientRep::enumerateClassNames(const CIMNamespaceName& nameSpa
                                                  const CIMName& className,
                                                  Boolean deepInheritance) {
     const std::string id = nextMessageId();
-    return perform(
-        "EnumerateClassNames", nameSpace,
-        encodeEnumerateClassNamesRequest(id, nameSpace, className, deepInheritance),
-        [&](ByteSource& source) { return decodeEnumerateClassNamesResponse(source, id); });
+    return perform("EnumerateClassNames", nameSpace,
+                   encodeEnumerateClassNamesRequest(id, nameSpace, className, deepInheritance),
+                   settings.bodyLimit, [&](ByteSource& source) {
+                       return decodeEnumerateClassNamesResponse(source, id);
+                   });
 }
 
 }  // namespace Pegasus

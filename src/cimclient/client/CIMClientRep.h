@@ -39,12 +39,14 @@ class CIMClientRep {
 
     template <typename Decode>
     auto perform(const char* method, const CIMNamespaceName& nameSpace, std::string body,
-                 Decode decode);
+                 Uint64 answerLimit, Decode decode);
 
     std::string nextMessageId();
     void makeReady(const Deadline& deadline);
-    std::unique_ptr<HttpExchange> start(const HttpRequest& request, const Deadline& deadline);
-    std::unique_ptr<HttpExchange> exchange(HttpRequest& request, const Deadline& deadline);
+    std::unique_ptr<HttpExchange> start(const HttpRequest& request, const Deadline& deadline,
+                                        Uint64 answerLimit);
+    std::unique_ptr<HttpExchange> exchange(HttpRequest& request, const Deadline& deadline,
+                                           Uint64 answerLimit);
     bool answerChallenge(const HttpExchange& refused, HttpRequest& request) const;
 
     ClientSettings settings;

@@ -174,6 +174,16 @@ TEST_F(BrokenPeerTest, SendsAnEndlessHeader) {
         Reply::ok(fanXml("a", "1")).trailer("Field", std::string(70000, 'x')));
 }
 
+TEST_F(BrokenPeerTest, DescribesAClassWithoutEnd) {
+    const std::string blanks(std::size_t{17} << 20, ' ');
+    server.onNext(Reply::ok("<CLASS NAME=\"CIM_Fan\">" + blanks + "</CLASS>"));
+    EXPECT_THROW(nameOfClass("CIM_Fan"), CIMClientMalformedHTTPException);
+    expectNextRequestWorks();
+    // Instances may well be that many.
+    server.onNext(Reply::ok(blanks + fanXml("a", "1")));
+    EXPECT_EQ(fans().size(), 1U);
+}
+
 TEST_F(BrokenPeerTest, AnswersAnotherRequest) {
     messageFor<CIMClientResponseException>(Reply::ok(fanXml("a", "1")).messageId("0"));
 }
