@@ -323,6 +323,25 @@ exhausting("endless blanks", at_both(b""), b" ", 4 * GIB, 8 * rows.MIB, 3 * MEMO
 exhausting("endless comments", at_both(b""), b"<!-- more -->", 4 * GIB + rows.MIB, 20 * rows.MIB)
 
 
+# All of it is one class, and all of it right until it breaks off.
+CLASS_PARTS = {
+    "properties": b'<PROPERTY NAME="P%d" TYPE="uint8"/>',
+    "qualifiers": b'<QUALIFIER NAME="Q%d" TYPE="uint8"><VALUE>1</VALUE></QUALIFIER>',
+    "methods": b'<METHOD NAME="M%d" TYPE="uint8"/>',
+}
+for _name, _part in CLASS_PARTS.items():
+    @SUITE.case(f"a class of endless {_name}")
+    def _(trial, name=_name, part=_part):
+        total = 4 * GIB if trial.full else 2 * rows.MIB
+        def parts():
+            for first in range(0, total // len(part), 1000):
+                yield b"".join(part % number for number in range(first, first + 1000))
+        with HostileRun(trial) as run:
+            run.expect(ABANDONED, CLASS, stream(b'<CLASS NAME="CIM_Faulty">', parts), name,
+                       memory=3 * MEMORY_LIMIT, patience_s=240)
+        return f"{ABANDONED}; next script right; less than {3 * MEMORY_LIMIT // rows.MIB} MiB"
+
+
 @SUITE.case("a million attributes")
 def _(trial):
     def attributes():

@@ -84,9 +84,6 @@ class Generator:
         for directory in (self.mif, self.sql):
             directory.mkdir()
 
-    def has_outputs(self):
-        return any(os.listdir(self.mif)) or any(os.listdir(self.sql))
-
     def outputs(self):
         """Bytes of every regular file of both output directories, hidden ones included, by path."""
         files = [pathlib.Path(directory, name) for top in (self.mif, self.sql)

@@ -79,6 +79,13 @@ class InventoryRun:
         for path in self.new(product):
             (self.generator.top / path).write_bytes(earlier(path))
 
+    def is_untouched(self, product):
+        """Whether no file of the earlier run has been replaced."""
+        with contextlib.suppress(FileNotFoundError):
+            return all((self.generator.top / path).stat().st_size == len(earlier(path))
+                       for path in self.new_files(product))
+        return False
+
     def expect_whole(self, product, what, hidden=False):
         """Each file is the old or the new one. Returns how many are new. `hidden`: the run was
         killed and may have left temporary files."""

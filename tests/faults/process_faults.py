@@ -11,7 +11,7 @@ import time
 
 import rows
 from generator import PRODUCTS
-from inventory_run import InventoryRun, earlier
+from inventory_run import InventoryRun
 
 SUITE = rows.Suite(__doc__)
 WHOLE = "every file whole, old or new"
@@ -88,7 +88,7 @@ CLOSED = {"<&-": "<&-", ">&-": ">&-", "2>&-": "2>&-", "all three": "<&- >&- 2>&-
 @SUITE.case("closed standard streams")
 def _(trial):
     with InventoryRun(trial) as run:
-        for product in PRODUCTS:
+        for product in trial.some(PRODUCTS, every=3):
             run.new(product)
             for name, redirection in CLOSED.items():
                 for named in (0, 1):
@@ -104,7 +104,7 @@ def _(trial):
 @SUITE.case("standard output that is full, or that nobody reads")
 def _(trial):
     with InventoryRun(trial) as run:
-        for product in PRODUCTS:
+        for product in trial.some(PRODUCTS, every=3):
             run.new(product)
             trial.count()
             run.leave_earlier_files(product)
@@ -124,47 +124,60 @@ def _(trial):
 
 # ---- starved
 
-def starved(trial, limits, enough):
-    """Runs under each of the limits, and under one that lets everything through; gives each with how
-    many files are new. Such a run ends with status 0, or with 1 and touches nothing; with less it
-    cannot even be loaded."""
-    with InventoryRun(trial, 300) as run:
-        for product in PRODUCTS:
-            run.new(product)
-            statuses = set()
-            for limit in [*limits, enough]:
-                trial.count()
-                run.leave_earlier_files(product)
-                finished = run.generator.run(product, limits=[limit])
-                what = f"/{product}, {limit}"
-                rows.expect(finished.status in (0, 1, CANNOT_BE_LOADED), f"{what}: {finished}")
-                count = run.expect_whole_or_none(product, what)
-                if finished.status != 0:
-                    rows.expect_equal(run.expect_whole(product, what), count, what)
-                statuses.add(finished.status)
-                yield what, finished, count
-            run.expect_new(product, enough)
-            rows.expect({0, 1} <= statuses, f"/{product}: the limits made no difference: {statuses}")
+def starved(trial, run, product, limits):
+    """Runs under each of the limits, the last of which is enough; gives each with how many files are
+    new. Such a run ends with status 0, or with 1 and touches nothing; with less than that it cannot
+    even be loaded."""
+    run.new(product)
+    statuses = set()
+    for limit in limits:
+        trial.count()
+        run.leave_earlier_files(product)
+        finished = run.generator.run(product, limits=[limit])
+        what = f"/{product}, {limit}"
+        rows.expect(finished.status in (0, 1, CANNOT_BE_LOADED), f"{what}: {finished}")
+        count = run.expect_whole_or_none(product, what)
+        if finished.status != 0:
+            run.expect_whole(product, what)
+        statuses.add(finished.status)
+        yield what, finished, count
+    run.expect_new(product, limits[-1])
+    rows.expect({0, 1} <= statuses, f"/{product}: the limits made no difference: {statuses}")
 
 
 @SUITE.case("few descriptors")
 def _(trial):
-    limits = [f"--nofile={number}" for number in trial.some(range(3, 64), every=5)]
-    for what, finished, count in starved(trial, limits, "--nofile=256"):
-        if finished.status != 0:
-            rows.expect_equal(count, 0, f"{what}: new files")
+    numbers = range(3, 64) if trial.full else (3, 4, 6, 8, 9, 12, 20)
+    limits = [f"--nofile={number}" for number in [*numbers, 256]]
+    with InventoryRun(trial) as run:
+        for product in trial.some(PRODUCTS, every=3):
+            for what, finished, count in starved(trial, run, product, limits):
+                if finished.status != 0:
+                    rows.expect_equal(count, 0, f"{what}: new files")
     return f"status 0 or 1, {WHOLE}"
+
+
+def least_memory(run):
+    """The bytes with which the program can be loaded."""
+    for size in range(8 * rows.MIB, 512 * rows.MIB, rows.MIB):
+        if run.generator.run("SMS", limits=[f"--as={size}"]).status != CANNOT_BE_LOADED:
+            return size
+    raise rows.Failure("expected the program to run with 512 MiB")
 
 
 @SUITE.case("little memory")
 def _(trial):
     if rows.is_sanitized(trial.bin / "sennet"):
         raise rows.Skip("the address sanitizer needs its memory")
-    limits = [f"--as={size * 1024}" for size in trial.some(range(20000, 64000, 100), every=40)]
-    for what, finished, count in starved(trial, limits, "--as=4000000000"):
-        print(what, finished.status, count, repr(finished.out[-40:]), repr(finished.err[-60:]))
-        if finished.status == 1:
-            rows.expect_equal(finished.err, NO_MEMORY, f"{what}: errors")
+    with InventoryRun(trial, 3000) as run:
+        run.new("SMS")
+        least = least_memory(run)
+        step = rows.MIB // (32 if trial.full else 1)
+        limits = [f"--as={size}" for size in range(least, least + 12 * rows.MIB, step)]
+        for product in trial.some(PRODUCTS, every=3):
+            for what, finished, _ in starved(trial, run, product, [*limits, f"--as={1 << 32}"]):
+                if finished.status == 1:
+                    rows.expect_equal(finished.err, NO_MEMORY, f"{what}: errors")
     return f"status 1 and a message, {WHOLE}"
 
 
