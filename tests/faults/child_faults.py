@@ -3,6 +3,7 @@
 import os
 import pathlib
 import signal
+import time
 
 import neighbours
 import rows
@@ -39,20 +40,35 @@ def descriptors_of(process):
             for entry in pathlib.Path(f"/proc/{process}/fd").iterdir()}
 
 
+def stopped_with_child(generator, **options):
+    """The generator, stopped while its child serves, and the child. It is over in a moment, so that
+    this may take several attempts."""
+    for _ in range(100):
+        program = rows.Program(generator.command(), generator.environment(SECRET_WORD=SECRET),
+                               **options)
+        end_s = time.monotonic() + rows.PATIENCE_S
+        while child_of(program) is None and is_running(program.pid):
+            expect(time.monotonic() < end_s, "no child was started")
+        program.signal(signal.SIGSTOP)
+        child = child_of(program)
+        if child is not None:
+            return program, child
+        program.kill()
+    raise rows.Failure("no child was seen")
+
+
 def with_running_child(trial, look):
     """Calls `look` with the stopped generator, its child, and what the generator had inherited."""
     with rows.place() as place:
         generator = Generator(trial, place)
         kept = open(pathlib.Path(place) / "kept open", "w+b")
         inside, outside = os.pipe()
-        program = rows.Program(generator.command(), generator.environment(SECRET_WORD=SECRET),
-                               pass_fds=(kept.fileno(), inside, outside))
         inherited = {os.readlink(f"/proc/self/fd/{number}")
                      for number in (kept.fileno(), inside, outside)}
+        program, child = stopped_with_child(
+            generator, pass_fds=(kept.fileno(), inside, outside))
         try:
-            expect(waited(lambda: child_of(program) is not None), "no child was started")
-            program.signal(signal.SIGSTOP)
-            look(program, child_of(program), inherited)
+            look(program, child, inherited)
         finally:
             program.kill()
             kept.close()
@@ -61,7 +77,6 @@ def with_running_child(trial, look):
 
 
 def look_at_child(program, child, inherited):
-    expect(child is not None, "the child ended while its parent was stopped")
     expect(inherited & set(descriptors_of(program.pid).values()) == inherited,
            "the generator itself did not inherit what it was given")
     found = descriptors_of(child)
@@ -82,7 +97,6 @@ def _(trial):
 
 
 def kill_parent(program, child, _):
-    expect(child is not None, "the child ended while its parent was stopped")
     program.signal(signal.SIGKILL)
     expect(waited(lambda: not is_running(child)), "the child outlives its parent")
 
