@@ -25,6 +25,8 @@ foreach(component name IN ZIP_LISTS CPACK_COMPONENTS_ALL names)
     string(TOUPPER ${component} upper)
     set(CPACK_DEBIAN_${upper}_PACKAGE_NAME ${name})
     set(CPACK_RPM_${upper}_PACKAGE_NAME ${name})
+    set(CPACK_RPM_${upper}_USER_FILELIST
+        "%exclude ${CMAKE_INSTALL_FULL_DATADIR}/doc/${name}/changelog.Debian.gz")
 endforeach()
 file(GLOB manual_texts CONFIGURE_DEPENDS "${PROJECT_SOURCE_DIR}/docs/*.md")
 install(FILES ${manual_texts} DESTINATION "${CMAKE_INSTALL_DATADIR}/doc/sennet" COMPONENT sennet)
@@ -131,7 +133,7 @@ set(CPACK_RPM_SPEC_MORE_DEFINE "%define _build_id_links none")
 set(CPACK_RPM_LIBVELMCLIENT_DEV_PACKAGE_NAME libvelmclient-devel)
 set(CPACK_RPM_SENNET_PACKAGE_REQUIRES "libvelmclient = ${version}")
 set(CPACK_RPM_SENNET_PACKAGE_SUGGESTS cimomd)
-set(CPACK_RPM_SENNET_USER_FILELIST
+list(APPEND CPACK_RPM_SENNET_USER_FILELIST
     "%config(noreplace) ${CMAKE_INSTALL_FULL_SYSCONFDIR}/velmira/velm.properties")
 set(CPACK_RPM_SENNET_POST_INSTALL_SCRIPT_FILE "${reload}")
 set(CPACK_RPM_SENNET_POST_UNINSTALL_SCRIPT_FILE "${reload}")
