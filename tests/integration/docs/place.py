@@ -16,7 +16,7 @@ HERE = pathlib.Path(__file__).resolve().parent
 sys.path.insert(0, str(HERE.parent / "inventory"))
 from installation import Cimomd, Programs
 
-PATIENCE_S = 120
+PATIENCE_S = 300
 # Places of an installed system that are written to or hold what the packages bring.
 PLACES = re.compile(r"(?<![\w.~/$-])(?=/(etc/(velmira|sennet|cimomd|systemd)|usr/share/sennet|"
                     r"usr/sbin/cimomd|var/lib/sennet|srv|run|tmp)\b)")
