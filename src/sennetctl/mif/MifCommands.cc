@@ -6,6 +6,7 @@
 #include "mif/MifDifference.h"
 #include "mif/MifTables.h"
 #include "report/Json.h"
+#include "report/Progress.h"
 #include "report/Text.h"
 #include "report/TextTable.h"
 #include "report/WholeFile.h"
@@ -150,9 +151,13 @@ int checkMifFiles(const std::vector<std::string>& files, const LintOptions& opti
                   const Output& output) {
     MifLint lint(options);
     std::vector<Finding> findings;
-    for (const std::string& file : files) {
-        const std::vector<Finding> found = lint.check(file, readWholeFile(file));
-        findings.insert(findings.end(), found.begin(), found.end());
+    {
+        const Progress progress(output);
+        for (const std::string& file : files) {
+            progress.show("checking " + file);
+            const std::vector<Finding> found = lint.check(file, readWholeFile(file));
+            findings.insert(findings.end(), found.begin(), found.end());
+        }
     }
     return printFindings(findings, files, output);
 }

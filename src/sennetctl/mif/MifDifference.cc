@@ -4,6 +4,7 @@
 #include <map>
 #include <optional>
 #include <set>
+#include <unordered_map>
 
 namespace sennetctl {
 
@@ -18,6 +19,7 @@ struct ComparedTable {
         for (std::size_t i = 0; i < table.columns.size(); ++i) {
             if (!isRowNumber(table.columns[i])) {
                 places.push_back(i);
+                placesByName.emplace(table.columns[i].name, names.size());
                 names.push_back(table.columns[i].name);
                 keys.push_back(table.columns[i].isKey);
             }
@@ -32,13 +34,13 @@ struct ComparedTable {
     }
 
     std::optional<std::size_t> placeOf(const std::string& name) const {
-        const auto found = std::find(names.begin(), names.end(), name);
-        return found == names.end()
-                   ? std::nullopt
-                   : std::optional<std::size_t>(static_cast<std::size_t>(found - names.begin()));
+        const auto found = placesByName.find(name);
+        return found == placesByName.end() ? std::nullopt
+                                           : std::optional<std::size_t>(found->second);
     }
 
     Texts names;
+    std::unordered_map<std::string, std::size_t> placesByName;
     std::vector<bool> keys;
     std::vector<Texts> rows;
 };
@@ -182,27 +184,33 @@ class TableComparison {
     Texts identity;
 };
 
-const MifTable* findClass(const std::vector<MifTable>& tables, const std::string& className) {
-    const auto found = std::find_if(tables.begin(), tables.end(), [&](const MifTable& table) {
-        return table.className == className;
-    });
-    return found == tables.end() ? nullptr : &*found;
+using TablesByClass = std::unordered_map<std::string, const MifTable*>;
+
+TablesByClass byClass(const std::vector<MifTable>& tables) {
+    TablesByClass found;
+    for (const MifTable& table : tables) {
+        found.emplace(table.className, &table);
+    }
+    return found;
 }
 
 }  // namespace
 
 std::vector<MifChange> differencesOf(const std::vector<MifTable>& oldTables,
                                      const std::vector<MifTable>& newTables) {
+    const TablesByClass oldClasses = byClass(oldTables);
+    const TablesByClass newClasses = byClass(newTables);
     std::vector<MifChange> changes;
     for (const MifTable& before : oldTables) {
-        if (const MifTable* after = findClass(newTables, before.className)) {
-            TableComparison(before, *after, changes).run();
+        const auto after = newClasses.find(before.className);
+        if (after != newClasses.end()) {
+            TableComparison(before, *after->second, changes).run();
         } else {
             changes.push_back({before.name, MifChange::Kind::Removed, {}, {}, {}, {}});
         }
     }
     for (const MifTable& after : newTables) {
-        if (findClass(oldTables, after.className) == nullptr) {
+        if (oldClasses.count(after.className) == 0) {
             changes.push_back({after.name, MifChange::Kind::Added, {}, {}, {}, {}});
         }
     }

@@ -8,6 +8,7 @@
 #include "cim/CimText.h"
 #include "cim/LocalServer.h"
 #include "report/Json.h"
+#include "report/Progress.h"
 #include "report/Text.h"
 #include "report/WholeFile.h"
 #include "script/NewScript.h"
@@ -28,10 +29,12 @@ std::string pathWithoutSuffix(const std::string& script) {
     return script.substr(0, script.size() - kSuffix.size());
 }
 
-std::vector<AnsweredClass> askFor(const NewOptions& options) {
+std::vector<AnsweredClass> askFor(const NewOptions& options, const Output& output) {
+    const Progress progress(output);
     LocalServer server;
     std::vector<AnsweredClass> classes;
     for (const std::string& name : options.classes) {
+        progress.show("asking for " + name);
         try {
             classes.push_back({nullptr, server.getClass(options.nameSpace, name),
                                server.instances(options.nameSpace, name)});
@@ -75,7 +78,7 @@ int writeNewScript(const NewOptions& options, const Output& output) {
     const std::string stem = std::filesystem::path(path).filename().string();
     const std::string title =
         options.title.empty() ? readableName(stem) + " Inventory" : options.title;
-    const NewScript texts = composeScript(stem, title, options.nameSpace, askFor(options));
+    const NewScript texts = composeScript(stem, title, options.nameSpace, askFor(options, output));
     writeWholeFile(properties, texts.properties);
     try {
         writeWholeFile(options.script, texts.script);

@@ -7,6 +7,7 @@
 #include "cim/LocalServer.h"
 #include "cim/ValueText.h"
 #include "report/Json.h"
+#include "report/Progress.h"
 #include "report/Text.h"
 #include "report/TextTable.h"
 #include "report/WholeFile.h"
@@ -30,7 +31,9 @@ struct ClassContent {
     std::vector<CIMInstance> instances;
 };
 
-ClassContent readClass(const GetOptions& options) {
+ClassContent readClass(const GetOptions& options, const Output& output) {
+    const Progress progress(output);
+    progress.show("asking for " + options.className);
     LocalServer server;
     try {
         ClassContent content{server.getClass(options.nameSpace, options.className), {}};
@@ -131,7 +134,7 @@ void printTable(const ClassContent& content, const std::vector<Column>& columns,
 }  // namespace
 
 int showInstances(const GetOptions& options, const Output& output) {
-    const ClassContent content = readClass(options);
+    const ClassContent content = readClass(options, output);
     const std::vector<Column> columns = chooseColumns(options, content);
     if (output.json) {
         printInstancesJson(options, content, columns, output);

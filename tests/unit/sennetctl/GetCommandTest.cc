@@ -36,6 +36,13 @@ TEST_F(GetCommandTest, ShowsWhatHasAValue) {
               "2 instances\n");
 }
 
+TEST_F(GetCommandTest, ProgressIsTakenAwayAtTheEnd) {
+    Output shown = output.plain();
+    shown.progress = true;
+    showInstances(options, shown);
+    EXPECT_EQ(output.errors(), "\r\x1B[Kasking for CIM_Fan\r\x1B[K");
+}
+
 TEST_F(GetCommandTest, ShowsThePropertiesThatWereAskedFor) {
     options.properties = {"bytes", "DeviceID"};
     EXPECT_EQ(showInstances(options, output.plain()), 0);

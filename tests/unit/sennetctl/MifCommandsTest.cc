@@ -43,6 +43,14 @@ TEST_F(MifCommandsTest, CheckTellsTheFindingsOfAllFiles) {
     EXPECT_EQ(checkMifFiles({good}, {}, fine.plain()), 0);
 }
 
+TEST_F(MifCommandsTest, ProgressOfACheckIsTakenAwayAtTheEnd) {
+    const std::string good = fans("good", "{ 1, \"a\", 3 }\n");
+    Output shown = output.plain();
+    shown.progress = true;
+    checkMifFiles({good}, {}, shown);
+    EXPECT_EQ(output.errors(), "\r\x1B[Kchecking " + good + "\r\x1B[K");
+}
+
 TEST_F(MifCommandsTest, FilesThatCannotBeReadEndTheCommand) {
     EXPECT_THROW(checkMifFiles({directory.path("none")}, {}, output.plain()), CannotRun);
     EXPECT_THROW(showMifFile(directory.path("none"), output.plain()), CannotRun);

@@ -55,6 +55,13 @@ TEST_F(NewCommandTest, WritesScriptAndProperties) {
                 HasSubstr("not listed: CIM_Fan.Spare: it has no value on this machine\n"));
 }
 
+TEST_F(NewCommandTest, ProgressIsTakenAwayAtTheEnd) {
+    Output shown = output.plain();
+    shown.progress = true;
+    writeNewScript(options, shown);
+    EXPECT_EQ(output.errors(), "\r\x1B[Kasking for CIM_Fan\r\x1B[K");
+}
+
 TEST_F(NewCommandTest, WhatItWritesIsWithoutFault) {
     options.classes = {"CIM_Fan"};
     options.title = "Fans";
