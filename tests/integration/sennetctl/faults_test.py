@@ -1,0 +1,98 @@
+"""A script without fault, with one fault after the other planted into it: `sennetctl check` names
+each, at its place."""
+
+import argparse
+import json
+import os
+import pathlib
+import subprocess
+import sys
+import tempfile
+import unittest
+
+HERE = pathlib.Path(__file__).resolve().parent
+sys.path.insert(0, str(HERE.parent / "inventory"))
+import installation
+
+ARGUMENTS = None
+GOOD = """[DEFAULT]
+title=Disks
+
+[CIM]
+G[0]=CIM_DiskDrive
+N[0]=root/cimv2
+A[0]=DeviceID,Name
+"""
+# What is replaced by what, and the line, the column, the severity and a part of what is told.
+FAULTS = {
+    "blanks around =": ("title=", "title = ", 2, 1, "warning", "write title=Disks"),
+    "blank behind a slot": ("G[0]=", "G[0] =", 5, 1, "error", "write G[0]=CIM_DiskDrive"),
+    "blank before a slot": ("G[0]", " G[0]", 5, 1, "warning", "write G[0]=CIM_DiskDrive"),
+    "section in small letters": ("[CIM]", "[cim]", 4, 1, "warning", "exactly [CIM]"),
+    "nonsense": ("A[0]", "nonsense\nA[0]", 7, 1, "warning", "line without effect"),
+    "slot without class": ("A[0]", "A[1]=Name\nA[0]", 7, 6, "warning", "slot 1 has no class"),
+    "slot 10": ("N[0]", "N[10]", 6, 3, "error", "slots are 0 to 9"),
+    "slot that is no number": ("N[0]", "N[x]", 6, 3, "warning", "read as 0"),
+    "slot twice": ("A[0]", "G[0]=CIM_DiskDrive\nA[0]", 7, 1, "warning", "replaces the class"),
+    "no properties": ("A[0]=DeviceID,Name\n", "", 5, 6, "warning", "no property list"),
+    "illegal name": ("Name", "Na-me", 7, 15, "error", "'Na-me' is no name of a property"),
+    "comma at the end": ("Name", "Name,", 7, 15, "error", "comma or blank at the end"),
+    "property twice": ("Name", "DeviceID", 7, 15, "warning", "listed twice"),
+    "unknown property": ("Name", "Nickname", 7, 15, "warning", "no property Nickname"),
+    "unknown class": ("DiskDrive", "DiscDrive", 5, 6, "error", "CIM_ERR_NOT_FOUND (6)"),
+    "unknown namespace": ("root/cimv2", "root/none", 5, 6, "error", "CIM_ERR_INVALID_NAMESPACE"),
+    "no namespace": ("N[0]=root/cimv2\n", "", 5, 6, "error", "no line N[n]="),
+    "class without instances": (
+        "G[0]=CIM_DiskDrive", "G[0]=CIM_Battery\nG[1]=CIM_DiskDrive\nA[1]=Name\nN[1]=root/cimv2",
+        5, 6, "error", "show the instances of CIM_DiskDrive"),
+    "long line": ("Name", "Name" + " " * 1100, 7, 1025, "warning", "only the first 1024"),
+    "encoding": ("Disks", "M\xfchle", 2, 8, "error", "octets that are not UTF-8"),
+    "byte-order mark": ("[DEFAULT]", "\xef\xbb\xbf[DEFAULT]", 1, 1, "error", "byte-order mark"),
+    "64-bit number": ("Name", "MaxMediaSize", 7, 15, "warning", "beyond 32 bits"),
+    "title that is cut": ("Disks", "Disks of this machine", 2, 7, "warning", "with Lumo"),
+}
+
+
+class FaultsTest(unittest.TestCase):
+    @classmethod
+    def setUpClass(cls):
+        cls.place = pathlib.Path(cls.enterClassContext(
+            tempfile.TemporaryDirectory(prefix="sennet-faults-")))
+        (cls.place / "mof.d").mkdir()
+        (cls.place / "velm.properties").touch()
+        programs = installation.programs_of(ARGUMENTS)
+        cls.server = cls.enterClassContext(installation.Cimomd(
+            programs, cls.place, ARGUMENTS.machines.resolve() / "server", cls.place / "mof.d"))
+
+    def check(self, text):
+        """The status and what is found in a script; each character is an octet."""
+        script = self.place / "own.script.inv"
+        script.write_bytes(text.encode("latin-1"))
+        result = subprocess.run(
+            [ARGUMENTS.programs.resolve() / "sennetctl", "check", "--json", script],
+            capture_output=True, text=True, timeout=60, check=False,
+            env={"CIM_LOCAL_SOCKET": str(self.server.socket), "PATH": os.environ["PATH"],
+                 "VELM_CONFIG": str(self.place / "velm.properties")})
+        self.assertEqual(result.stderr, "")
+        return result.returncode, json.loads(result.stdout)["findings"]
+
+    def test_the_script_is_without_fault(self):
+        status, found = self.check(GOOD)
+        self.assertEqual((status, [each["severity"] for each in found]), (0, ["note"]), found)
+
+    def test_each_fault_is_named(self):
+        for name, (good, bad, line, column, severity, message) in FAULTS.items():
+            with self.subTest(fault=name):
+                self.assertIn(good, GOOD)
+                status, found = self.check(GOOD.replace(good, bad, 1))
+                self.assertEqual(status, 1)
+                self.assertTrue(any(
+                    (each["line"], each["column"], each["severity"]) == (line, column, severity)
+                    and message in each["message"] for each in found), found)
+
+
+if __name__ == "__main__":
+    parser = argparse.ArgumentParser()
+    installation.add_arguments(parser)
+    ARGUMENTS, rest = parser.parse_known_args()
+    unittest.main(argv=[sys.argv[0], *rest])
