@@ -84,8 +84,10 @@ def look_at_child(program, child, inherited):
                  "the child's standard streams")
     expect(found.get(3, "").startswith("socket:"), f"the child's descriptor 3 is {found.get(3)}")
     expect(not inherited & set(found.values()), f"inherited by the child: {found}")
-    environment = pathlib.Path(f"/proc/{child}/environ").read_bytes()
-    expect_equal(environment, b"PATH=/usr/sbin:/usr/bin:/sbin:/bin\0", "the child's environment")
+    environment = pathlib.Path(f"/proc/{child}/environ")
+    # It is empty as long as the program is being loaded.
+    expect(waited(environment.read_bytes), "the child is never loaded")
+    expect_equal(environment.read_bytes(), b"PATH=/usr/sbin:/usr/bin:/sbin:/bin\0", "the child's environment")
 
 
 @SUITE.case("the private child is looked at for what it could have inherited")
