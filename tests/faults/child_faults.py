@@ -36,8 +36,14 @@ def is_running(process):
 
 
 def descriptors_of(process):
-    return {int(entry.name): os.readlink(entry)
-            for entry in pathlib.Path(f"/proc/{process}/fd").iterdir()}
+    found = {}
+    for entry in pathlib.Path(f"/proc/{process}/fd").iterdir():
+        try:
+            found[int(entry.name)] = os.readlink(entry)
+        except FileNotFoundError:
+            # Closed meanwhile.
+            pass
+    return found
 
 
 def stopped_with_child(generator, **options):
@@ -79,14 +85,14 @@ def with_running_child(trial, look):
 def look_at_child(program, child, inherited):
     expect(inherited & set(descriptors_of(program.pid).values()) == inherited,
            "the generator itself did not inherit what it was given")
+    environment = pathlib.Path(f"/proc/{child}/environ")
+    # It is empty as long as the program is being loaded.
+    expect(waited(environment.read_bytes), "the child is never loaded")
     found = descriptors_of(child)
     expect_equal([found.get(number) for number in range(3)], ["/dev/null"] * 3,
                  "the child's standard streams")
     expect(found.get(3, "").startswith("socket:"), f"the child's descriptor 3 is {found.get(3)}")
     expect(not inherited & set(found.values()), f"inherited by the child: {found}")
-    environment = pathlib.Path(f"/proc/{child}/environ")
-    # It is empty as long as the program is being loaded.
-    expect(waited(environment.read_bytes), "the child is never loaded")
     expect_equal(environment.read_bytes(), b"PATH=/usr/sbin:/usr/bin:/sbin:/bin\0", "the child's environment")
 
 
