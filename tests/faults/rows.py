@@ -104,6 +104,8 @@ class Suite:
 
     def main(self):
         """Tries the cases; 1 when one of them failed or none was tried."""
+        # A suite that is ended takes its programs, places and mounts away.
+        signal.signal(signal.SIGTERM, lambda *_: sys.exit(1))
         arguments = self._arguments()
         arguments.bin = arguments.bin.resolve()
         cases = [(fault, function) for fault, function in self._cases
