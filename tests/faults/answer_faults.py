@@ -291,8 +291,8 @@ def exhausting(name, start, octets, full=16 * rows.MIB, small=16 * rows.MIB, mem
             for where, lost in ((CLASS, ABANDONED), (INSTANCES, EMPTY)):
                 run.expect(lost, where, stream(start[where], again(octets, total)), name,
                            memory=memory, patience_s=240)
-        return (f"{BOTH}; less than {memory // rows.MIB} MiB of memory for {total // rows.MIB} MiB "
-                "of answer")
+        return (f"{BOTH}; less than {memory // rows.MIB} MiB of memory, {total // rows.MIB} MiB "
+                "offered")
 
 
 def at_both(octets):

@@ -7,7 +7,8 @@ import select
 import socket
 import threading
 
-PATIENCE_S = 60
+# Longer than any client waits.
+PATIENCE_S = 600
 RECEIVE_OCTETS = 65536
 
 
@@ -63,7 +64,8 @@ class HostileServer:
 
     `answer` is called with a Peer and a Request, in the thread of the connection; a true result
     keeps the connection. `on_connect`, when set, is called with a Peer and the number of the
-    connection before anything is read; a false result closes the connection.
+    connection before anything is read; a false result closes the connection. What they raise, the
+    loss of the connection aside, is noted in `failures`.
     """
 
     def __init__(self, path, answer, backlog=128):
@@ -71,6 +73,7 @@ class HostileServer:
         self.answer = answer
         self.on_connect = None
         self.connections = 0
+        self.failures = []
         self._open = set()
         self._listener = socket.socket(socket.AF_UNIX)
         self._listener.bind(self.path)
@@ -108,15 +111,21 @@ class HostileServer:
     def _serve(self, connection, number):
         self._open.add(connection)
         try:
-            with connection, contextlib.suppress(OSError):
-                peer = Peer(connection)
-                if self.on_connect and not self.on_connect(peer, number):
-                    return
-                while (request := _read_request(connection)) is not None:
-                    if not self.answer(peer, request):
-                        return
+            with connection:
+                self._answer_all(Peer(connection), number)
+        except OSError:
+            pass
+        except Exception as failure:  # pylint: disable=broad-except; a thread has nobody to tell
+            self.failures.append(repr(failure))
         finally:
             self._open.discard(connection)
+
+    def _answer_all(self, peer, number):
+        if self.on_connect and not self.on_connect(peer, number):
+            return
+        while (request := _read_request(peer.connection)) is not None:
+            if not self.answer(peer, request):
+                return
 
 
 def _read_request(connection):
