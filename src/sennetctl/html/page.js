@@ -57,17 +57,24 @@
     const textOf = (row) => lower([...row.cells].map((cell) => cell.textContent).join(" "));
     const plural = (count, noun) => `${count} ${noun}${count === 1 ? "" : "s"}`;
 
+    const linkTo = (heading) =>
+        document.querySelector(`nav a[href="#${heading.id}"]`).parentElement;
+
     // What is searched: a single row stands or falls as a whole, and so do the rows below a heading
     // that has the words itself.
     const sections = [...document.querySelectorAll("section.table")].map((section) => {
         const heading = section.querySelector("h2, h3");
         const table = section.querySelector("table");
-        const rows = table ? [...table.tBodies[0].rows].map((row) => ({ row, text: textOf(row) })) : [];
+        const rows = [...(table ? table.tBodies[0].rows : [])].map((row) => ({
+            row,
+            text: textOf(row),
+        }));
         const single = table !== null && table.classList.contains("single");
+        const values = single ? rows.map(({ text }) => text) : [];
         return {
             section,
-            link: document.querySelector(`nav a[href="#${heading.id}"]`).parentElement,
-            text: [lower(heading.textContent), ...(single ? rows.map(({ text }) => text) : [])].join(" "),
+            link: linkTo(heading),
+            text: [lower(heading.textContent), ...values].join(" "),
             rows: single ? [] : rows,
             count: single ? 1 : rows.length,
         };
@@ -86,6 +93,14 @@
         return all ? section.count : count;
     };
 
+    const files = [...document.querySelectorAll("section:not(.table)")];
+    const showFiles = (everything) => {
+        for (const file of files) {
+            file.hidden = !everything && !file.querySelector("section.table:not([hidden])");
+            linkTo(file.querySelector("h2")).hidden = file.hidden;
+        }
+    };
+
     const found = document.getElementById("found");
     const search = (text) => {
         const words = lower(text).split(/\s+/).filter((word) => word !== "");
@@ -95,6 +110,7 @@
             rows += showMatches(section, words);
             tables += section.section.hidden ? 0 : 1;
         }
+        showFiles(words.length === 0);
         const result = `${plural(rows, "row")} in ${plural(tables, "table")}`;
         found.textContent = words.length === 0 ? "" : tables === 0 ? "Nothing found" : result;
     };

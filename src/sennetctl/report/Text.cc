@@ -5,20 +5,22 @@
 namespace sennetctl {
 
 std::string printable(std::string_view text) {
-    std::string clean = utf8::clean(text);
-    for (char& c : clean) {
-        const auto code = static_cast<unsigned char>(c);
+    const std::string clean = utf8::clean(text);
+    std::string shown;
+    shown.reserve(clean.size());
+    for (std::size_t i = 0; i < clean.size(); ++i) {
+        const auto code = static_cast<unsigned char>(clean[i]);
         if (code < ' ' || code == 0x7F) {
-            c = ' ';
+            shown += ' ';
+        } else if (code == 0xC2 && static_cast<unsigned char>(clean[i + 1]) < 0xA0) {
+            // The second set of control characters, U+0080 to U+009F, moves the cursor, too.
+            shown += ' ';
+            ++i;
+        } else {
+            shown += clean[i];
         }
     }
-    // The second set of control characters, U+0080 to U+009F, moves the cursor, too.
-    for (std::size_t i = 0; i + 1 < clean.size(); ++i) {
-        if (clean[i] == '\xC2' && static_cast<unsigned char>(clean[i + 1]) < 0xA0) {
-            clean.replace(i, 2, " ");
-        }
-    }
-    return clean;
+    return shown;
 }
 
 std::size_t widthOf(std::string_view text) {

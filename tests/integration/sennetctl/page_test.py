@@ -151,13 +151,15 @@ class PageTest(unittest.TestCase):
         self.search("fan")
         self.assertEqual(self.seen("#found"), ["5 rows in 1 table"])
         self.search("none such")
-        self.assertEqual(self.seen("section.table"), [])
+        self.assertEqual(self.seen("section"), [])
+        self.assertEqual(self.seen("nav a"), [])
         self.assertEqual(self.seen("#found"), ["Nothing found"])
         self.browser.value("document.getElementById('search').select()")
         self.browser.press("Backspace")
         self.browser.command("Input.dispatchKeyEvent", type="keyDown", key="Delete",
                              windowsVirtualKeyCode=46)
-        self.assertEqual(self.seen("section.table h3"), ["Fan", "System"])
+        self.assertEqual(self.seen("main h2, main h3"), ["fans.mif", "Fan", "System"])
+        self.assertEqual(len(self.seen("nav a")), 3)
         self.assert_nothing_went_wrong(self.fans)
 
     def test_without_script_everything_is_there_to_be_read(self):

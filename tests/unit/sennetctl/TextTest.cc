@@ -14,6 +14,16 @@ TEST(TextTest, NothingThatMovesACursorIsPrinted) {
     EXPECT_EQ(printable("caf\xE9"), "caf\xEF\xBF\xBD");
 }
 
+// Texts of a MIF file may be megabytes long: taking out each by itself never came to an end.
+TEST(TextTest, ManyControlCharactersTakeNoLongerThanOthers) {
+    constexpr std::size_t kMany = 2000000;
+    std::string text;
+    for (std::size_t i = 0; i < kMany; ++i) {
+        text += "\xC2\x85";
+    }
+    EXPECT_EQ(printable(text), std::string(kMany, ' '));
+}
+
 TEST(TextTest, WidthCountsCharacters) {
     EXPECT_EQ(widthOf(""), 0U);
     EXPECT_EQ(widthOf("caf\xC3\xA9"), 4U);
