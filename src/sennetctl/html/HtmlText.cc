@@ -3,7 +3,6 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cstdlib>
 #include <optional>
 
 #include "report/Text.h"
@@ -40,9 +39,9 @@ void appendLine(std::string& html, std::string_view line) {
     }
 }
 
-/// "+01:30" of the minutes "+090".
+/// "+01:30" of the minutes "+090", a sign and three digits.
 std::string offsetOf(std::string_view text) {
-    const int minutes = std::atoi(std::string(text.substr(1)).c_str());
+    const int minutes = (text[1] - '0') * 100 + (text[2] - '0') * 10 + (text[3] - '0');
     return fmt::format("{}{:02}:{:02}", text[0], minutes / 60, minutes % 60);
 }
 
