@@ -35,9 +35,17 @@ class Markup {
         }
         appendEmptyColumns();
         appendDescriptions();
+        checkSize();
     }
 
   private:
+    void checkSize() const {
+        if (html.size() > kLargestPageOctets) {
+            throw CannotRun("the page would be larger than " +
+                            std::to_string(kLargestPageOctets >> 20) + " MiB");
+        }
+    }
+
     void appendElement(const char* name, const std::string& text) {
         html.append("<").append(name).append(">");
         appendHtml(html, text);
@@ -79,10 +87,7 @@ class Markup {
             appendCell(row[i], table.columns[i].isNumber);
         }
         html += "</tr>\n";
-        if (html.size() > kLargestPageOctets) {
-            throw CannotRun("the page would be larger than " +
-                            std::to_string(kLargestPageOctets >> 20) + " MiB");
-        }
+        checkSize();
     }
 
     void appendHeader(const char* scope, const std::string& name, bool isNumber) {

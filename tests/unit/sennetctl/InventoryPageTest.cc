@@ -166,9 +166,16 @@ TEST_F(InventoryPageTest, NoTextOfAFileBecomesMarkup) {
 }
 
 TEST_F(InventoryPageTest, APageThatNoBrowserTakesIsRefused) {
-    ShownTable table{"T", "c", {}, {{"A", {}, false}}, {{"a"}, {"b"}}, {}};
+    const ShownTable rows{"T", "c", {}, {{"A", {}, false}}, {{"a"}, {"b"}}, {}};
+    const ShownTable oneRow{"T", "c", {}, {{"A", {}, false}}, {{"a"}}, {}};
+    const ShownTable nothing{"T", "c", {}, {}, {}, {}};
     std::string html(kLargestPageOctets, ' ');
-    EXPECT_THROW(appendTable(html, table, "t", "f"), CannotRun);
+    for (const ShownTable& table : {rows, oneRow, nothing}) {
+        EXPECT_THROW(appendTable(html, table, "t", "f"), CannotRun);
+        html.resize(kLargestPageOctets);
+    }
+    html.clear();
+    EXPECT_NO_THROW(appendTable(html, rows, "t", "f"));
 }
 
 }  // namespace
