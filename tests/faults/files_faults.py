@@ -62,12 +62,14 @@ def _(trial):
 def _(trial):
     if not rows.is_root():
         raise rows.Skip("becoming another user needs root")
+    as_nobody = ["setpriv", f"--reuid={NOBODY}", f"--regid={NOBODY}", "--clear-groups"]
+    if rows.run([*as_nobody, "test", "-x", trial.bin / "sennet"]).status != 0:
+        raise rows.Skip("another user cannot reach the program")
     with InventoryRun(trial) as run:
         for product in trial.some(PRODUCTS, every=3):
             trial.count()
             run.new(product)
             run.leave_earlier_files(product)
-            as_nobody = ["setpriv", f"--reuid={NOBODY}", f"--regid={NOBODY}", "--clear-groups"]
             finished = run.generator.run(product, before=as_nobody)
             expect_end(finished, product)
             rows.expect_equal(run.expect_whole(product, "as nobody"), 0, "new files")
