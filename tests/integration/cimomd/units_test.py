@@ -53,7 +53,7 @@ class UnitsTest(unittest.TestCase):
         lines = (UNITS / "cimomd.service").read_text().splitlines()
         for line in ("ProtectSystem=strict", "NoNewPrivileges=yes",
                      "CapabilityBoundingSet=CAP_DAC_READ_SEARCH",
-                     "ExecReload=/bin/kill -HUP $MAINPID"):
+                     "ExecReload=/bin/sh -c 'kill -HUP $MAINPID'"):
             self.assertIn(line, lines)
 
 
