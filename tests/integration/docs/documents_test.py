@@ -116,6 +116,12 @@ class DocumentsTest(unittest.TestCase):
                     with self.subTest(place=f"{document.name}:{line}", command=text):
                         CHECKS.check(text)
 
+    def test_the_readme_leads_to_every_document(self):
+        readme, *others = documents_of(SOURCES.source)
+        linked = {link for _, link in readme.links()}
+        for document in others:
+            self.assertIn(str(document.path.relative_to(SOURCES.source)), linked)
+
     def test_links_lead_somewhere(self):
         documents = documents_of(SOURCES.source)
         anchors = {document.path: document.anchors() for document in documents}
