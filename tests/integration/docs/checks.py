@@ -1,6 +1,7 @@
 """A look at commands that are not run where the tests run: each function raises ValueError with what
 is wrong with the command."""
 
+import itertools
 import json
 import re
 import shlex
@@ -121,12 +122,12 @@ class Checks:
     # --- our programs, where a sentence names an option --------------------------------------------
 
     def check_sennetctl(self, words):
-        subcommands = []
-        while len(words) > len(subcommands) + 1 and re.fullmatch("[a-z]+", words[len(subcommands) + 1]):
-            subcommands.append(words[len(subcommands) + 1])
+        subcommands = list(itertools.takewhile(re.compile("[a-z]+$").match, words[1:]))
         told = subprocess.run([self.programs.sennet.parent / "sennetctl", *subcommands, "--help"],
                               capture_output=True, text=True, check=False, timeout=60)
-        _refuse(told.returncode != 0, f"there is no command {' '.join(subcommands)}")
+        # An unknown command gets the help of the one above.
+        _refuse(f"Usage: {' '.join(['sennetctl', *subcommands])} " not in told.stdout,
+                f"there is no command {' '.join(subcommands)}")
         self._check_options(words[1:], told.stdout)
 
     def check_cimomd(self, words):
