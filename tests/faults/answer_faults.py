@@ -82,13 +82,13 @@ def inserted(trial, octets, outcomes, every):
 
 @SUITE.case("unknown element at every boundary")
 def _(trial):
-    inserted(trial, b"<WIDGET/>", {CLASS: ABANDONED, INSTANCES: EMPTY}, every=9)
+    inserted(trial, b"<WIDGET/>", {CLASS: ABANDONED, INSTANCES: EMPTY}, every=13)
     return BOTH
 
 
 @SUITE.case("comment at every boundary, which is allowed")
 def _(trial):
-    inserted(trial, b"<!-- <WIDGET> -->", {CLASS: WHOLE, INSTANCES: WHOLE}, every=19)
+    inserted(trial, b"<!-- <WIDGET> -->", {CLASS: WHOLE, INSTANCES: WHOLE}, every=29)
     return f"{WHOLE}; next script right"
 
 

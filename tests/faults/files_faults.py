@@ -106,7 +106,7 @@ def _(trial):
 @SUITE.case("a directory that vanishes during the run")
 def _(trial):
     with InventoryRun(trial, instances=300) as run:
-        for _ in trial.repeat(200):
+        for _ in trial.repeat(100):
             trial.count()
             run.new("QVE")
             run.leave_earlier_files("QVE")
@@ -127,7 +127,7 @@ def odd_outputs(trial, make, check, what):
     """Makes something odd of each output name in turn; all other files are new then."""
     with InventoryRun(trial) as run:
         for product in trial.some(PRODUCTS, every=3):
-            for path in run.new(product):
+            for path in trial.some(run.new(product), every=6):
                 trial.count()
                 run.leave_earlier_files(product)
                 odd = run.generator.top / path
@@ -214,7 +214,7 @@ def _(trial):
         for product in trial.some(PRODUCTS, every=3):
             longest = max(len(octets) for octets in run.new(product).values())
             seen = set()
-            for size in trial.some(range(0, longest + 512, 512), every=61):
+            for size in trial.some(range(0, longest + 512, 512), every=97):
                 trial.count()
                 run.leave_earlier_files(product)
                 finished = run.generator.run(product, limits=[f"--fsize={size}"])
@@ -234,7 +234,7 @@ def failing_calls(trial, named):
             for error in (errno.EIO, errno.ENOSPC) if trial.full else (errno.EIO,):
                 call, failed = 0, "none yet"
                 while failed:
-                    call += 1 if trial.full else 11
+                    call += 1 if trial.full else 17
                     trial.count()
                     run.leave_earlier_files(product)
                     finished = run.generator.run(product, {

@@ -27,7 +27,7 @@ def killed(trial, number, full, named):
     moments = random.Random(5)
     counts = set()
     with InventoryRun(trial, 700) as run:
-        for product in PRODUCTS:
+        for product in trial.some(PRODUCTS, every=3):
             start = time.monotonic()
             run.new(product)
             duration = time.monotonic() - start
@@ -42,7 +42,8 @@ def killed(trial, number, full, named):
                 counts.add(run.expect_whole(product, f"signal {number}", hidden=True))
                 rows.expect_equal(run.generator.run(product, {"NAMED": named}).status, 0, "next run")
                 run.expect_new(product, "the next run")
-    rows.expect(len(counts) > 1, f"the moment made no difference: {counts}")
+    # A few moments may well all be too late.
+    rows.expect(len(counts) > 1 or not trial.full, f"the moment made no difference: {counts}")
     return f"{WHOLE}; the next run removes temporary files, and its files are new"
 
 
