@@ -49,3 +49,12 @@ if(SENNET_COVERAGE)
     target_compile_options(sennet_compile INTERFACE ${profile} -fcoverage-mapping)
     target_link_options(sennet_compile INTERFACE ${profile})
 endif()
+
+# sennet_precompile(TARGET header...): with SENNET_PRECOMPILE, where enough sources gain by it.
+function(sennet_precompile TARGET)
+    get_target_property(sources ${TARGET} SOURCES)
+    list(LENGTH sources count)
+    if(SENNET_PRECOMPILE AND count GREATER 8)
+        target_precompile_headers(${TARGET} PRIVATE ${ARGN})
+    endif()
+endfunction()

@@ -22,6 +22,7 @@ function(sennet_add_test NAME)
         target_compile_options(${NAME} PRIVATE -fno-sanitize=all -fno-profile-instr-generate
                                -fno-coverage-mapping)
     endif()
+    sennet_precompile(${NAME} <gmock/gmock.h> <gtest/gtest.h>)
     if(SENNET_SANITIZE)
         target_compile_definitions(${NAME} PRIVATE SENNET_TEST_SANITIZED)
     endif()
