@@ -323,6 +323,28 @@ exhausting("endless blanks", at_both(b""), b" ", 4 * GIB, 8 * rows.MIB, 3 * MEMO
 exhausting("endless comments", at_both(b""), b"<!-- more -->", 4 * GIB + rows.MIB, 20 * rows.MIB)
 
 
+# Parts of instances, of which many take much more memory than octets.
+INSTANCE_PARTS = {
+    "instances": (b"", b'<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME="CIM_Faulty"/>'
+                       b'<INSTANCE CLASSNAME="CIM_Faulty"/></VALUE.NAMEDINSTANCE>'),
+    "elements of an array": (b'<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME="CIM_Faulty"/><INSTANCE '
+                             b'CLASSNAME="CIM_Faulty"><PROPERTY.ARRAY NAME="P" TYPE="string">'
+                             b'<VALUE.ARRAY>', b"<VALUE/>"),
+}
+for _name, _octets in INSTANCE_PARTS.items():
+    @SUITE.case(f"endless {_name}, 2 GiB of memory at most")
+    def _(trial, name=_name, octets=_octets):
+        if not trial.full:
+            raise rows.Skip("takes long: at full effort only")
+        start, part = octets
+        at_most = 2 * GIB
+        with HostileRun(trial) as run:
+            run.expect(EMPTY, INSTANCES, stream(start, again(part, 4 * GIB)), name,
+                       memory=at_most, patience_s=240,
+                       limits=[f"--as={at_most}"])
+        return f"{EMPTY}; next script right"
+
+
 # All of it is one class, and all of it right until it breaks off.
 CLASS_PARTS = {
     "properties": b'<PROPERTY NAME="P%d" TYPE="uint8"/>',

@@ -64,14 +64,15 @@ class HostileRun:
         self._where = None
 
     def expect_run(self, outcome, what, quick=False, memory=MEMORY_LIMIT,
-                   patience_s=rows.PATIENCE_S):
-        """Runs, with `quick` to a time-out that comes soon. `memory` bounds the program's."""
+                   patience_s=rows.PATIENCE_S, limits=()):
+        """Runs, with `quick` to a time-out that comes soon. `memory` is what the program may come
+        to use, `limits` are of the kernel."""
         self.trial.count()
         generator = self.generator
         generator.empty_outputs()
         (generator.mif / "a.mif").write_bytes(expected.EARLIER)
         finished = generator.run("SMS", {"CLOCK": QUICK} if quick else None,
-                                 patience_s=patience_s)
+                                 limits, patience_s)
         lines = ("" if outcome == ABANDONED else "Processing a...\n") + "Processing b...\n"
         if (finished.status, finished.out) != (0, generator.banner() + lines):
             raise rows.Failure(f"{what}: expected status 0 and the lines {lines!r}, "

@@ -7,6 +7,7 @@
 
 #include "client/AnswerStatus.h"
 #include "client/LocalAuthentication.h"
+#include "client/MemoryBoundedSource.h"
 #include "client/UnixSocket.h"
 #include "client/WireText.h"
 #include "xml/CimXmlReader.h"
@@ -164,7 +165,8 @@ auto CIMClientRep::perform(const char* method, const CIMNamespaceName& nameSpace
     const std::unique_ptr<HttpExchange> current = exchange(request, deadline, answerLimit);
     checkHead(current->answer());
     try {
-        auto result = decode(*current);
+        MemoryBoundedSource answer(*current, settings.memoryLimit);
+        auto result = decode(answer);
         current->skipBody();
         checkReportedStatus(current->answer());
         guard.keepIf(current->leavesConnectionOpen());

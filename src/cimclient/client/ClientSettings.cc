@@ -1,5 +1,7 @@
 #include "client/ClientSettings.h"
 
+#include "client/MemoryBoundedSource.h"
+
 namespace Pegasus {
 
 ClientSettings ClientSettings::standard() {
@@ -8,6 +10,7 @@ ClientSettings ClientSettings::standard() {
     settings.authenticationDirectories = {"/var/tmp", "/var/opt/tog-pegasus/cache/localauth",
                                           "/var/lib/Pegasus/cache/localauth",
                                           "/run/cimomd/localauth"};
+    settings.memoryLimit = memoryForOneAnswer();
     return settings;
 }
 

@@ -16,11 +16,13 @@ struct ClientSettings {
     ServerPlaces places;
     /// Directories in which a server may leave a secret for local authentication.
     std::vector<std::string> authenticationDirectories;
-    /// Octets of one answer's body after decoding of the transfer coding. The objects made of it
-    /// may take twelve times as much memory.
+    /// Octets of one answer's body after decoding of the transfer coding.
     Uint64 bodyLimit = Uint64(4) << 30;
     /// The same of an answer that describes one class; real ones have some 60,000.
     Uint64 classBodyLimit = Uint64(16) << 20;
+    /// Octets of memory that the objects of one answer may take, which can be twelve times those of
+    /// the answer; looked at every 16 MiB.
+    Uint64 memoryLimit = ~Uint64(0);
     /// Octets of one answer's header and trailer lines together.
     std::size_t headLimit = 64 * 1024;
 

@@ -114,8 +114,8 @@ class Document:
 
 def documents_of(source):
     """All documents of a tree of sources."""
-    return [Document(path) for path in (source / "README.md", source / "CONTRIBUTING.md",
-                                        *sorted((source / "docs").glob("*.md")))]
+    own = (source / name for name in ("README.md", "CONTRIBUTING.md", "SECURITY.md"))
+    return [Document(path) for path in (*own, *sorted((source / "docs").glob("*.md")))]
 
 
 def shape(line):

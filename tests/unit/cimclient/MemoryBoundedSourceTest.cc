@@ -1,0 +1,79 @@
+#include "client/MemoryBoundedSource.h"
+
+#include <Pegasus/Client/ClientExceptions.h>
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+
+#include <algorithm>
+#include <string>
+#include <vector>
+
+namespace Pegasus {
+namespace {
+
+constexpr std::size_t kMib = std::size_t{1} << 20;
+constexpr std::size_t kPiece = kMib;
+
+/// The letter x, so many times.
+class Letters : public ByteSource {
+  public:
+    explicit Letters(std::size_t count) : left(count) {}
+
+    std::size_t read(char* buffer, std::size_t capacity) override {
+        const std::size_t count = std::min(left, capacity);
+        std::fill_n(buffer, count, 'x');
+        left -= count;
+        return count;
+    }
+
+  private:
+    std::size_t left;
+};
+
+/// Reads all of it, keeps what it reads when told to, and returns how much that was.
+std::size_t readAll(ByteSource& source, bool kept) {
+    std::vector<std::string> pieces;
+    std::string piece(kPiece, '\0');
+    std::size_t total = 0;
+    while (const std::size_t count = source.read(piece.data(), piece.size())) {
+        total += count;
+        if (kept) {
+            pieces.push_back(piece);
+        }
+    }
+    return total;
+}
+
+TEST(MemoryBoundedSource, GivesAllOfALongAnswerThatNeedsLittle) {
+    Letters letters(200 * kMib + 7);
+    MemoryBoundedSource source(letters, 32 * kMib);
+    EXPECT_EQ(readAll(source, false), 200 * kMib + 7);
+}
+
+TEST(MemoryBoundedSource, RefusesAnAnswerThatNeedsMoreThanTheLimit) {
+    Letters letters(1024 * kMib);
+    MemoryBoundedSource source(letters, 64 * kMib);
+    EXPECT_THROW(readAll(source, true), CIMClientMalformedHTTPException);
+}
+
+TEST(MemoryBoundedSource, LetsAnAnswerHaveAsMuchAsTheLimit) {
+    Letters letters(96 * kMib);
+    MemoryBoundedSource source(letters, 256 * kMib);
+    EXPECT_EQ(readAll(source, true), 96 * kMib);
+}
+
+TEST(MemoryForOneAnswer, IsAQuarterOfWhatTheProcessMayHave) {
+    rlimit before{};
+    ASSERT_EQ(::getrlimit(RLIMIT_AS, &before), 0);
+    const Uint64 usual = memoryForOneAnswer();
+    EXPECT_GT(usual, 16 * kMib);
+    rlimit less = before;
+    less.rlim_cur = usual;
+    ASSERT_EQ(::setrlimit(RLIMIT_AS, &less), 0);
+    const Uint64 limited = memoryForOneAnswer();
+    ASSERT_EQ(::setrlimit(RLIMIT_AS, &before), 0);
+    EXPECT_EQ(limited, usual / 4);
+}
+
+}  // namespace
+}  // namespace Pegasus
