@@ -16,9 +16,6 @@ namespace {
 
 using testing::ExitedWithCode;
 
-constexpr rlim_t kLittleMemory = rlim_t{256} << 20;
-constexpr std::size_t kMuchMemory = std::size_t{1} << 30;
-
 void setLimit(decltype(RLIMIT_AS) what, rlim_t bytes) {
     const rlimit limit{bytes, bytes};
     if (::setrlimit(what, &limit) != 0) {
@@ -84,6 +81,8 @@ TEST(ProcessGuards, LackOfMemoryEndsTheProcessWithAWord) {
 #ifdef SENNET_TEST_SANITIZED
     GTEST_SKIP() << "the sanitizers have an allocator of their own";
 #else
+    constexpr rlim_t kLittleMemory = rlim_t{256} << 20;
+    constexpr std::size_t kMuchMemory = std::size_t{1} << 30;
     EXPECT_EXIT(
         {
             endWhenMemoryIsShort("thrifty");
