@@ -45,6 +45,8 @@ TEST_PACKAGES=(libgtest-dev libgmock-dev rpm python3 mariadb-server postgresql-1
     sblim-wbemcli libxml2-utils systemd iproute2 procps pciutils usbutils dmidecode mandoc
     chromium)
 # shellcheck disable=SC2034
+FUZZ_PACKAGES=(clang libclang-rt-14-dev libgtest-dev libgmock-dev)
+# shellcheck disable=SC2034
 PACKAGING_PACKAGES=(dpkg-dev file fakeroot rpm lintian debootstrap pkg-config systemd-container)
 # shellcheck disable=SC2034
 BENCHMARK_PACKAGES=(libexpat1-dev libbenchmark-dev python3)

@@ -33,6 +33,7 @@ class Checks:
         self.builders = {"./run": self.check_script, "./test": self.check_script,
                          ".ci/run": self.check_script, "bench/compare": self.check_script,
                          "packaging/test-packages": self.check_script,
+                         "scripts/fuzz": self.check_script,
                          "tests/valgrind": self.check_script, "cmake": self.check_cmake,
                          "cpack": self.check_cmake, "ctest": self.check_ctest,
                          "build/release/bin/inner-parts": self.check_benchmark}
