@@ -49,7 +49,8 @@ InventoryPage composePage(const HtmlOptions& options, const Output& output) {
         const std::string& file = options.files[i];
         progress.show("file " + std::to_string(i + 1) + " of " +
                       std::to_string(options.files.size()) + ": " + file);
-        page.add(names[i], modifiedAt(file), readMifFile(file));
+        const MifContent content = readMifFile(file);
+        page.add(names[i], modifiedAt(file), content);
     }
     return page;
 }
