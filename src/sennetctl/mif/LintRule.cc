@@ -42,7 +42,7 @@ Severities severitiesOf(LintRule rule) {
             return {kError, kSilent, kSilent, kSilent};
         case LintRule::ClassForm:
         case LintRule::NoComponentId:
-            return {kWarning, kSilent, kWarning, kWarning};
+            return {kWarning, kSilent, kWarning, kSilent};
         case LintRule::UnusedTemplate:
             break;
     }

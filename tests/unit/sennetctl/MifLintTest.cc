@@ -134,8 +134,8 @@ TEST(MifLintTest, LineEndsInLiterals) {
 
 TEST(MifLintTest, ClassesOffTheConvention) {
     const std::string attribute = attributeMif(1, "Speed", "Integer", "7");
-    EXPECT_EQ(severities(mifOf(groupMif(2, "Fan", "Own|Fan", attribute))), "W-WW");
-    EXPECT_EQ(severities(mifOf(groupMif(2, "Fan", "Own||001", attribute))), "W-WW");
+    EXPECT_EQ(severities(mifOf(groupMif(2, "Fan", "Own|Fan", attribute))), "W-W-");
+    EXPECT_EQ(severities(mifOf(groupMif(2, "Fan", "Own||001", attribute))), "W-W-");
 }
 
 TEST(MifLintTest, AFileWithoutComponentId) {
@@ -143,7 +143,7 @@ TEST(MifLintTest, AFileWithoutComponentId) {
         severities(kMifStart +
                    groupMif(2, "Fan", "Own|Fan|001", attributeMif(1, "Speed", "Integer", "7")) +
                    kMifEnd),
-        "W-WW");
+        "W-W-");
 }
 
 TEST(MifLintTest, Dates) {
