@@ -9,6 +9,8 @@ namespace sennetctl {
 namespace {
 
 constexpr const char* kGivenUp = ": sennet gives the whole script up";
+constexpr const char* kBrokenOff =
+    ": sennet breaks the MIF file off in its middle, for CA and QVE the file of all scripts";
 constexpr const char* kSuffix = ".script.inv";
 
 class Checker {
@@ -33,8 +35,9 @@ class Checker {
         findings.push_back({model.file, place.line, place.column, severity, message});
     }
 
-    void giveUp(const ScriptText& place, const std::string& message) {
-        add(Severity::Error, place, message + kGivenUp);
+    void giveUp(const ScriptText& place, const std::string& message,
+                const char* consequence = kGivenUp) {
+        add(Severity::Error, place, message + consequence);
         model.givenUp = true;
     }
 
@@ -110,10 +113,11 @@ class Checker {
         if (!isLegalName(property.value)) {
             const char last = property.value.back();
             const bool separator = last == ',' || last == ' ';
-            giveUp(property, "'" + property.value + "' is no name of a property" +
-                                 (separator ? ", for a comma or blank at the end of the line "
-                                              "belongs to it"
-                                            : ""));
+            giveUp(property,
+                   "'" + property.value + "' is no name of a property" +
+                       (separator ? ", for a comma or blank at the end of the line belongs to it"
+                                  : ""),
+                   kBrokenOff);
             return;
         }
         const bool repeated = std::any_of(

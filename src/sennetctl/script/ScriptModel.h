@@ -31,7 +31,7 @@ struct ScriptModel {
     ScriptText title;
     ScriptText defaultNamespace{"root/velmira", 0, 0};
     std::array<ScriptSlot, kSlots> slots;
-    bool givenUp = false;  // the generator drops the whole script
+    bool givenUp = false;  // the generator writes nothing for the script, or half a file
 
     const std::string& namespaceOf(const ScriptSlot& slot) const {
         return slot.nameSpace.value.empty() ? defaultNamespace.value : slot.nameSpace.value;

@@ -51,6 +51,19 @@ FAULTS = {
     "64-bit number": ("Name", "MaxMediaSize", 7, 15, "warning", "beyond 32 bits"),
     "title that is cut": ("Disks", "Disks of this machine", 2, 7, "warning", "with Lumo"),
 }
+# What makes nothing of a script, and what makes half a file of it.
+GIVEN_UP = {
+    "slot 10": ("N[0]", "N[10]"),
+    "class": ("CIM_DiskDrive", "CIM-DiskDrive"),
+    "namespace": ("root/cimv2", "root//cimv2"),
+    "blank behind =": ("N[0]=", "N[0]= "),
+    "encoding": ("Disks", "M\xfchle"),
+}
+BROKEN_OFF = {
+    "name": ("Name", "Na-me"),
+    "comma at the end": ("Name", "Name,"),
+    "blank at the end": ("Name", "Name "),
+}
 
 
 class FaultsTest(unittest.TestCase):
@@ -89,6 +102,50 @@ class FaultsTest(unittest.TestCase):
                 self.assertTrue(any(
                     (each["line"], each["column"], each["severity"]) == (line, column, severity)
                     and message in each["message"] for each in found), found)
+
+    def run_with(self, product, *scripts):
+        """What sennet makes of scripts of these texts, one0, one1 and so on."""
+        place = pathlib.Path(self.enterContext(
+            tempfile.TemporaryDirectory(prefix="sennet-faults-")))
+        inventory = place / "inventory"
+        inventory.mkdir()
+        (inventory / "sennet.properties").touch()
+        for number, text in enumerate(scripts):
+            (inventory / f"one{number}.script.inv").write_bytes(text.encode("latin-1"))
+        return installation.Run(installation.programs_of(ARGUMENTS), product, place,
+                                self.server.socket, inventory)
+
+    def test_the_script_without_fault_makes_a_file(self):
+        for product in ("SMS", "CA"):
+            run = self.run_with(product, GOOD)
+            file, = run.files()
+            self.assertTrue(run.tables(file))
+
+    def test_what_is_given_up_makes_no_file(self):
+        for name, (good, bad) in GIVEN_UP.items():
+            with self.subTest(fault=name):
+                text = GOOD.replace(good, bad, 1)
+                _, found = self.check(text)
+                self.assertTrue(any("gives the whole script up" in each["message"]
+                                    for each in found), found)
+                run = self.run_with("SMS", text)
+                self.assertNotIn("one0", run.result.stdout)
+                self.assertEqual(list(run.mif.glob("*.mif")), [])
+
+    def test_what_is_broken_off_spoils_the_file(self):
+        for name, (good, bad) in BROKEN_OFF.items():
+            text = GOOD.replace(good, bad, 1)
+            _, found = self.check(text)
+            self.assertTrue(any("breaks the MIF file off" in each["message"]
+                                and "gives the whole script up" not in each["message"]
+                                for each in found), found)
+            for product, scripts in (("SMS", [text]), ("CA", [GOOD, text, GOOD])):
+                with self.subTest(fault=name, product=product):
+                    run = self.run_with(product, *scripts)
+                    self.assertIn("Processing one0", run.result.stdout)
+                    file, = run.files()
+                    with self.assertRaises(ValueError):
+                        run.tables(file)
 
 
 if __name__ == "__main__":

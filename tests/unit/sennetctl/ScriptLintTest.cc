@@ -60,10 +60,14 @@ TEST_F(ScriptLintTest, NamesThatAreNone) {
               "5:6: error: 'root//x' is no name of a namespace: sennet gives the whole script "
               "up\n");
     EXPECT_EQ(check("G[0]=A\nA[0]=B,1C\n"),
-              "5:8: error: '1C' is no name of a property: sennet gives the whole script up\n");
+              "5:8: error: '1C' is no name of a property: sennet breaks the MIF file off in its "
+              "middle, for CA and QVE the file of "
+              "all scripts\n");
     EXPECT_EQ(check("G[0]=A\nA[0]=B,C,\n"),
               "5:8: error: 'C,' is no name of a property, for a comma or blank at the end of the "
-              "line belongs to it: sennet gives the whole script up\n");
+              "line belongs to it: sennet breaks the MIF file off in its middle, for CA and QVE "
+              "the file of "
+              "all scripts\n");
 }
 
 TEST_F(ScriptLintTest, WhatIsListedTwice) {
