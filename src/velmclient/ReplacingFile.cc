@@ -17,10 +17,19 @@ namespace {
 constexpr std::size_t kBufferSize = 64 * 1024;
 constexpr int kNameAttempts = 100;
 constexpr unsigned int kNewFileMode = 0666;
+// A stranger who could open a file with a name could lock it, and it would seem to be in use.
+constexpr unsigned int kHiddenFileMode = 0600;
 constexpr unsigned int kPermissionBits = 0777;
 
 std::string descriptorPath(int descriptor) {
     return "/proc/self/fd/" + std::to_string(descriptor);
+}
+
+// Threads that make files meanwhile make them too private, never too open.
+unsigned int maskOfNewFiles() {
+    const mode_t mask = ::umask(kPermissionBits);
+    ::umask(mask);
+    return mask;
 }
 
 // Calls `make` with random hidden names until one is free; make returns 0 or an error number.
@@ -64,16 +73,11 @@ int ReplacingFile::prepare() {
         return error;
     }
     removeAbandonedFiles(directory.get());
-    const unsigned int mode = previousMode.value_or(kNewFileMode);
     if (temporary == Temporary::kNamelessWherePossible) {
-        openNameless(mode);
+        openNameless(mode.value_or(kNewFileMode));
     }
     if (!file.isOpen()) {
-        error = openHidden(mode);
-    }
-    // The umask has narrowed the mode. Where the file system keeps no modes, nothing is lost.
-    if (error == 0 && previousMode) {
-        (void)::fchmod(file.get(), mode);
+        error = openHidden();
     }
     buffer.reserve(kBufferSize);
     return error;
@@ -101,7 +105,7 @@ int ReplacingFile::readPreviousMode() {
     if (S_ISREG(previous.st_mode)) {
         // Somebody else who may write into the directory must not choose who may write to our file.
         if (previous.st_uid == ::geteuid() && previous.st_nlink == 1) {
-            previousMode = previous.st_mode & kPermissionBits;
+            mode = previous.st_mode & kPermissionBits;
         }
         return 0;
     }
@@ -112,22 +116,31 @@ int ReplacingFile::readPreviousMode() {
     return S_ISDIR(previous.st_mode) ? EISDIR : EINVAL;
 }
 
-void ReplacingFile::openNameless(unsigned int mode) {
-    file = FileDescriptor(::openat(directory.get(), ".", O_TMPFILE | O_WRONLY | O_CLOEXEC, mode));
+void ReplacingFile::openNameless(unsigned int firstMode) {
+    file =
+        FileDescriptor(::openat(directory.get(), ".", O_TMPFILE | O_WRONLY | O_CLOEXEC, firstMode));
     // It gets its name through /proc, which may not be mounted.
     if (file.isOpen() && ::access(descriptorPath(file.get()).c_str(), F_OK) != 0) {
         file.close();
     }
 }
 
-int ReplacingFile::openHidden(unsigned int mode) {
+int ReplacingFile::openHidden() {
+    if (!mode) {
+        mode = kNewFileMode & ~maskOfNewFiles();
+    }
     return withFreeName(hiddenName, [&](const char* candidate) {
         file = FileDescriptor(::openat(directory.get(), candidate,
-                                       O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC, mode));
+                                       O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC,
+                                       kHiddenFileMode));
         if (!file.isOpen()) {
             return errno;
         }
-        return lockTemporaryFile(file.get()) ? 0 : EEXIST;
+        if (lockTemporaryFile(file.get())) {
+            return 0;
+        }
+        (void)::unlinkat(directory.get(), candidate, 0);
+        return EEXIST;
     });
 }
 
@@ -169,6 +182,10 @@ int ReplacingFile::finish() {
     // the new name must not stand for an empty file. EINVAL: the file system cannot synchronise.
     if (error == 0 && ::fdatasync(file.get()) != 0 && errno != EINVAL) {
         error = errno;
+    }
+    // Where the file system keeps no modes, nothing is lost.
+    if (error == 0 && mode) {
+        (void)::fchmod(file.get(), *mode);
     }
     if (error == 0 && hiddenName.empty()) {
         error = linkHidden();

@@ -43,12 +43,12 @@ class ReplacingFile {
     int prepare();
     int openDirectory();
     int readPreviousMode();
-    int openHidden(unsigned int mode);
+    int openHidden();
     int flush();
     int finish();
     int linkHidden();
 
-    void openNameless(unsigned int mode);
+    void openNameless(unsigned int firstMode);
 
     // Returns whether there was no error; after one it is reported and everything thrown away.
     bool succeeded(int error);
@@ -58,7 +58,8 @@ class ReplacingFile {
     std::string name;
     std::string hiddenName;
     Temporary temporary;
-    std::optional<unsigned int> previousMode;
+    // What the file gets at its end, unless it was made with it.
+    std::optional<unsigned int> mode;
     FileDescriptor directory;
     FileDescriptor file;
     std::string buffer;

@@ -23,6 +23,8 @@ namespace {
 constexpr std::string_view kPrefix = ".velm-";
 constexpr std::string_view kSuffix = ".tmp";
 constexpr std::size_t kDigits = 16;
+// Others may fill the directory with such names, and it is looked through for each output file.
+constexpr int kEntriesLookedAt = 4096;
 
 bool isHexDigit(char c) {
     return (c >= '0' && c <= '9') || (c >= 'a' && c <= 'f');
@@ -53,7 +55,11 @@ std::vector<std::string> temporaryNamesIn(int directory) {
         FileDescriptor(readable).close();
         return names;
     }
-    while (const dirent* entry = ::readdir(stream.get())) {
+    for (int left = kEntriesLookedAt; left > 0; --left) {
+        const dirent* entry = ::readdir(stream.get());
+        if (entry == nullptr) {
+            break;
+        }
         if (isTemporaryName(entry->d_name)) {
             names.emplace_back(entry->d_name);
         }

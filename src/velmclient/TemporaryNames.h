@@ -19,9 +19,9 @@ bool isTemporaryName(std::string_view name);
 // where the file system has no locks nobody can be.
 bool lockTemporaryFile(int descriptor);
 
-// Removes this user's abandoned temporary files from a directory, as far as that can be done; never
-// waits, follows no link and touches nothing of another name or kind. `directory` may be opened
-// with O_PATH.
+// Removes this user's abandoned temporary files from a directory, as far as that can be done and
+// among its first 4,096 entries; never waits, follows no link and touches nothing of another name
+// or kind. `directory` may be opened with O_PATH.
 void removeAbandonedFiles(int directory);
 
 }  // namespace Velm

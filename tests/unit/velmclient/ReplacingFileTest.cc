@@ -10,6 +10,7 @@
 
 #include <cstdio>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "SyslogSpy.h"
@@ -128,6 +129,23 @@ TEST(ReplacingFile, AFileOfTwoNamesDoesNotGiveItsMode) {
     EXPECT_EQ(modeOfReplacement(directory.path("a")), "0644");
     EXPECT_EQ(modeOf(elsewhere), 0666U);
     EXPECT_EQ(directory.read("elsewhere"), "open to all");
+}
+
+// Whoever could open it could lock it, and it would stay when the run is killed.
+TEST(ReplacingFile, TheHiddenFileIsNobodyElsesUntilItsEnd) {
+    const TempDirectory directory;
+    const std::string path = directory.path("a");
+    for (const auto& [mask, ending] : {std::pair<mode_t, unsigned int>{0, 0666}, {027, 0640}}) {
+        const mode_t umaskBefore = ::umask(mask);
+        ReplacingFile file(path, ReplacingFile::Temporary::kHidden);
+        EXPECT_TRUE(file.open());
+        ASSERT_EQ(directory.names().size(), 1U);
+        EXPECT_EQ(modeOf(directory.path(directory.names()[0])), 0600U);
+        EXPECT_TRUE(file.commit());
+        EXPECT_EQ(::umask(umaskBefore), mask);
+        EXPECT_EQ(modeOf(path), ending);
+        ASSERT_EQ(::unlink(path.c_str()), 0);
+    }
 }
 
 TEST(ReplacingFile, TheModeIsKeptOnBothRoads) {

@@ -8,6 +8,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <cstdio>
 #include <string>
 
 #include "support/TempDirectory.h"
@@ -56,6 +57,22 @@ TEST(TemporaryNames, TheNextFileRemovesWhatAKilledRunLeft) {
         EXPECT_THAT(directory.names(), ElementsAre("a"));
         EXPECT_EQ(directory.read("a"), "new");
     }
+}
+
+// Another user may make as many as he likes; looking at all of them for each output file once held
+// a run up for minutes.
+TEST(TemporaryNames, NotMoreAreLookedAtThanARunCanBear) {
+    const TempDirectory directory;
+    for (int number = 0; number < 4200; ++number) {
+        char name[32];
+        std::snprintf(name, sizeof name, ".velm-%016d.tmp", number);
+        directory.write(name, "");
+    }
+    replace(directory.path("a"), ReplacingFile::Temporary::kHidden);
+    EXPECT_GE(directory.names().size(), 4200U - 4096 + 1);
+    EXPECT_LT(directory.names().size(), 4200U);
+    replace(directory.path("a"), ReplacingFile::Temporary::kHidden);
+    EXPECT_THAT(directory.names(), ElementsAre("a"));
 }
 
 TEST(TemporaryNames, AFileThatIsBeingWrittenStays) {
