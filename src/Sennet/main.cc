@@ -5,6 +5,7 @@ int main(int argc, char** argv) {
     if (!holdStandardStreams()) {
         return 1;
     }
+    keepOthersFromWriting();
     outliveFileSizeLimit();
     endWhenMemoryIsShort("sennet");
     return runSennet(argc, argv);

@@ -1,6 +1,7 @@
 #include "process/ProcessGuards.h"
 
 #include <fcntl.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <csignal>
@@ -37,6 +38,11 @@ bool holdStandardStreams() {
 
 void outliveFileSizeLimit() {
     std::signal(SIGXFSZ, SIG_IGN);
+}
+
+void keepOthersFromWriting() {
+    const mode_t mask = ::umask(S_IWOTH);
+    ::umask(mask | S_IWOTH);
 }
 
 void endWhenMemoryIsShort(const char* program) {

@@ -11,6 +11,10 @@ bool holdStandardStreams();
 /// Makes a write beyond the limit of the file size fail like any other (EFBIG).
 void outliveFileSizeLimit();
 
+/// Narrows the umask so that new files and directories can be written to by the user and his group
+/// at most.
+void keepOthersFromWriting();
+
 /// From now on the first request for memory that fails ends the process with status 1 and a line on
 /// standard error that begins with `program`, a string literal. No destructor runs, so that none
 /// completes a file that holds half of its content.

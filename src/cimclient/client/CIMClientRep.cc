@@ -7,7 +7,6 @@
 
 #include "client/AnswerStatus.h"
 #include "client/LocalAuthentication.h"
-#include "client/MemoryBoundedSource.h"
 #include "client/UnixSocket.h"
 #include "client/WireText.h"
 #include "xml/CimXmlReader.h"
@@ -80,7 +79,8 @@ class CIMClientRep::ConnectionGuard {
     bool kept = false;
 };
 
-CIMClientRep::CIMClientRep(ClientSettings settings) : settings(std::move(settings)) {}
+CIMClientRep::CIMClientRep(ClientSettings clientSettings)
+    : settings(std::move(clientSettings)), memory(settings.memoryLimit) {}
 
 void CIMClientRep::connectLocal() {
     if (connected) {
@@ -165,7 +165,7 @@ auto CIMClientRep::perform(const char* method, const CIMNamespaceName& nameSpace
     const std::unique_ptr<HttpExchange> current = exchange(request, deadline, answerLimit);
     checkHead(current->answer());
     try {
-        MemoryBoundedSource answer(*current, settings.memoryLimit);
+        MemoryBoundedSource answer(*current, memory);
         auto result = decode(answer);
         current->skipBody();
         checkReportedStatus(current->answer());

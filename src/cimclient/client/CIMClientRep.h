@@ -12,12 +12,13 @@
 #include "client/Deadline.h"
 #include "client/HttpExchange.h"
 #include "client/LocalConnector.h"
+#include "client/MemoryBudget.h"
 
 namespace Pegasus {
 
 class CIMClientRep {
   public:
-    explicit CIMClientRep(ClientSettings settings);
+    explicit CIMClientRep(ClientSettings clientSettings);
 
     void setTimeout(Uint32 milliseconds) { timeoutMilliseconds = milliseconds; }
     void connectLocal();
@@ -50,6 +51,7 @@ class CIMClientRep {
     bool answerChallenge(const HttpExchange& refused, HttpRequest& request) const;
 
     ClientSettings settings;
+    MemoryBudget memory;
     Uint32 timeoutMilliseconds = 20000;
     Uint32 lastMessageId = 1000;
     bool connected = false;  // by the user's word; the connection may be gone meanwhile

@@ -1,6 +1,6 @@
 #include "client/ClientSettings.h"
 
-#include "client/MemoryBoundedSource.h"
+#include "client/MemoryBudget.h"
 
 namespace Pegasus {
 
@@ -10,7 +10,7 @@ ClientSettings ClientSettings::standard() {
     settings.authenticationDirectories = {"/var/tmp", "/var/opt/tog-pegasus/cache/localauth",
                                           "/var/lib/Pegasus/cache/localauth",
                                           "/run/cimomd/localauth"};
-    settings.memoryLimit = memoryForOneAnswer();
+    settings.memoryLimit = memoryForAnswers();
     return settings;
 }
 

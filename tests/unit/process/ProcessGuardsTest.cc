@@ -4,11 +4,13 @@
 #include <fcntl.h>
 #include <gtest/gtest.h>
 #include <sys/resource.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <cerrno>
 #include <cstddef>
 #include <string>
+#include <utility>
 
 #include "support/TempDirectory.h"
 
@@ -75,6 +77,18 @@ TEST(ProcessGuards, AFileBeyondTheLimitOfItsSizeIsAnErrorOfTheWrite) {
             ::_exit(first && second ? 0 : 1);
         },
         ExitedWithCode(0), "");
+}
+
+TEST(ProcessGuards, OthersCannotWriteToNewFiles) {
+    for (const auto& [before, after] : {std::pair{0, 02}, {022, 022}, {077, 077}, {07, 07}}) {
+        EXPECT_EXIT(
+            {
+                ::umask(static_cast<mode_t>(before));
+                keepOthersFromWriting();
+                ::_exit(static_cast<int>(::umask(0)));
+            },
+            ExitedWithCode(after), "");
+    }
 }
 
 TEST(ProcessGuards, LackOfMemoryEndsTheProcessWithAWord) {

@@ -1,4 +1,4 @@
-#include "client/MemoryBoundedSource.h"
+#include "client/MemoryBudget.h"
 
 #include <Pegasus/Client/ClientExceptions.h>
 #include <gtest/gtest.h>
@@ -46,31 +46,57 @@ std::size_t readAll(ByteSource& source, bool kept) {
 
 TEST(MemoryBoundedSource, GivesAllOfALongAnswerThatNeedsLittle) {
     Letters letters(200 * kMib + 7);
-    MemoryBoundedSource source(letters, 32 * kMib);
+    MemoryBudget budget(32 * kMib);
+    MemoryBoundedSource source(letters, budget);
     EXPECT_EQ(readAll(source, false), 200 * kMib + 7);
 }
 
 TEST(MemoryBoundedSource, RefusesAnAnswerThatNeedsMoreThanTheLimit) {
     Letters letters(1024 * kMib);
-    MemoryBoundedSource source(letters, 64 * kMib);
+    MemoryBudget budget(64 * kMib);
+    MemoryBoundedSource source(letters, budget);
     EXPECT_THROW(readAll(source, true), CIMClientMalformedHTTPException);
 }
 
 TEST(MemoryBoundedSource, LetsAnAnswerHaveAsMuchAsTheLimit) {
     Letters letters(96 * kMib);
-    MemoryBoundedSource source(letters, 256 * kMib);
+    MemoryBudget budget(256 * kMib);
+    MemoryBoundedSource source(letters, budget);
     EXPECT_EQ(readAll(source, true), 96 * kMib);
 }
 
-TEST(MemoryForOneAnswer, IsAQuarterOfWhatTheProcessMayHave) {
+// A script may have ten classes, and all their instances are held until it is written.
+TEST(MemoryBoundedSource, CountsWhatIsKeptOfEarlierAnswers) {
+    MemoryBudget budget(64 * kMib);
+    std::vector<std::string> kept;
+    const auto readAnother = [&] {
+        Letters letters(24 * kMib);
+        MemoryBoundedSource source(letters, budget);
+        kept.emplace_back(24 * kMib, '\0');
+        while (source.read(kept.back().data(), kept.back().size()) != 0) {
+        }
+    };
+    readAnother();
+    readAnother();
+    readAnother();
+    EXPECT_THROW(
+        {
+            readAnother();
+            readAnother();
+            readAnother();
+        },
+        CIMClientMalformedHTTPException);
+}
+
+TEST(MemoryForAnswers, IsAQuarterOfWhatTheProcessMayHave) {
     rlimit before{};
     ASSERT_EQ(::getrlimit(RLIMIT_AS, &before), 0);
-    const Uint64 usual = memoryForOneAnswer();
+    const Uint64 usual = memoryForAnswers();
     EXPECT_GT(usual, 16 * kMib);
     rlimit less = before;
     less.rlim_cur = usual;
     ASSERT_EQ(::setrlimit(RLIMIT_AS, &less), 0);
-    const Uint64 limited = memoryForOneAnswer();
+    const Uint64 limited = memoryForAnswers();
     ASSERT_EQ(::setrlimit(RLIMIT_AS, &before), 0);
     EXPECT_EQ(limited, usual / 4);
 }

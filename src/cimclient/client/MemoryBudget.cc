@@ -1,0 +1,92 @@
+#include "client/MemoryBudget.h"
+
+#include <Pegasus/Client/ClientExceptions.h>
+#include <malloc.h>
+#include <sys/resource.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <fstream>
+#include <string>
+
+namespace Pegasus {
+
+namespace {
+
+Uint64 pageSize() {
+    return static_cast<Uint64>(::sysconf(_SC_PAGESIZE));
+}
+
+// 0 where the kernel does not tell.
+Uint64 residentOctets() {
+    std::ifstream file("/proc/self/statm");
+    Uint64 virtualPages = 0;
+    Uint64 residentPages = 0;
+    file >> virtualPages >> residentPages;
+    return residentPages * pageSize();
+}
+
+// The path of this process below the root of the control groups (version 2), as "/a/b".
+std::string controlGroup() {
+    std::ifstream file("/proc/self/cgroup");
+    std::string line;
+    while (std::getline(file, line)) {
+        if (line.starts_with("0::/")) {
+            return line.substr(3);
+        }
+    }
+    return {};
+}
+
+// The least of the limits of the group and those around it.
+Uint64 controlGroupLimit() {
+    Uint64 least = ~Uint64(0);
+    for (std::string group = controlGroup(); !group.empty(); group.erase(group.find_last_of('/'))) {
+        std::ifstream file("/sys/fs/cgroup" + group + "/memory.max");
+        Uint64 limit = 0;
+        if (file >> limit) {
+            least = std::min(least, limit);
+        }
+    }
+    return least;
+}
+
+}  // namespace
+
+void MemoryBudget::take(std::size_t octets) {
+    sinceLook += octets;
+    if (sinceLook >= kStep) {
+        sinceLook = 0;
+        look();
+    }
+}
+
+void MemoryBudget::look() {
+    if (firstUse == 0) {
+        firstUse = residentOctets();
+    }
+    if (!isExceeded()) {
+        return;
+    }
+    // What was freed meanwhile may still be counted.
+    ::malloc_trim(0);
+    if (isExceeded()) {
+        throw CIMClientMalformedHTTPException("HTTP answer needs more memory than the limit");
+    }
+}
+
+bool MemoryBudget::isExceeded() const {
+    const Uint64 use = residentOctets();
+    return use > firstUse && use - firstUse > limit;
+}
+
+Uint64 memoryForAnswers() {
+    Uint64 most = static_cast<Uint64>(::sysconf(_SC_PHYS_PAGES)) * pageSize();
+    rlimit allowed{};
+    if (::getrlimit(RLIMIT_AS, &allowed) == 0) {
+        most = std::min<Uint64>(most, allowed.rlim_cur);
+    }
+    return std::min(most, controlGroupLimit()) / 4;
+}
+
+}  // namespace Pegasus
