@@ -55,6 +55,33 @@ Json jsonOf(const Finding& finding) {
     return one;
 }
 
+/// For people; what is as it should be needs no word.
+const char* remarkOn(ServerPart server) {
+    switch (server) {
+        case ServerPart::NotAsked:
+            return " (no server was asked)";
+        case ServerPart::BrokeDown:
+            return " (the server was not asked about all)";
+        case ServerPart::NotConcerned:
+        case ServerPart::Asked:
+            break;
+    }
+    return "";
+}
+
+const char* nameOf(ServerPart server) {
+    switch (server) {
+        case ServerPart::NotAsked:
+            return "not asked";
+        case ServerPart::BrokeDown:
+            return "broke down";
+        case ServerPart::NotConcerned:
+        case ServerPart::Asked:
+            break;
+    }
+    return "asked";
+}
+
 }  // namespace
 
 const char* nameOf(Severity severity) {
@@ -70,7 +97,7 @@ const char* nameOf(Severity severity) {
 }
 
 int printFindings(const std::vector<Finding>& findings, const std::vector<std::string>& files,
-                  const Output& output) {
+                  const Output& output, ServerPart server) {
     const std::size_t errors = countOf(findings, Severity::Error);
     const std::size_t warnings = countOf(findings, Severity::Warning);
     if (output.json) {
@@ -82,13 +109,16 @@ int printFindings(const std::vector<Finding>& findings, const std::vector<std::s
         }
         document["errors"] = errors;
         document["warnings"] = warnings;
+        if (server != ServerPart::NotConcerned) {
+            document["server"] = nameOf(server);
+        }
         printJson(document, output);
     } else {
         for (const Finding& finding : findings) {
             printFinding(finding, output);
         }
         output.out << counted(files.size(), "file") << ": " << counted(errors, "error") << ", "
-                   << counted(warnings, "warning") << '\n';
+                   << counted(warnings, "warning") << remarkOn(server) << '\n';
     }
     return errors + warnings > 0 ? kFindings : kFine;
 }

@@ -24,9 +24,13 @@ struct Finding {
     std::string message;
 };
 
+/// What a CIM server had to do with the findings: NotConcerned where there is nothing to ask it.
+enum class ServerPart { NotConcerned, Asked, NotAsked, BrokeDown };
+
 /// Prints each finding as "file:line:column: severity: message" and then how many there are, or all
-/// as JSON. `files` are those that were looked at. Returns the exit status.
+/// as JSON, and whether a server was asked. `files` are those that were looked at. Returns the exit
+/// status.
 int printFindings(const std::vector<Finding>& findings, const std::vector<std::string>& files,
-                  const Output& output);
+                  const Output& output, ServerPart server = ServerPart::NotConcerned);
 
 }  // namespace sennetctl

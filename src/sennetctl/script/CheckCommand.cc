@@ -45,58 +45,105 @@ struct Answers {
     MissingValues missing{server};
 };
 
-std::unique_ptr<Answers> connectUnlessOffline(const CheckOptions& options, const Output& output) {
-    if (options.offline) {
-        return nullptr;
+class ScriptChecker {
+  public:
+    /// Reaches the server unless the options forbid it.
+    explicit ScriptChecker(const CheckOptions& theOptions)
+        : options(theOptions), texts(Velm::PlatformUtilities::getSennetResourceFile()) {
+        texts.load();
+        if (options.offline) {
+            return;
+        }
+        try {
+            answers = std::make_unique<Answers>();
+            part = ServerPart::Asked;
+        } catch (const CannotRun& failure) {
+            loseServer(failure, "only the scripts themselves are checked");
+        }
     }
-    try {
-        return std::make_unique<Answers>();
-    } catch (const CannotRun& failure) {
-        output.err << "sennetctl: " << printable(failure.what())
-                   << "\nsennetctl: only the scripts themselves are checked\n";
-        return nullptr;
-    }
-}
 
-std::vector<Finding> checkScriptFile(const std::string& file, const CheckOptions& options,
-                                     const Velm::Properties& texts, Answers* answers) {
+    void check(const std::string& file) {
+        std::string octets;
+        try {
+            octets = readWholeFile(file, kLargestScriptOctets);
+        } catch (const CannotRun& failure) {
+            troubles.emplace_back(failure.what());
+            return;
+        }
+        files.push_back(file);
+        std::vector<Finding> found = findingsIn(file, octets);
+        std::stable_sort(found.begin(), found.end(), [](const Finding& one, const Finding& two) {
+            return std::tie(one.line, one.column) < std::tie(two.line, two.column);
+        });
+        findings.insert(findings.end(), found.begin(), found.end());
+    }
+
+    /// Returns the exit status, which is kCannotRun where some script was not read.
+    int tell(std::size_t wanted, const Output& output) const {
+        for (const std::string& trouble : troubles) {
+            output.err << "sennetctl: " << printable(trouble) << '\n';
+        }
+        const int status =
+            files.empty() ? kCannotRun : printFindings(findings, files, output, part);
+        return files.size() < wanted ? kCannotRun : status;
+    }
+
+  private:
+    std::vector<Finding> findingsIn(const std::string& file, std::string_view octets) {
+        std::vector<Finding> found;
+        ScriptModel model = ScriptReader(file, found).read(octets);
+        checkScript(model, found);
+        if (answers && !model.givenUp) {
+            askServer(model, found);
+        }
+        if (options.translations) {
+            checkTranslations(model, texts.getProperties(), found);
+        }
+        return found;
+    }
+
+    void askServer(ScriptModel& model, std::vector<Finding>& found) {
+        try {
+            ServerCheck(answers->server, answers->missing, texts.getProperties(),
+                        options.translations, found)
+                .check(model);
+        } catch (const CannotRun& failure) {
+            loseServer(failure,
+                       "from " + model.file + " on only the scripts themselves are checked");
+            part = ServerPart::BrokeDown;
+            answers.reset();
+        }
+    }
+
+    void loseServer(const CannotRun& failure, const std::string& consequence) {
+        troubles.emplace_back(failure.what());
+        troubles.push_back(consequence);
+    }
+
+    const CheckOptions& options;
+    Velm::PropertiesFile texts;
+    std::unique_ptr<Answers> answers;  // none when there is no server
+    ServerPart part = ServerPart::NotAsked;
+    std::vector<std::string> files;  // that were read
     std::vector<Finding> findings;
-    ScriptModel model =
-        ScriptReader(file, findings).read(readWholeFile(file, kLargestScriptOctets));
-    checkScript(model, findings);
-    if (options.translations) {
-        checkTranslations(model, texts, findings);
-    }
-    if (answers != nullptr && !model.givenUp) {
-        ServerCheck(answers->server, answers->missing, texts, options.translations, findings)
-            .check(model);
-    }
-    std::stable_sort(findings.begin(), findings.end(), [](const Finding& one, const Finding& two) {
-        return std::tie(one.line, one.column) < std::tie(two.line, two.column);
-    });
-    return findings;
-}
+    std::vector<std::string> troubles;
+};
 
 }  // namespace
 
 int checkScripts(const CheckOptions& options, const Output& output) {
     const std::vector<std::string> files =
         options.scripts.empty() ? installedScripts() : options.scripts;
-    Velm::PropertiesFile texts(Velm::PlatformUtilities::getSennetResourceFile());
-    texts.load();
-    const std::unique_ptr<Answers> answers = connectUnlessOffline(options, output);
-    std::vector<Finding> findings;
+    ScriptChecker checker(options);
     {
         const Progress progress(output);
         for (std::size_t i = 0; i < files.size(); ++i) {
             progress.show("script " + std::to_string(i + 1) + " of " +
                           std::to_string(files.size()) + ": " + files[i]);
-            const std::vector<Finding> found =
-                checkScriptFile(files[i], options, texts.getProperties(), answers.get());
-            findings.insert(findings.end(), found.begin(), found.end());
+            checker.check(files[i]);
         }
     }
-    return printFindings(findings, files, output);
+    return checker.tell(files.size(), output);
 }
 
 }  // namespace sennetctl

@@ -157,8 +157,11 @@ void checkTranslations(const ScriptModel& model, const Velm::Properties& texts,
         require(model.title, "title." + withUnderscores(model.title.value));
     }
     for (const ScriptSlot& slot : model.slots) {
+        // The generator takes the class as the server writes it.
+        const std::string& section =
+            slot.serverSpelling.empty() ? slot.className.value : slot.serverSpelling;
         for (const ScriptText& property : slot.properties) {
-            require(property, slot.className.value + "." + property.value);
+            require(property, section + "." + property.value);
         }
     }
 }

@@ -21,6 +21,8 @@ struct ScriptSlot {
     ScriptText propertyList;
     std::vector<ScriptText> properties;  // of the list, those that are legal names
 
+    std::string serverSpelling;  // of the class; empty where no server told it
+
     bool isUsed() const { return !className.value.empty(); }
 };
 

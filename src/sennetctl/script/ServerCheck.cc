@@ -17,9 +17,9 @@ std::string nameOf(const AnsweredClass& answered) {
 
 }  // namespace
 
-void ServerCheck::check(const ScriptModel& model) {
+void ServerCheck::check(ScriptModel& model) {
     std::vector<AnsweredClass> classes;
-    for (const ScriptSlot& slot : model.slots) {
+    for (ScriptSlot& slot : model.slots) {
         if (!slot.isUsed()) {
             continue;
         }
@@ -34,12 +34,13 @@ void ServerCheck::check(const ScriptModel& model) {
     checkNames(model, classes, texts, findings);
 }
 
-std::optional<AnsweredClass> ServerCheck::ask(const ScriptModel& model, const ScriptSlot& slot) {
+std::optional<AnsweredClass> ServerCheck::ask(const ScriptModel& model, ScriptSlot& slot) {
     const std::string& nameSpace = model.namespaceOf(slot);
     AnsweredClass answered;
     answered.slot = &slot;
     try {
         answered.definition = server.getClass(nameSpace, slot.className.value);
+        slot.serverSpelling = nameOf(answered);
     } catch (const CIMException& failure) {
         const bool byDefault =
             failure.getCode() == CIM_ERR_INVALID_NAMESPACE && slot.nameSpace.value.empty();

@@ -27,12 +27,12 @@ class ServerCheck {
           wantSizes(wantSizes),
           findings(findings) {}
 
-    /// Appends the findings for a script that the generator does not give up. Throws CannotRun when
-    /// the server breaks down.
-    void check(const ScriptModel& model);
+    /// Appends the findings for a script that the generator does not give up, and enters how the
+    /// server spells the classes. Throws CannotRun when the server breaks down.
+    void check(ScriptModel& model);
 
   private:
-    std::optional<AnsweredClass> ask(const ScriptModel& model, const ScriptSlot& slot);
+    std::optional<AnsweredClass> ask(const ScriptModel& model, ScriptSlot& slot);
     void checkPairing(const ScriptModel& model, const std::vector<AnsweredClass>& classes);
     void checkColumns(const ScriptModel& model, const AnsweredClass& answered);
     void add(const ScriptModel& model, const ScriptText& place, Severity severity,

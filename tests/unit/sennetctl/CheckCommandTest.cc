@@ -35,7 +35,7 @@ TEST_F(CheckCommandTest, FindingsStandInTheOrderOfTheLines) {
 TEST_F(CheckCommandTest, OfflineAsksNoServer) {
     const std::string file = directory.write("x.script.inv", kGood);
     EXPECT_EQ(checkScripts({{file}, true, false}, output.plain()), 0);
-    EXPECT_EQ(output.text(), "1 file: 0 errors, 0 warnings\n");
+    EXPECT_EQ(output.text(), "1 file: 0 errors, 0 warnings (no server was asked)\n");
     EXPECT_EQ(fans.server.connectionCount(), 0U);
 }
 
@@ -44,6 +44,37 @@ TEST_F(CheckCommandTest, WithoutAServerTheScriptsAreChecked) {
     const std::string file = directory.write("x.script.inv", kGood);
     EXPECT_EQ(checkScripts({{file}, false, false}, output.plain()), 0);
     EXPECT_THAT(output.errors(), HasSubstr("only the scripts themselves are checked\n"));
+    EXPECT_EQ(output.text(), "1 file: 0 errors, 0 warnings (no server was asked)\n");
+}
+
+// Whoever reads only the status or the JSON has to learn that "no errors" is half the truth.
+TEST_F(CheckCommandTest, JsonSaysWhetherAServerWasAsked) {
+    const std::string file = directory.write("x.script.inv", kGood);
+    EXPECT_EQ(checkScripts({{file}, false, false}, output.json()), 0);
+    EXPECT_EQ(output.document()["server"], "asked");
+    fans.server.stop();
+    CapturedOutput later;
+    EXPECT_EQ(checkScripts({{file}, false, false}, later.json()), 0);
+    EXPECT_EQ(later.document()["server"], "not asked");
+}
+
+TEST_F(CheckCommandTest, AServerThatBreaksDownLeavesTheFindingsOfTheScripts) {
+    fans.server.onGetClass("CIM_Fan", support::Reply::closeAtOnce());
+    const std::string one = directory.write("one.script.inv", std::string(kGood) + "nonsense\n");
+    const std::string two = directory.write("two.script.inv", std::string(kGood) + "nonsense\n");
+    EXPECT_EQ(checkScripts({{one, two}, false, false}, output.plain()), 1);
+    EXPECT_THAT(output.text(), HasSubstr(one + ":6:1: warning"));
+    EXPECT_THAT(output.text(), HasSubstr(two + ":6:1: warning"));
+    EXPECT_THAT(output.text(), HasSubstr("2 warnings (the server was not asked about all)\n"));
+    EXPECT_THAT(output.errors(), HasSubstr("from " + one + " on only the scripts"));
+}
+
+// The generator looks names up under the class as the server writes it.
+TEST_F(CheckCommandTest, TranslationsAreThoseOfTheServersSpelling) {
+    const std::string file = directory.write(
+        "x.script.inv", "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=cim_fan\nA[0]=DeviceID,State\n");
+    EXPECT_EQ(checkScripts({{file}, false, true}, output.plain()), 1);
+    EXPECT_THAT(output.text(), HasSubstr("the resource properties have no CIM_Fan.State\n"));
 }
 
 TEST_F(CheckCommandTest, AServerIsNotAskedForAScriptThatIsGivenUp) {
@@ -70,8 +101,17 @@ TEST_F(CheckCommandTest, TheServerIsAskedOnceWhyValuesAreMissing) {
     EXPECT_EQ(asked, 2) << "the class, and its instances";
 }
 
-TEST_F(CheckCommandTest, AScriptThatCannotBeReadEndsTheCommand) {
-    EXPECT_THROW(checkScripts({{directory.path("none")}, true, false}, output.plain()), CannotRun);
+TEST_F(CheckCommandTest, AScriptThatCannotBeReadLeavesTheFindingsOfTheOthers) {
+    const std::string none = directory.path("none");
+    const std::string file = directory.write("x.script.inv", std::string(kGood) + "nonsense\n");
+    EXPECT_EQ(checkScripts({{none, file}, true, false}, output.plain()), 2);
+    EXPECT_EQ(output.errors(), "sennetctl: " + none + ": there is no such file\n");
+    EXPECT_THAT(output.text(), HasSubstr("1 file: 0 errors, 1 warning (no server was asked)\n"));
+}
+
+TEST_F(CheckCommandTest, NothingIsToldOfScriptsOfWhichNoneCanBeRead) {
+    EXPECT_EQ(checkScripts({{directory.path("none")}, true, false}, output.plain()), 2);
+    EXPECT_EQ(output.text(), "");
 }
 
 TEST_F(CheckCommandTest, ProgressIsTakenAwayAtTheEnd) {
