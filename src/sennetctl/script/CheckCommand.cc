@@ -5,6 +5,7 @@
 #include <Velm/PropertiesFile.h>
 
 #include <algorithm>
+#include <map>
 #include <memory>
 #include <ostream>
 #include <tuple>
@@ -15,6 +16,7 @@
 #include "report/Text.h"
 #include "report/WholeFile.h"
 #include "script/MissingValues.h"
+#include "script/NameCheck.h"
 #include "script/ScriptLint.h"
 #include "script/ScriptReader.h"
 #include "script/ServerCheck.h"
@@ -93,6 +95,7 @@ class ScriptChecker {
         std::vector<Finding> found;
         ScriptModel model = ScriptReader(file, found).read(octets);
         checkScript(model, found);
+        compareTitle(model, found);
         if (answers && !model.givenUp) {
             askServer(model, found);
         }
@@ -100,6 +103,18 @@ class ScriptChecker {
             checkTranslations(model, texts.getProperties(), found);
         }
         return found;
+    }
+
+    /// A reader takes two tables of one class for one.
+    void compareTitle(const ScriptModel& model, std::vector<Finding>& found) {
+        const std::string title = shownTitle(model, texts.getProperties());
+        checkTitleText(model, title, found);
+        const auto [first, isNew] = fileOfTitle.try_emplace(title, model.file);
+        if (!isNew && first->second != model.file && !model.givenUp) {
+            found.push_back({model.file, model.title.line, model.title.column, Severity::Warning,
+                             first->second + " has the title " + title +
+                                 ", too: both tables get the same MIF class"});
+        }
     }
 
     void askServer(ScriptModel& model, std::vector<Finding>& found) {
@@ -124,6 +139,7 @@ class ScriptChecker {
     Velm::PropertiesFile texts;
     std::unique_ptr<Answers> answers;  // none when there is no server
     ServerPart part = ServerPart::NotAsked;
+    std::map<std::string, std::string> fileOfTitle;
     std::vector<std::string> files;  // that were read
     std::vector<Finding> findings;
     std::vector<std::string> troubles;

@@ -24,6 +24,16 @@ String pegasusText(const std::string& text) {
     return String(text.c_str());
 }
 
+/// Whether a literal of a MIF file ends before the text does.
+bool breaksLiteral(const std::string& text) {
+    return std::any_of(text.begin(), text.end(), [](char c) {
+        return c == '"' || static_cast<unsigned char>(c) < 0x20 || c == 0x7F;
+    });
+}
+
+constexpr const char* kBreaksLiteral =
+    " has a double quote or a control character: the MIF file cannot be read";
+
 std::vector<NamedColumn> columnsOf(const std::vector<AnsweredClass>& classes,
                                    const Velm::Properties& texts) {
     std::vector<NamedColumn> columns;
@@ -48,6 +58,15 @@ class NameChecker {
     void checkPlain(const std::vector<NamedColumn>& columns) {
         Array<String> used;
         for (const NamedColumn& column : columns) {
+            if (breaksLiteral(textOf(column.name))) {
+                add(column.place, "the name " + textOf(column.name) + kBreaksLiteral,
+                    Severity::Error);
+            }
+            if (String::equalNoCase(column.name, "Index")) {
+                add(column.place, "the name " + textOf(column.name) +
+                                      " is that of the numbers of rows, too: readers refuse two "
+                                      "attributes of one name");
+            }
             tellRepeated(column, "all products", column.name, used);
         }
     }
@@ -60,6 +79,7 @@ class NameChecker {
             if (!collidesPlainly(columns, column)) {
                 tellRepeated(column, "QVE", name, used);
             }
+            tellOtherCase(columns, column);
         }
     }
 
@@ -107,6 +127,18 @@ class NameChecker {
         });
     }
 
+    void tellOtherCase(const std::vector<NamedColumn>& columns, const NamedColumn& column) {
+        for (const NamedColumn& other : columns) {
+            if (other.number < column.number && String::equalNoCase(other.name, column.name) &&
+                !String::equal(other.name, column.name)) {
+                add(column.place, "the names " + textOf(other.name) + " and " +
+                                      textOf(column.name) +
+                                      " differ in case only: for QVE the table has one twice");
+                return;
+            }
+        }
+    }
+
     void tellRepeated(const NamedColumn& column, const std::string& product, const String& name,
                       Array<String>& used) {
         const String unique = SennetUtilities::makeUnique(name, number(column), used);
@@ -126,8 +158,9 @@ class NameChecker {
         return name;
     }
 
-    void add(const ScriptText& place, const std::string& message) {
-        findings.push_back({model.file, place.line, place.column, Severity::Warning, message});
+    void add(const ScriptText& place, const std::string& message,
+             Severity severity = Severity::Warning) {
+        findings.push_back({model.file, place.line, place.column, severity, message});
     }
 
     const ScriptModel& model;
@@ -143,10 +176,22 @@ void checkNames(const ScriptModel& model, const std::vector<AnsweredClass>& clas
     checker.checkPlain(columns);
     checker.checkQve(columns);
     checker.checkLumo(columns);
+    checker.checkTitle(model.title, pegasusText(shownTitle(model, texts)));
+}
+
+std::string shownTitle(const ScriptModel& model, const Velm::Properties& texts) {
     CimScriptParser parser(pegasusText(model.file));
     const String title =
         model.title.value.empty() ? parser.getTitle() : pegasusText(model.title.value);
-    checker.checkTitle(model.title, SennetUtilities::trim(translatedTitle(texts, title)));
+    return textOf(SennetUtilities::trim(translatedTitle(texts, title)));
+}
+
+void checkTitleText(const ScriptModel& model, const std::string& title,
+                    std::vector<Finding>& findings) {
+    if (breaksLiteral(title)) {
+        findings.push_back({model.file, model.title.line, model.title.column, Severity::Error,
+                            "the title " + title + kBreaksLiteral});
+    }
 }
 
 }  // namespace sennetctl

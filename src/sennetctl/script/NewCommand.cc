@@ -1,6 +1,7 @@
 #include "script/NewCommand.h"
 
 #include <Velm/TextFile.h>
+#include <algorithm>
 
 #include <filesystem>
 #include <ostream>
@@ -27,6 +28,16 @@ std::string pathWithoutSuffix(const std::string& script) {
         throw CannotRun(script + ": the name of a script ends in .script.inv");
     }
     return script.substr(0, script.size() - kSuffix.size());
+}
+
+/// A script has no way to write these.
+void refuseTitle(const std::string& title) {
+    const bool any = std::any_of(title.begin(), title.end(), [](char c) {
+        return c == '"' || c == '=' || static_cast<unsigned char>(c) < 0x20 || c == 0x7F;
+    });
+    if (any) {
+        throw CannotRun("a title has no double quote, no '=' and no control character");
+    }
 }
 
 std::vector<AnsweredClass> askFor(const NewOptions& options, const Output& output) {
@@ -73,6 +84,7 @@ int writeNewScript(const NewOptions& options, const Output& output) {
     if (options.classes.size() > ScriptModel::kSlots) {
         throw CannotRun("a script has room for 10 classes");
     }
+    refuseTitle(options.title);
     refuseExisting(options.script);
     refuseExisting(properties);
     const std::string stem = std::filesystem::path(path).filename().string();

@@ -132,6 +132,17 @@ class FaultsTest(unittest.TestCase):
                 self.assertNotIn("one0", run.result.stdout)
                 self.assertEqual(list(run.mif.glob("*.mif")), [])
 
+    def test_a_title_with_a_quote_spoils_the_file(self):
+        text = GOOD.replace("Disks", '17" Disks')
+        _, found = self.check(text)
+        self.assertTrue(any("the MIF file cannot be read" in each["message"]
+                            for each in found), found)
+        for product in ("SMS", "CA"):
+            run = self.run_with(product, text)
+            file, = run.files()
+            with self.assertRaises(ValueError):
+                run.tables(file)
+
     def test_what_is_broken_off_spoils_the_file(self):
         for name, (good, bad) in BROKEN_OFF.items():
             text = GOOD.replace(good, bad, 1)

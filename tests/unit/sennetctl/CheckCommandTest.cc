@@ -65,7 +65,7 @@ TEST_F(CheckCommandTest, AServerThatBreaksDownLeavesTheFindingsOfTheScripts) {
     EXPECT_EQ(checkScripts({{one, two}, false, false}, output.plain()), 1);
     EXPECT_THAT(output.text(), HasSubstr(one + ":6:1: warning"));
     EXPECT_THAT(output.text(), HasSubstr(two + ":6:1: warning"));
-    EXPECT_THAT(output.text(), HasSubstr("2 warnings (the server was not asked about all)\n"));
+    EXPECT_THAT(output.text(), HasSubstr("3 warnings (the server was not asked about all)\n"));
     EXPECT_THAT(output.errors(), HasSubstr("from " + one + " on only the scripts"));
 }
 
@@ -87,7 +87,7 @@ TEST_F(CheckCommandTest, AServerIsNotAskedForAScriptThatIsGivenUp) {
 
 // To tell why values are missing, the server looks at the whole machine.
 TEST_F(CheckCommandTest, TheServerIsAskedOnceWhyValuesAreMissing) {
-    const std::string text = "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=CIM_Fan\nA[0]=Spare\n";
+    const std::string text = "[CIM]\nG[0]=CIM_Fan\nA[0]=Spare\n";
     const std::string one = directory.write("one.script.inv", text);
     const std::string two = directory.write("two.script.inv", text);
     fans.server.onGetClass("Velmira_MissingValue",
@@ -99,6 +99,23 @@ TEST_F(CheckCommandTest, TheServerIsAskedOnceWhyValuesAreMissing) {
         asked += request.className == "Velmira_MissingValue" ? 1 : 0;
     }
     EXPECT_EQ(asked, 2) << "the class, and its instances";
+}
+
+TEST_F(CheckCommandTest, TwoScriptsOfOneTitle) {
+    const std::string one = directory.write("one.script.inv", kGood);
+    const std::string two = directory.write("two.script.inv", kGood);
+    EXPECT_EQ(checkScripts({{one, two}, true, false}, output.plain()), 1);
+    EXPECT_EQ(output.text(), two + ":2:7: warning: " + one +
+                                 " has the title Fans, too: both tables get the same MIF class\n"
+                                 "2 files: 0 errors, 1 warning (no server was asked)\n");
+}
+
+TEST_F(CheckCommandTest, ATitleThatBreaksTheFile) {
+    const std::string file = directory.write(
+        "x.script.inv", "[DEFAULT]\ntitle=17\" Fans\n[CIM]\nG[0]=CIM_Fan\nA[0]=DeviceID\n");
+    EXPECT_EQ(checkScripts({{file}, true, false}, output.plain()), 1);
+    EXPECT_THAT(output.text(), HasSubstr(file + ":2:7: error: the title 17\"_Fans has a double "
+                                                "quote or a control character"));
 }
 
 TEST_F(CheckCommandTest, AScriptThatCannotBeReadLeavesTheFindingsOfTheOthers) {

@@ -90,6 +90,15 @@ TEST_F(NewCommandTest, LeavesOutWhatNoFileShows) {
     EXPECT_EQ(output.document()["leftOut"].size(), 2U);
 }
 
+TEST_F(NewCommandTest, TitlesThatNoScriptCanHave) {
+    for (const char* title : {"Rack 17\" A", "A = B", "A\tB"}) {
+        options.title = title;
+        EXPECT_EQ(failureOf(options),
+                  "a title has no double quote, no '=' and no control character");
+    }
+    EXPECT_THAT(directory.names(), ElementsAre());
+}
+
 TEST_F(NewCommandTest, NothingIsReplaced) {
     directory.write("coolers.properties", "mine");
     EXPECT_EQ(failureOf(options), directory.path("coolers.properties") + ": exists already");

@@ -162,6 +162,35 @@ TEST_F(ServerCheckTest, NamesThatCollideForAllProducts) {
               "Thing3\n");
 }
 
+TEST_F(ServerCheckTest, NamesThatBreakTheFile) {
+    texts.set("CIM_Fan.DeviceID", "17\" Fan");
+    texts.set("CIM_Fan.State", "a\tb");
+    const std::string told = check("G[0]=CIM_Fan\nA[0]=DeviceID,State,Bytes\n");
+    EXPECT_EQ(told,
+              "5:6: error: the name 17\" Fan has a double quote or a control character: the MIF "
+              "file cannot be read\n"
+              "5:15: error: the name a\tb has a double quote or a control character: the MIF file "
+              "cannot be read\n");
+}
+
+TEST_F(ServerCheckTest, AColumnCalledAsTheNumbersOfRows) {
+    texts.set("CIM_Fan.DeviceID", "Index");
+    EXPECT_EQ(
+        check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),
+        "5:6: warning: the name Index is that of the numbers of rows, too: readers refuse two "
+        "attributes of one name\n");
+}
+
+TEST_F(ServerCheckTest, NamesThatDifferInCaseOnly) {
+    texts.set("CIM_Fan.DeviceID", "ver");
+    texts.set("CIM_Fan.State", "VER");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State\n")
+                  .rfind("5:15: warning: the names ver and VER differ in case only: for QVE the "
+                         "table has one twice\n",
+                         0),
+              0U);
+}
+
 TEST_F(ServerCheckTest, NamesThatCollideWhereTheyAreCut) {
     texts.set("CIM_Fan.DeviceID", "Twenty characters 20");
     texts.set("CIM_Fan.State", "Twenty characters 21");
