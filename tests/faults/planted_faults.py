@@ -177,25 +177,30 @@ def _(trial):
     return "left alone, the run ends and leaves nothing else behind"
 
 
-def try_to(act, *arguments):
-    try:
-        act(*arguments)
-    except OSError:
-        pass
-
-
 def disturb(directory, target, names, end_s):
-    """Puts links to `target` at the names of the outputs and at every other that appears."""
+    """Puts links to `target` at the names of the outputs and at every other that appears. Returns how
+    many took the place of a file of root at an output name, and how many that of another."""
+    outputs = others = 0
     while time.monotonic() < end_s:
         for name in {*names, *os.listdir(directory)}:
-            try_to(os.unlink, directory / name)
-            try_to(os.symlink, target, directory / name)
+            path = directory / name
+            try:
+                was_link = path.is_symlink()
+                path.unlink()
+                path.symlink_to(target)
+            except OSError:
+                continue
+            outputs += name in names and not was_link
+            others += name not in names and not was_link
+    return outputs, others
 
 
 @SUITE.case("links put at each name as it appears, while root writes")
 def _(trial):
     neighbours.need()
     with Surroundings(trial, "SMS") as here:
+        # Without the sticky bit names can be taken from root.
+        here.generator.output.chmod(0o777)
         here.run()
         expected = here.contents()
         expect(expected, "no file is written")
@@ -204,7 +209,8 @@ def _(trial):
         while time.monotonic() < end_s:
             trial.count()
             here.run()
-        neighbour.result()
+        outputs, _ = neighbour.result()
+        expect(outputs > 0, "no link was put at the name of an output")
         here.expect_precious("while links were planted")
         here.run()
         expect_own_files(here, expected, "after links were planted")
