@@ -4,11 +4,13 @@
 #include <unistd.h>
 
 #include <CLI/CLI.hpp>
+#include <cstdlib>
 #include <exception>
 #include <functional>
 #include <iostream>
 #include <memory>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -232,9 +234,21 @@ void addMif(CLI::App& app, Choice& choice) {
     addMifHtml(*mif, choice);
 }
 
+/// Whether there is a terminal that moves its cursor and shows colours.
+bool takesEscapes(int descriptor) {
+    const char* kind = std::getenv("TERM");
+    return ::isatty(descriptor) == 1 && (kind == nullptr || std::string_view(kind) != "dumb");
+}
+
+/// As https://no-color.org has it: any value but the empty one refuses colours.
+bool wantsColour() {
+    const char* refused = std::getenv("NO_COLOR");
+    return takesEscapes(STDOUT_FILENO) && (refused == nullptr || *refused == '\0');
+}
+
 int runCommand(const Choice& choice) {
-    const Output output{std::cout, std::cerr, choice.json, ::isatty(STDOUT_FILENO) == 1,
-                        ::isatty(STDERR_FILENO) == 1};
+    const Output output{std::cout, std::cerr, choice.json, wantsColour(),
+                        takesEscapes(STDERR_FILENO)};
     std::string failure;
     try {
         const int status = choice.command(output);

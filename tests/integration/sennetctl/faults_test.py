@@ -5,6 +5,7 @@ import argparse
 import json
 import os
 import pathlib
+import pty
 import subprocess
 import sys
 import tempfile
@@ -131,6 +132,29 @@ class FaultsTest(unittest.TestCase):
                 run = self.run_with("SMS", text)
                 self.assertNotIn("one0", run.result.stdout)
                 self.assertEqual(list(run.mif.glob("*.mif")), [])
+
+    def escapes_on_a_terminal(self, **environment):
+        """Whether a finding is shown in colour on a terminal."""
+        script = self.place / "terminal.script.inv"
+        script.write_text(GOOD.replace("[CIM]", "nonsense\n[CIM]"))
+        ours, theirs = pty.openpty()
+        try:
+            subprocess.run(
+                [ARGUMENTS.programs.resolve() / "sennetctl", "check", "--offline", script],
+                stdout=theirs, stderr=subprocess.DEVNULL, timeout=60, check=False,
+                env={"PATH": os.environ["PATH"], **environment})
+            text = os.read(ours, 65536)
+        finally:
+            os.close(theirs)
+            os.close(ours)
+        self.assertIn(b"terminal.script.inv", text)
+        return b"\x1b[" in text
+
+    def test_colours_are_for_terminals_that_want_them(self):
+        self.assertTrue(self.escapes_on_a_terminal(TERM="xterm"))
+        self.assertTrue(self.escapes_on_a_terminal(TERM="xterm", NO_COLOR=""))
+        self.assertFalse(self.escapes_on_a_terminal(TERM="xterm", NO_COLOR="1"))
+        self.assertFalse(self.escapes_on_a_terminal(TERM="dumb"))
 
     def test_a_title_with_a_quote_spoils_the_file(self):
         text = GOOD.replace("Disks", '17" Disks')
