@@ -1,5 +1,6 @@
 #include "service/UnixListener.h"
 
+#include <fcntl.h>
 #include <fmt/format.h>
 #include <sys/socket.h>
 #include <sys/stat.h>
@@ -13,6 +14,9 @@
 
 namespace cimomd {
 namespace {
+
+constexpr mode_t kPermissions = S_IRWXU | S_IRWXG | S_IRWXO;
+constexpr mode_t kPrivate = S_IRUSR | S_IWUSR;
 
 [[noreturn]] void fail(const std::string& path, std::string_view reason) {
     throw std::runtime_error(fmt::format("{}: {}", path, reason));
@@ -55,9 +59,9 @@ void clearPath(const std::string& path, const sockaddr_un& address) {
     ::unlink(path.c_str());
 }
 
-/// Nobody else may connect, not even in the moment before a chmod.
-int bindPrivately(int descriptor, const sockaddr_un& address) {
-    const mode_t previous = ::umask(S_IRWXG | S_IRWXO | S_IXUSR);
+/// The file's mode is `mode` from its first moment on.
+int bindWithMode(int descriptor, const sockaddr_un& address, mode_t mode) {
+    const mode_t previous = ::umask(~mode & kPermissions);
     const int result =
         ::bind(descriptor, reinterpret_cast<const sockaddr*>(&address), sizeof address);
     const int error = errno;
@@ -66,11 +70,38 @@ int bindPrivately(int descriptor, const sockaddr_un& address) {
     return result;
 }
 
-bool grant(const std::string& path, const SocketAccess& access) {
-    if (access.group && ::lchown(path.c_str(), static_cast<uid_t>(-1), *access.group) != 0)
-        return false;
-    return ::chmod(path.c_str(), access.mode) == 0;
-}
+/// The file that was bound, found by its path only once: whoever owns the directory may put
+/// something else under the name at any moment, and its mode and group must not change.
+class BoundFile {
+  public:
+    explicit BoundFile(const std::string& path)
+        : descriptor(::open(path.c_str(), O_PATH | O_NOFOLLOW | O_CLOEXEC)) {
+        if (descriptor < 0 || ::fstat(descriptor, &status) != 0)
+            fail(path, std::strerror(errno));
+        if (!S_ISSOCK(status.st_mode) || status.st_uid != ::geteuid() || status.st_nlink != 1)
+            fail(path, "something else has taken the socket's place");
+    }
+    ~BoundFile() { ::close(descriptor); }
+    BoundFile(const BoundFile&) = delete;
+    BoundFile& operator=(const BoundFile&) = delete;
+
+    const struct stat& found() const { return status; }
+
+    bool grant(const SocketAccess& access) const {
+        constexpr auto kSameOwner = static_cast<uid_t>(-1);
+        if (access.group &&
+            ::fchownat(descriptor, "", kSameOwner, *access.group, AT_EMPTY_PATH) != 0)
+            return false;
+        if ((status.st_mode & kPermissions) == access.mode)
+            return true;
+        // There is no fchmod for a descriptor that only names a file.
+        return ::chmod(fmt::format("/proc/self/fd/{}", descriptor).c_str(), access.mode) == 0;
+    }
+
+  private:
+    int descriptor;
+    struct stat status {};
+};
 
 }  // namespace
 
@@ -79,15 +110,23 @@ UnixListener::UnixListener(std::string socketPath, const SocketAccess& access)
     const sockaddr_un address = addressOf(path);
     clearPath(path, address);
     descriptor = makeSocket(path);
-    struct stat status {};
-    if (bindPrivately(descriptor, address) != 0 || !grant(path, access) ||
-        ::listen(descriptor, SOMAXCONN) != 0 || ::lstat(path.c_str(), &status) != 0) {
-        const int error = errno;
+    try {
+        listen(address, access);
+    } catch (...) {
         ::close(descriptor);
-        fail(path, std::strerror(error));
+        throw;
     }
-    device = status.st_dev;
-    inode = status.st_ino;
+}
+
+void UnixListener::listen(const sockaddr_un& address, const SocketAccess& access) {
+    // Before the group is given, the mode would let a wrong group in.
+    if (bindWithMode(descriptor, address, access.group ? kPrivate : access.mode) != 0)
+        fail(path, std::strerror(errno));
+    const BoundFile file(path);
+    if (!file.grant(access) || ::listen(descriptor, SOMAXCONN) != 0)
+        fail(path, std::strerror(errno));
+    device = file.found().st_dev;
+    inode = file.found().st_ino;
 }
 
 UnixListener::~UnixListener() {

@@ -7,6 +7,8 @@
 #include <optional>
 #include <string>
 
+struct sockaddr_un;
+
 namespace cimomd {
 
 /// Who may connect to a Unix socket: those who may write to its file.
@@ -21,7 +23,8 @@ class UnixListener {
   public:
     /// Listens under `socketPath`. A socket that nobody answers at any more is replaced. Raises
     /// std::runtime_error when the path is too long, is taken by something that is no socket or by
-    /// a server that answers, or cannot be made or given to the group.
+    /// a server that answers, cannot be made or given to the group, or when something else takes
+    /// its place meanwhile: that is left as it is.
     explicit UnixListener(std::string socketPath, const SocketAccess& access = SocketAccess());
     ~UnixListener();
     UnixListener(const UnixListener&) = delete;
@@ -30,6 +33,8 @@ class UnixListener {
     int socket() const { return descriptor; }
 
   private:
+    void listen(const sockaddr_un& address, const SocketAccess& access);
+
     std::string path;
     int descriptor = -1;
     dev_t device = 0;

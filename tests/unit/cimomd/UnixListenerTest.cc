@@ -1,12 +1,38 @@
 #include "service/UnixListener.h"
 
+#include <dlfcn.h>
 #include <gtest/gtest.h>
+#include <sys/socket.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <functional>
 #include <stdexcept>
+#include <utility>
 
 #include "RecordedTree.h"
+
+namespace cimomd {
+namespace {
+
+/// What somebody else does as soon as a socket has been bound.
+std::function<void()>& afterBind() {
+    static std::function<void()> deed;
+    return deed;
+}
+
+}  // namespace
+}  // namespace cimomd
+
+/// Stands before that of the C library.
+extern "C" int bind(int descriptor, const sockaddr* address, socklen_t length) noexcept {
+    const auto original =
+        reinterpret_cast<int (*)(int, const sockaddr*, socklen_t)>(::dlsym(RTLD_NEXT, "bind"));
+    const int result = original(descriptor, address, length);
+    if (const auto deed = std::exchange(cimomd::afterBind(), nullptr))
+        deed();
+    return result;
+}
 
 namespace cimomd {
 namespace {
@@ -58,6 +84,41 @@ TEST(UnixListener, leavesWhatOthersOwn) {
     const UnixListener first(path);
     EXPECT_THROW(UnixListener{path}, std::runtime_error);
     EXPECT_TRUE(isThere(path));
+}
+
+/// The mode of a file of 0644 after a socket was to be made while `deed` puts it in its place.
+mode_t modeAfter(const std::filesystem::path& file, const std::string& path,
+                 const SocketAccess& access, std::function<void()> deed) {
+    EXPECT_EQ(::chmod(file.c_str(), 0644), 0);
+    afterBind() = std::move(deed);
+    EXPECT_THROW(UnixListener(path, access), std::runtime_error);
+    EXPECT_FALSE(afterBind());
+    struct stat status {};
+    EXPECT_EQ(::stat(file.c_str(), &status), 0);
+    return status.st_mode & 07777;
+}
+
+TEST(UnixListener, leavesWhatIsPutInTheSocketsPlace) {
+    RecordedTree tree;
+    const std::filesystem::path file = tree.root / "file";
+    const std::string path = (tree.root / "s").string();
+    for (const SocketAccess& access : {SocketAccess{0666, {}}, SocketAccess{0660, ::getegid()}}) {
+        tree.file("file", "precious");
+        std::filesystem::remove(path);
+        EXPECT_EQ(modeAfter(file, path, access,
+                            [&] {
+                                std::filesystem::remove(path);
+                                std::filesystem::create_symlink(file, path);
+                            }),
+                  0644U);
+        std::filesystem::remove(path);
+        EXPECT_EQ(modeAfter(file, path, access,
+                            [&] {
+                                std::filesystem::remove(path);
+                                std::filesystem::create_hard_link(file, path);
+                            }),
+                  0644U);
+    }
 }
 
 TEST(UnixListener, doesNotRemoveASuccessorsSocket) {
