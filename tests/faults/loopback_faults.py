@@ -85,6 +85,57 @@ def replaced(old, new):
     return GOOD.replace(old, new)
 
 
+KEPT_OPEN = replaced(b"Connection: close\r\n", b"")
+LENGTH = b"Content-Length: %d" % len(KEPT_OPEN.split(b"\r\n\r\n", 1)[1])
+
+
+def with_lines(old, *new):
+    """The request with other lines for one, on a connection that is to stay open."""
+    expect(old in KEPT_OPEN, f"the request has no {old!r}")
+    return KEPT_OPEN.replace(old, b"\r\n".join(new))
+
+
+def in_chunks(*lines):
+    head, body = with_lines(LENGTH, *lines).split(b"\r\n\r\n", 1)
+    return head + b"\r\n\r\n%x\r\n%s\r\n0\r\n\r\n" % (len(body), body)
+
+
+HOST = b"Host: localhost"
+CHUNKED = b"Transfer-Encoding: chunked"
+# Requests that two readers take for different ones.
+AMBIGUOUS = {
+    "two hosts, the foreign one last": with_lines(HOST, HOST, b"Host: evil.example"),
+    "two hosts, the foreign one first": with_lines(HOST, b"Host: evil.example", HOST),
+    "the same host twice": with_lines(HOST, HOST, b"host: localhost"),
+    "a NUL behind the host": with_lines(HOST, HOST + b"\0.evil.example"),
+    "a NUL at the end of the head": with_lines(
+        HOST + b"\r\n", b"").replace(b"\r\n\r\n", b"\r\n" + HOST + b"\0evil\r\n\r\n", 1),
+    "two lengths, the wrong one last": with_lines(LENGTH, LENGTH, b"Content-Length: 3"),
+    "two lengths, the wrong one first": with_lines(LENGTH, b"Content-Length: 3", LENGTH),
+    "a length beside chunks": in_chunks(LENGTH, CHUNKED),
+    "chunks beside a length": in_chunks(CHUNKED, LENGTH),
+    "no chunks though they are announced": with_lines(LENGTH, LENGTH, CHUNKED),
+    "an unknown coding": in_chunks(b"Transfer-Encoding: xchunked"),
+    "two codings": in_chunks(b"Transfer-Encoding: gzip, chunked"),
+    "chunks twice": in_chunks(CHUNKED, CHUNKED),
+}
+
+
+@SUITE.case("a request that can be read in two ways")
+def _(trial):
+    with Daemon(trial) as daemon:
+        daemon.expect_served(in_chunks(CHUNKED + b"\r\nConnection: close"), "a body in chunks")
+        daemon.expect_served(GOOD.replace(b"\r\n", b"\n"), "lines that end with LF alone")
+        daemon.expect_served(GOOD.replace(b": ", b": \t "), "blanks before the values")
+        for what, request in AMBIGUOUS.items():
+            trial.count()
+            daemon.expect_refused(request, 400, what)
+            # Whatever follows could be its body or another request.
+            _, octets = daemon.answer(request + GOOD)
+            expect_equal(octets.count(b"HTTP/1.1 "), 1, f"answers to {what}")
+    return "400, and the connection ends"
+
+
 # Without asking first, a page can send these three types, and no header of its own.
 FROM_A_PAGE = {
     "no CIMOperation": (replaced(b"CIMOperation: MethodCall\r\n", b""), 400),

@@ -122,6 +122,11 @@ std::unique_ptr<ResponseStream> respond(const Dispatcher& dispatcher,
 }  // namespace
 
 std::optional<HttpAnswer> CimService::refusalOf(const HttpHead& head) const {
+    if (head.isAmbiguous) {
+        HttpAnswer answer = refusal(kBadRequest);
+        answer.headers.emplace_back("Connection", "close");
+        return answer;
+    }
     if (head.fromNetwork && (!head.host || !isLoopbackHost(*head.host)))
         return refusal(kForbidden);
     if (head.method == "M-POST")

@@ -19,6 +19,8 @@ struct HttpHead {
     std::string path;
     /// Over TCP, where the Host header tells under which name the client looked for this server.
     bool fromNetwork = false;
+    /// Others on the request's way may read it differently, its Host or where it ends.
+    bool isAmbiguous = false;
     std::optional<std::string> host;
     std::optional<std::string> contentType;
     std::optional<std::string> contentLength;

@@ -12,6 +12,7 @@
 
 #include "protocol/ConnectionWatch.h"
 #include "protocol/PercentCoding.h"
+#include "protocol/RequestHead.h"
 
 namespace cimomd {
 
@@ -87,32 +88,6 @@ WatchedConnection* watchedOf(MHD_Connection* connection) {
     const MHD_ConnectionInfo* info =
         MHD_get_connection_info(connection, MHD_CONNECTION_INFO_SOCKET_CONTEXT);
     return static_cast<WatchedConnection*>(info->socket_context);
-}
-
-bool isFromNetwork(MHD_Connection* connection) {
-    const MHD_ConnectionInfo* info =
-        MHD_get_connection_info(connection, MHD_CONNECTION_INFO_CLIENT_ADDRESS);
-    return info->client_addr->sa_family != AF_UNIX;
-}
-
-std::optional<std::string> header(MHD_Connection* connection, const char* name) {
-    const char* value = MHD_lookup_connection_value(connection, MHD_HEADER_KIND, name);
-    return value == nullptr ? std::nullopt : std::optional<std::string>(value);
-}
-
-HttpHead headOf(MHD_Connection* connection, const char* url, const char* method) {
-    HttpHead head;
-    head.method = method;
-    head.path = url;
-    head.fromNetwork = isFromNetwork(connection);
-    head.host = header(connection, MHD_HTTP_HEADER_HOST);
-    head.contentType = header(connection, MHD_HTTP_HEADER_CONTENT_TYPE);
-    head.contentLength = header(connection, MHD_HTTP_HEADER_CONTENT_LENGTH);
-    head.te = header(connection, MHD_HTTP_HEADER_TE);
-    head.cimOperation = header(connection, "CIMOperation");
-    head.cimMethod = header(connection, "CIMMethod");
-    head.cimObject = header(connection, "CIMObject");
-    return head;
 }
 
 void addTrailers(const Sending& sending) {
@@ -192,11 +167,13 @@ void freeExchange(void** context) {
 MHD_Result HttpServer::State::begin(MHD_Connection* connection, const char* url, const char* method,
                                     void** context) {
     auto exchange = std::make_unique<Exchange>();
-    exchange->head = headOf(connection, url, method);
+    exchange->head = requestHead(connection, url, method);
     exchange->refusal = service.refusalOf(exchange->head);
-    const auto expect = header(connection, MHD_HTTP_HEADER_EXPECT);
-    // A client that asks before it sends its body is told at once.
-    if (exchange->refusal && expect)
+    const bool asksFirst =
+        MHD_lookup_connection_value(connection, MHD_HEADER_KIND, MHD_HTTP_HEADER_EXPECT) != nullptr;
+    // A client that asks before it sends its body is told at once; where an ambiguous request ends
+    // nobody knows.
+    if (exchange->refusal && (asksFirst || exchange->head.isAmbiguous))
         return queue(connection, std::move(*exchange->refusal), limits.patience);
     *context = exchange.release();
     watchedOf(connection)->expectProgress(limits.patience);

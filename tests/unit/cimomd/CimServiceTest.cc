@@ -51,6 +51,14 @@ class CimServiceTest : public testing::Test {
     HttpHead head;
 };
 
+TEST_F(CimServiceTest, endsAConnectionWhoseRequestIsAmbiguous) {
+    head.isAmbiguous = true;
+    const auto refusal = service.refusalOf(head);
+    ASSERT_TRUE(refusal);
+    EXPECT_EQ(refusal->status, 400U);
+    EXPECT_EQ(headerOf(*refusal, "Connection"), "close");
+}
+
 TEST_F(CimServiceTest, takesARequestWithAGoodHead) {
     EXPECT_EQ(refusedWith(), 0U);
     head.contentType = "TEXT/XML";
