@@ -2,7 +2,7 @@
 
 #include <fcntl.h>
 #include <poll.h>
-#include <spawn.h>
+#include <sys/prctl.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -45,53 +45,89 @@ class Pipe {
     std::array<int, 2> ends{-1, -1};
 };
 
-/// How the child starts: a process group of its own, no signal blocked or ignored, no descriptor
-/// but the three standard ones.
-class SpawnSettings {
-  public:
-    explicit SpawnSettings(int output) {
-        ::posix_spawn_file_actions_init(&actions);
-        ::posix_spawn_file_actions_addopen(&actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
-        ::posix_spawn_file_actions_adddup2(&actions, output, STDOUT_FILENO);
-        ::posix_spawn_file_actions_addopen(&actions, STDERR_FILENO, "/dev/null", O_WRONLY, 0);
-        ::posix_spawn_file_actions_addclosefrom_np(&actions, STDERR_FILENO + 1);
-        ::posix_spawnattr_init(&attributes);
-        sigset_t signals;
-        ::sigfillset(&signals);
-        ::posix_spawnattr_setsigdefault(&attributes, &signals);
-        ::sigemptyset(&signals);
-        ::posix_spawnattr_setsigmask(&attributes, &signals);
-        ::posix_spawnattr_setpgroup(&attributes, 0);
-        ::posix_spawnattr_setflags(
-            &attributes, POSIX_SPAWN_SETPGROUP | POSIX_SPAWN_SETSIGMASK | POSIX_SPAWN_SETSIGDEF);
-    }
-    ~SpawnSettings() {
-        ::posix_spawnattr_destroy(&attributes);
-        ::posix_spawn_file_actions_destroy(&actions);
-    }
-    SpawnSettings(const SpawnSettings&) = delete;
-    SpawnSettings& operator=(const SpawnSettings&) = delete;
-
-    /// Zero or an error number.
-    int spawn(const std::filesystem::path& program, const std::vector<std::string>& arguments,
-              pid_t& child) const {
-        std::vector<std::string> words{program.string()};
-        words.insert(words.end(), arguments.begin(), arguments.end());
-        std::vector<char*> argumentList;
-        argumentList.reserve(words.size() + 1);
-        for (std::string& word : words)
-            argumentList.push_back(word.data());
-        argumentList.push_back(nullptr);
-        std::string locale = "LC_ALL=C";
-        std::array<char*, 2> environment{locale.data(), nullptr};
-        return ::posix_spawn(&child, program.c_str(), &actions, &attributes, argumentList.data(),
-                             environment.data());
-    }
-
-  private:
-    posix_spawn_file_actions_t actions{};
-    posix_spawnattr_t attributes{};
+/// What the child needs, made before it is forked.
+struct Start {
+    const char* program;
+    char* const* arguments;
+    char* const* environment;
+    int output;
+    /// Where it tells why it cannot start; closes by itself when it can.
+    int errors;
+    pid_t parent;
 };
+
+// From here to runProgram: only calls that are safe between fork and exec of a threaded program.
+
+void resetSignals() {
+    struct sigaction standard {};
+    standard.sa_handler = SIG_DFL;
+    for (int number = 1; number < NSIG; ++number)
+        ::sigaction(number, &standard, nullptr);
+    sigset_t none;
+    ::sigemptyset(&none);
+    ::sigprocmask(SIG_SETMASK, &none, nullptr);
+}
+
+bool setStandardStreams(int output) {
+    const int nothing = ::open("/dev/null", O_RDWR | O_CLOEXEC);
+    return nothing >= 0 && ::dup2(nothing, STDIN_FILENO) >= 0 &&
+           ::dup2(output, STDOUT_FILENO) >= 0 && ::dup2(nothing, STDERR_FILENO) >= 0;
+}
+
+void keepOnlyStandardStreams() {
+    constexpr int kFirst = STDERR_FILENO + 1;
+    if (::close_range(kFirst, ~0U, CLOSE_RANGE_CLOEXEC) == 0)
+        return;
+    constexpr int kUsualLimit = 65536;
+    for (int number = kFirst; number < kUsualLimit; ++number)
+        ::fcntl(number, F_SETFD, FD_CLOEXEC);
+}
+
+[[noreturn]] void runProgram(const Start& start) {
+    ::setpgid(0, 0);
+    // A program that hangs must not outlive a process that is killed while it waits for it.
+    ::prctl(PR_SET_PDEATHSIG, SIGKILL);
+    if (::getppid() == start.parent && setStandardStreams(start.output)) {
+        keepOnlyStandardStreams();
+        resetSignals();
+        ::execve(start.program, start.arguments, start.environment);
+    }
+    const int error = errno;
+    static_cast<void>(::write(start.errors, &error, sizeof error) == sizeof error);
+    ::_exit(1);
+}
+
+/// Zero or an error number. The child leads a process group of its own.
+int spawn(const std::filesystem::path& program, const std::vector<std::string>& arguments,
+          int output, pid_t& child) {
+    std::vector<std::string> words{program.string()};
+    words.insert(words.end(), arguments.begin(), arguments.end());
+    std::vector<char*> argumentList;
+    argumentList.reserve(words.size() + 1);
+    for (std::string& word : words)
+        argumentList.push_back(word.data());
+    argumentList.push_back(nullptr);
+    std::string locale = "LC_ALL=C";
+    const std::array<char*, 2> environment{locale.data(), nullptr};
+    Pipe errors;
+    const Start start{program.c_str(), argumentList.data(), environment.data(),
+                      output,          errors.writeEnd(),   ::getpid()};
+    child = ::fork();
+    if (child < 0)
+        return errno;
+    if (child == 0)
+        runProgram(start);
+    errors.closeWriteEnd();
+    int error = 0;
+    ssize_t count = 0;
+    while ((count = ::read(errors.readEnd(), &error, sizeof error)) < 0 && errno == EINTR) {
+    }
+    if (count <= 0)
+        return 0;
+    while (::waitpid(child, nullptr, 0) < 0 && errno == EINTR) {
+    }
+    return error;
+}
 
 /// A running child; it and all it started are gone when this is.
 class Child {
@@ -156,7 +192,7 @@ Fact<std::string> outputOf(const std::filesystem::path& program,
     const Clock::time_point deadline = Clock::now() + limits.deadline;
     Pipe pipe;
     pid_t id = 0;
-    const int error = SpawnSettings(pipe.writeEnd()).spawn(program, arguments, id);
+    const int error = spawn(program, arguments, pipe.writeEnd(), id);
     if (error != 0)
         return absenceOf(std::error_code(error, std::generic_category()));
     const Child child(id);

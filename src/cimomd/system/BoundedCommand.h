@@ -20,7 +20,8 @@ struct CommandLimits {
 /// What the program at this absolute path writes to its standard output. It runs in the C locale
 /// with an empty environment, without input, its messages dropped. Absent: there is no such
 /// program. NeedsRoot: it may not be executed. TimedOut: it did not end before the deadline.
-/// Unreadable: it failed, or wrote more than allowed. No process of it is left behind in any case.
+/// Unreadable: it failed, or wrote more than allowed. No process of it is left behind in any case;
+/// when the calling thread is ended meanwhile, the program ends with it.
 Fact<std::string> outputOf(const std::filesystem::path& program,
                            const std::vector<std::string>& arguments,
                            const CommandLimits& limits = {});

@@ -2,6 +2,7 @@
 
 #include <fcntl.h>
 #include <gtest/gtest.h>
+#include <sys/wait.h>
 #include <unistd.h>
 
 #include <csignal>
@@ -82,6 +83,25 @@ TEST(BoundedCommand, endsAProgramThatDoesNotEnd) {
             ::usleep(10000);
         EXPECT_FALSE(isRunning(id)) << script;
     }
+}
+
+TEST(BoundedCommand, endsAProgramWhoseCallerIsKilled) {
+    RecordedTree tree;
+    const std::string idFile = (tree.root / "id").string();
+    const pid_t caller = ::fork();
+    if (caller == 0) {
+        shell("echo $$ > " + idFile + ".new; mv " + idFile + ".new " + idFile + "; exec sleep 600");
+        ::_exit(0);
+    }
+    for (int i = 0; i < 1000 && !std::filesystem::exists(idFile); ++i)
+        ::usleep(10000);
+    const std::string id = readFact(idFile).value();
+    EXPECT_TRUE(isRunning(id));
+    ::kill(caller, SIGKILL);
+    ::waitpid(caller, nullptr, 0);
+    for (int i = 0; i < 500 && isRunning(id); ++i)
+        ::usleep(10000);
+    EXPECT_FALSE(isRunning(id));
 }
 
 }  // namespace
