@@ -3,10 +3,13 @@
 
 #include <fmt/format.h>
 #include <malloc.h>
+#include <poll.h>
 #include <sys/prctl.h>
 #include <sys/socket.h>
+#include <sys/syscall.h>
 #include <unistd.h>
 
+#include <cerrno>
 #include <csignal>
 #include <cstdio>
 #include <stdexcept>
@@ -46,10 +49,29 @@ void requireStreamSocket(int descriptor) {
             fmt::format("the descriptor {} is no connected stream socket", descriptor));
 }
 
+/// Whether the process that made the connection is gone, which counts as long as it is a zombie.
+bool hasClientEnded(int connection) {
+    ucred client{};
+    socklen_t length = sizeof client;
+    // Number 0 is a process that cannot be seen from here.
+    if (::getsockopt(connection, SOL_SOCKET, SO_PEERCRED, &client, &length) != 0 || client.pid <= 0)
+        return false;
+    const long process = ::syscall(SYS_pidfd_open, client.pid, 0);
+    if (process < 0)
+        return errno == ESRCH;
+    pollfd end{static_cast<int>(process), POLLIN, 0};
+    const bool ended = ::poll(&end, 1, 0) > 0;
+    ::close(end.fd);
+    return ended;
+}
+
 /// The parent is the only client: without it nobody would ever close the connection again, should
 /// another child have inherited its end.
-void endWithParent() {
+void endWithParent(int connection) {
     ::prctl(PR_SET_PDEATHSIG, SIGTERM);
+    // No signal comes from a parent that ended before.
+    if (hasClientEnded(connection))
+        std::raise(SIGTERM);
 }
 
 /// The listening sockets of a daemon, those that were handed over included.
@@ -98,7 +120,6 @@ void runDaemon(const Options& options, MainLoop& loop, const SchemaLoader& loade
 void runEmbedded(int descriptor, MainLoop& loop, const SchemaLoader& loader,
                  CurrentRepository& repository) {
     requireStreamSocket(descriptor);
-    endWithParent();
     loop.serveOnly(descriptor);
     loop.run([&] { reload(loader, repository); });
 }
@@ -117,6 +138,8 @@ HttpLimits limitsFor(const Options& options) {
 }
 
 void serve(const Options& options) {
+    if (options.connectedDescriptor)
+        endWithParent(*options.connectedDescriptor);
     Signals signals;
     const Pegasus::CIMNamespaceName nameSpace(kNamespace);
     const SchemaLoader loader(

@@ -104,9 +104,29 @@ def _(trial):
     return "nothing but its connection: no file, pipe, standard stream or variable"
 
 
+def duplicates_of_sockets(process):
+    """Duplicates in this process of the sockets of another one."""
+    found = []
+    pidfd = os.pidfd_open(process)
+    try:
+        for number, target in descriptors_of(process).items():
+            if target.startswith("socket:"):
+                found.append(neighbours.duplicate_of(pidfd, number))
+    finally:
+        os.close(pidfd)
+    return found
+
+
 def kill_parent(program, child, _):
-    program.signal(signal.SIGKILL)
-    expect(waited(lambda: not is_running(child)), "the child outlives its parent")
+    # As if another child of the parent had inherited its end, so that the connection stays open.
+    held = duplicates_of_sockets(program.pid)
+    try:
+        expect(held, "the parent has no connection to its child")
+        program.signal(signal.SIGKILL)
+        expect(waited(lambda: not is_running(child)), "the child outlives its parent")
+    finally:
+        for descriptor in held:
+            os.close(descriptor)
 
 
 @SUITE.case("the generator is killed while its private child serves")
@@ -114,7 +134,55 @@ def _(trial):
     for _ in trial.repeat(50):
         trial.count()
         with_running_child(trial, kill_parent)
-    return "the child ends with it"
+    return "the child ends with it, also when somebody else keeps the connection open"
+
+
+TOOL = pathlib.Path("/usr/bin/dpkg-query")
+
+
+def tool_that_hangs(directory):
+    """A program that writes its process number and never ends."""
+    program, trace = directory / "hangs", directory / "trace"
+    program.write_text(f"#!/bin/sh\necho $$ >'{trace}.new'\nmv '{trace}.new' '{trace}'\n"
+                       "exec sleep 600\n")
+    program.chmod(0o755)
+    return program, trace
+
+
+def run_asking_tool(trial, place, end):
+    """A run whose child asks the tool, and which `end` ends then. Leaves nothing running."""
+    program, trace = tool_that_hangs(place)
+    neighbours.mount(str(program), TOOL, "none", neighbours.MS_BIND)
+    try:
+        generator = Generator(trial, place, script="softwareidentity")
+        running = rows.Program(generator.command(), generator.environment())
+        tool = None
+        try:
+            expect(waited(trace.exists), "the tool is never asked")
+            tool = int(trace.read_text())
+            expect(is_running(tool), "the tool does not hang")
+            end(running, child_of(running))
+            expect(waited(lambda: not is_running(tool)), "the tool outlives the run")
+        finally:
+            running.kill()
+            if tool and is_running(tool):
+                os.kill(tool, signal.SIGKILL)
+    finally:
+        neighbours.unmount(TOOL)
+
+
+@SUITE.case("the generator or its child is killed while a package manager's tool hangs")
+def _(trial):
+    neighbours.need()
+    if not TOOL.exists() or not pathlib.Path("/var/lib/dpkg/status").exists():
+        raise rows.Skip("there are no packages of Debian")
+    ends = (lambda program, _: program.signal(signal.SIGKILL),
+            lambda _, child: os.kill(child, signal.SIGKILL))
+    for end in ends:
+        trial.count()
+        with neighbours.place_for_programs() as place:
+            run_asking_tool(trial, pathlib.Path(place), end)
+    return "the tool ends with them"
 
 
 def evil_program(directory):

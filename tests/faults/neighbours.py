@@ -26,7 +26,9 @@ KNOWN_SOCKET = pathlib.Path("/var/tmp/cimxml.socket")
 
 _CLONE_NEWNS = 0x20000
 _MS_REC_PRIVATE = 0x4000 | 0x40000
+MS_BIND = 0x1000
 _MNT_DETACH = 2
+_SYS_PIDFD_GETFD = 438
 _LIBC = ctypes.CDLL(None, use_errno=True)
 _FORK = multiprocessing.get_context("fork")
 
@@ -44,6 +46,15 @@ def mount(source, target, kind, flags=0, data=""):
 
 def unmount(target):
     _check(_LIBC.umount2(os.fsencode(target), _MNT_DETACH), "umount")
+
+
+def duplicate_of(pidfd, number):
+    """A duplicate in this process of a descriptor of another one; Skip where there is no such
+    call, or none for this user."""
+    descriptor = _LIBC.syscall(_SYS_PIDFD_GETFD, pidfd, number, 0)
+    if descriptor < 0:
+        raise rows.Skip(f"no duplicates of descriptors: {os.strerror(ctypes.get_errno())}")
+    return descriptor
 
 
 def _enter_own_mounts():
@@ -179,14 +190,14 @@ class _Ended:
 class Generator:
     """sennet with one script, in a place of its own that everybody may look into."""
 
-    def __init__(self, trial, place, programs=None):
+    def __init__(self, trial, place, programs=None, script=SCRIPT):
         self.place = pathlib.Path(place)
         self.place.chmod(0o755)
         self.program = (programs or trial.bin) / "sennet"
         self.output = self.place / "mif"
         scripts = self.place / "scripts"
         scripts.mkdir()
-        for name in (SCRIPT + ".script.inv", "sennet.properties"):
+        for name in (script + ".script.inv", "sennet.properties"):
             shutil.copy(TOP / "inventory" / name, scripts)
         self.configuration = self.place / "velm.properties"
         self.configuration.write_text(f"sennet.directory={scripts}\n"
