@@ -33,6 +33,8 @@ import traceback
 
 MIB = 1 << 20
 PATIENCE_S = 60
+# The exit status that CTest is told to take for a test that was not tried.
+SKIPPED = 77
 
 
 class Failure(Exception):
@@ -100,11 +102,14 @@ class Suite:
         parser.add_argument("--seconds", type=float, help="duration of what can last any time")
         parser.add_argument("--full", action="store_true", help="full effort: minutes")
         parser.add_argument("--rows", action="store_true", help="print the table's rows at the end")
+        parser.add_argument("--no-skip", action="store_true",
+                            help="a case that cannot be tried here fails")
         parser.add_argument("--only", type=re.compile, help="pattern of the cases to try")
         return parser.parse_args()
 
     def main(self):
-        """Tries the cases; 1 when one of them failed, or there is none though all were wanted."""
+        """Tries the cases; 1 when one of them failed, or there is none though all were wanted;
+        SKIPPED when none of them could be tried."""
         # A suite that is ended takes its programs, places and mounts away.
         signal.signal(signal.SIGTERM, lambda *_: sys.exit(1))
         arguments = self._arguments()
@@ -112,12 +117,15 @@ class Suite:
         cases = [(fault, function) for fault, function in self._cases
                  if not arguments.only or arguments.only.search(fault)]
         table = []
-        failed = 0
+        failed = skipped = 0
         for fault, function in cases:
             start = time.monotonic()
             trial = Trial(arguments)
             verdict, outcome = _judge(function, trial)
+            if verdict == "skip" and arguments.no_skip:
+                verdict = "FAIL"
             failed += verdict == "FAIL"
+            skipped += verdict == "skip"
             if verdict == "ok" and trial.tried == 0:
                 verdict, outcome, failed = "FAIL", "never tried", failed + 1
             print(f"{verdict:4} {fault}: {outcome} ({trial.tried} times, "
@@ -125,7 +133,9 @@ class Suite:
             table.append(f"| {fault} | {trial.tried} | {_cell(verdict, outcome)} |")
         if arguments.rows:
             print("\n".join(table))
-        return 1 if failed or not (cases or arguments.only) else 0
+        if failed or not (cases or arguments.only):
+            return 1
+        return SKIPPED if cases and skipped == len(cases) else 0
 
 
 def _judge(function, trial):
