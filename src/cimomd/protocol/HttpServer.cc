@@ -4,6 +4,7 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <atomic>
 #include <chrono>
 #include <stdexcept>
@@ -13,17 +14,21 @@
 #include "protocol/ConnectionWatch.h"
 #include "protocol/PercentCoding.h"
 #include "protocol/RequestHead.h"
+#include "protocol/UserShares.h"
 
 namespace cimomd {
 
 struct HttpServer::State {
     State(const CimService& cimService, HttpLimits httpLimits)
-        : service(cimService), limits(httpLimits) {}
+        : service(cimService),
+          limits(httpLimits),
+          shares(std::max<std::size_t>(httpLimits.maxConnections / 2, 1)) {}
 
     const CimService& service;
     HttpLimits limits;
     std::function<void()> closed;
     ConnectionWatch watch;
+    UserShares shares;
     /// Handed to the library, which takes them up in its own time, and not closed yet.
     std::atomic<std::size_t> connections = 0;
     MHD_Daemon* daemon = nullptr;
@@ -233,6 +238,9 @@ void HttpServer::start(std::function<void()> closed) {
             watched->expectProgress(server->limits.patience);
             *socketContext = watched;
         } else {
+            server->shares.giveBack(UserShares::limitedUser(
+                MHD_get_connection_info(connection, MHD_CONNECTION_INFO_CONNECTION_FD)
+                    ->connect_fd));
             server->watch.remove(static_cast<WatchedConnection*>(*socketContext));
             --server->connections;
             server->closed();
@@ -255,7 +263,9 @@ void HttpServer::start(std::function<void()> closed) {
 bool HttpServer::serve(int connectedSocket) {
     sockaddr_storage peer{};
     socklen_t length = sizeof peer;
-    if (::getpeername(connectedSocket, reinterpret_cast<sockaddr*>(&peer), &length) != 0) {
+    const auto user = UserShares::limitedUser(connectedSocket);
+    if (::getpeername(connectedSocket, reinterpret_cast<sockaddr*>(&peer), &length) != 0 ||
+        !state->shares.take(user)) {
         ::close(connectedSocket);
         return false;
     }
@@ -264,6 +274,7 @@ bool HttpServer::serve(int connectedSocket) {
                            length) == MHD_YES)
         return true;
     --state->connections;
+    state->shares.giveBack(user);
     return false;
 }
 

@@ -33,7 +33,8 @@ class HttpServer {
     void stop();
 
     /// Serves a connected stream socket and closes it at its end, also when false says that it
-    /// cannot be served.
+    /// cannot be served. A user at a Unix socket who is neither root nor this process's gets half
+    /// of the room at most.
     bool serve(int connectedSocket);
 
     std::size_t connections() const;
