@@ -9,17 +9,13 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <string>
+
+#include "Require.h"
 
 using namespace Pegasus;
 
 namespace {
-
-void require(bool holds) {
-    if (!holds)
-        std::abort();
-}
 
 void checkUtf8(const String& text, const std::string& bytes) {
     const std::string back = static_cast<const char*>(text.getCString());

@@ -4,9 +4,9 @@
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <string>
 
+#include "Require.h"
 #include "providers/devices/DesktopMonitorProvider.h"
 #include "system/devices/Edid.h"
 
@@ -15,12 +15,6 @@ namespace {
 constexpr std::size_t kBlockBytes = 128;
 constexpr std::size_t kDescriptors = 4;
 constexpr std::size_t kTextCharacters = 13;
-
-void require(bool condition) {
-    if (!condition) {
-        std::abort();
-    }
-}
 
 void checkValues(const cimomd::Edid& edid) {
     require(!edid.makerCode || edid.makerCode->size() == 3);

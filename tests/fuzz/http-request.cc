@@ -6,24 +6,19 @@
 #include <unistd.h>
 
 #include <array>
+#include <cerrno>
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <string>
 
 #include "LeafService.h"
+#include "Require.h"
 #include "protocol/HttpServer.h"
 
 namespace {
 
 constexpr std::size_t kMaxRequestBytes = 16384;
 constexpr int kHangMilliseconds = 10000;
-
-void require(bool holds) {
-    if (!holds) {
-        std::abort();
-    }
-}
 
 struct Server {
     Server() {
@@ -40,7 +35,12 @@ std::string received(int connection) {
     std::array<char, 4096> buffer{};
     while (true) {
         pollfd waiting{connection, POLLIN, 0};
-        require(poll(&waiting, 1, kHangMilliseconds) == 1);
+        int ready = 0;
+        do {
+            ready = poll(&waiting, 1, kHangMilliseconds);
+            // libFuzzer's timer interrupts the wait now and then.
+        } while (ready < 0 && errno == EINTR);
+        require(ready == 1);
         const ssize_t count = read(connection, buffer.data(), buffer.size());
         if (count <= 0) {
             return all;

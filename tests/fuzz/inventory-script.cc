@@ -6,10 +6,10 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <string>
 
 #include "CimScriptParser/CimScriptParser.h"
+#include "Require.h"
 
 namespace {
 
@@ -21,12 +21,6 @@ void ask(Question question) {
         question();
     } catch (const Exception&) {
         // What a script may say wrongly; the caller abandons the script.
-    }
-}
-
-void require(bool condition) {
-    if (!condition) {
-        std::abort();
     }
 }
 

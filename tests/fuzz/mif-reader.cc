@@ -8,15 +8,10 @@
 #include <string>
 #include <string_view>
 
+#include "Require.h"
 #include "mifreader/MifReader.h"
 
 namespace {
-
-void require(bool condition) {
-    if (!condition) {
-        std::abort();
-    }
-}
 
 Mif::Tolerances tolerances(std::uint8_t bits) {
     Mif::Tolerances result;

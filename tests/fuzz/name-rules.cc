@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "FuzzBytes.h"
+#include "Require.h"
 #include "SennetConverter/framework/SennetUtilities.h"
 
 namespace {
@@ -161,12 +162,6 @@ std::string inRadix(std::int64_t number, int radix) {
         }
     }
     return (number < 0 ? "-" : "") + digits;
-}
-
-void require(bool holds) {
-    if (!holds) {
-        std::abort();
-    }
 }
 
 void compareNames(const String& name, unsigned maxLength) {

@@ -3,20 +3,15 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <string_view>
 
+#include "Require.h"
 #include "system/computer/SmbiosTable.h"
 
 namespace {
 
 constexpr std::size_t kEntryPointBytes = 32;
 constexpr std::size_t kMaxLength = 255;
-
-void require(bool condition) {
-    if (!condition)
-        std::abort();
-}
 
 void requireBounds(const cimomd::SmbiosStructure& structure) {
     const std::size_t length = structure.length();

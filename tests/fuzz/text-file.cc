@@ -7,11 +7,11 @@
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <string>
 #include <string_view>
 #include <vector>
 
+#include "Require.h"
 #include "velmclient/FileDescriptor.h"
 #include "velmclient/LineReader.h"
 
@@ -29,12 +29,6 @@ std::vector<std::string_view> splitLines(std::string_view text, std::size_t limi
         lines.push_back(line.substr(0, limit));
     }
     return lines;
-}
-
-void require(bool condition) {
-    if (!condition) {
-        std::abort();
-    }
 }
 
 }  // namespace

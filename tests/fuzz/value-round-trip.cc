@@ -12,7 +12,6 @@
 #include <cmath>
 #include <cstddef>
 #include <cstdint>
-#include <cstdlib>
 #include <memory>
 #include <string>
 #include <utility>
@@ -20,6 +19,7 @@
 
 #include "FuzzBytes.h"
 #include "FuzzService.h"
+#include "Require.h"
 #include "providers/RecordStream.h"
 #include "xml/CimXmlReader.h"
 #include "xml/MemorySource.h"
@@ -31,12 +31,6 @@ using namespace Pegasus;
 constexpr unsigned kMaxInstances = 4;
 constexpr unsigned kMaxElements = 3;
 constexpr unsigned kMaxCharacters = 8;
-
-void require(bool holds) {
-    if (!holds) {
-        std::abort();
-    }
-}
 
 // --- values from octets --------------------------------------------------------------------------
 
