@@ -14,6 +14,7 @@
 #include <thread>
 
 #include "files/TextFile.h"
+#include "system/ForkedChild.h"
 
 namespace cimomd {
 namespace {
@@ -74,21 +75,12 @@ bool setStandardStreams(int output) {
            ::dup2(output, STDOUT_FILENO) >= 0 && ::dup2(nothing, STDERR_FILENO) >= 0;
 }
 
-void keepOnlyStandardStreams() {
-    constexpr int kFirst = STDERR_FILENO + 1;
-    if (::close_range(kFirst, ~0U, CLOSE_RANGE_CLOEXEC) == 0)
-        return;
-    constexpr int kUsualLimit = 65536;
-    for (int number = kFirst; number < kUsualLimit; ++number)
-        ::fcntl(number, F_SETFD, FD_CLOEXEC);
-}
-
 [[noreturn]] void runProgram(const Start& start) {
     ::setpgid(0, 0);
     // A program that hangs must not outlive a process that is killed while it waits for it.
     ::prctl(PR_SET_PDEATHSIG, SIGKILL);
     if (::getppid() == start.parent && setStandardStreams(start.output)) {
-        keepOnlyStandardStreams();
+        closeOthers(STDERR_FILENO + 1, static_cast<unsigned int>(start.errors));
         resetSignals();
         ::execve(start.program, start.arguments, start.environment);
     }

@@ -10,32 +10,19 @@
 #include <cerrno>
 #include <csignal>
 
+#include "system/ForkedChild.h"
+
 namespace cimomd {
 namespace {
 
 using std::chrono::milliseconds;
 using Clock = std::chrono::steady_clock;
 
-// From here to childMain: only calls that are safe between fork and exec of a threaded program.
-
-void closeRange(unsigned int first, unsigned int last) {
-    if (::close_range(first, last, 0) == 0)
-        return;
-    constexpr unsigned int kUsualLimit = 65536;
-    for (unsigned int number = first; number <= std::min(last, kUsualLimit); ++number)
-        ::close(static_cast<int>(number));
-}
-
-/// A child that hangs must keep nobody waiting for the end of a connection or of an output.
-void closeAllBut(unsigned int kept) {
-    if (kept > 0)
-        closeRange(0, kept - 1);
-    closeRange(kept + 1, ~0U);
-}
-
+// Only calls that are safe between fork and exec of a threaded program.
 [[noreturn]] void childMain(GuardedChild::Task task, const void* question, int answers) {
     ::prctl(PR_SET_PDEATHSIG, SIGKILL);
-    closeAllBut(static_cast<unsigned int>(answers));
+    // A child that hangs must keep nobody waiting for the end of a connection or of an output.
+    closeOthers(0, static_cast<unsigned int>(answers));
     task(question, answers);
     ::_exit(0);
 }
