@@ -79,8 +79,7 @@ class CIMClientRep::ConnectionGuard {
     bool kept = false;
 };
 
-CIMClientRep::CIMClientRep(ClientSettings clientSettings)
-    : settings(std::move(clientSettings)), memory(settings.memoryLimit) {}
+CIMClientRep::CIMClientRep(ClientSettings settings) : settings(std::move(settings)) {}
 
 void CIMClientRep::connectLocal() {
     if (connected) {

@@ -18,7 +18,7 @@ namespace Pegasus {
 
 class CIMClientRep {
   public:
-    explicit CIMClientRep(ClientSettings clientSettings);
+    explicit CIMClientRep(ClientSettings settings);
 
     void setTimeout(Uint32 milliseconds) { timeoutMilliseconds = milliseconds; }
     void connectLocal();

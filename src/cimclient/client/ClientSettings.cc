@@ -1,7 +1,5 @@
 #include "client/ClientSettings.h"
 
-#include "client/MemoryBudget.h"
-
 namespace Pegasus {
 
 ClientSettings ClientSettings::standard() {
@@ -10,7 +8,6 @@ ClientSettings ClientSettings::standard() {
     settings.authenticationDirectories = {"/var/tmp", "/var/opt/tog-pegasus/cache/localauth",
                                           "/var/lib/Pegasus/cache/localauth",
                                           "/run/cimomd/localauth"};
-    settings.memoryLimit = memoryForAnswers();
     return settings;
 }
 

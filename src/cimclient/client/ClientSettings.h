@@ -20,9 +20,6 @@ struct ClientSettings {
     Uint64 bodyLimit = Uint64(4) << 30;
     /// The same of an answer that describes one class; real ones have some 60,000.
     Uint64 classBodyLimit = Uint64(16) << 20;
-    /// Octets of memory that the objects of all answers held at a time may take, which can be
-    /// twelve times those of the answers.
-    Uint64 memoryLimit = ~Uint64(0);
     /// Octets of one answer's header and trailer lines together.
     std::size_t headLimit = 64 * 1024;
 

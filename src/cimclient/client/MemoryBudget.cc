@@ -64,6 +64,10 @@ void MemoryBudget::take(std::size_t octets) {
 void MemoryBudget::look() {
     if (firstUse == 0) {
         firstUse = residentOctets();
+        if (!limit) {
+            limit = memoryForAnswers();
+        }
+        return;
     }
     if (!isExceeded()) {
         return;
@@ -77,7 +81,7 @@ void MemoryBudget::look() {
 
 bool MemoryBudget::isExceeded() const {
     const Uint64 use = residentOctets();
-    return use > firstUse && use - firstUse > limit;
+    return use > firstUse && use - firstUse > *limit;
 }
 
 Uint64 memoryForAnswers() {

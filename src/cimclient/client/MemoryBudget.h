@@ -5,6 +5,7 @@
 #include <Pegasus/Common/Config.h>
 
 #include <cstddef>
+#include <optional>
 
 #include "xml/ByteSource.h"
 
@@ -17,6 +18,8 @@ class MemoryBudget {
     /// Octets of answers between two looks at the memory.
     static constexpr std::size_t kStep = std::size_t{16} << 20;
 
+    /// With memoryForAnswers() as its limit, which is asked for when it is wanted.
+    MemoryBudget() = default;
     /// `limit` is in octets of resident memory more than at the first look.
     explicit MemoryBudget(Uint64 limit) : limit(limit) {}
 
@@ -28,7 +31,7 @@ class MemoryBudget {
     void look();
     bool isExceeded() const;
 
-    Uint64 limit;
+    std::optional<Uint64> limit;
     std::size_t sinceLook = 0;
     Uint64 firstUse = 0;  // 0 before the first look
 };
