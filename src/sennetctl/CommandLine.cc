@@ -45,6 +45,12 @@ CLI::App* addCommand(CLI::App& parent, Choice& choice, const std::string& name,
     return command;
 }
 
+void addTimeout(CLI::App& command, unsigned& seconds, const std::string& whatFor) {
+    command.add_option("--timeout", seconds, whatFor + ", by default 10 s")
+        ->option_text("SECONDS")
+        ->check(CLI::Range(1, 3600));
+}
+
 void addServer(CLI::App& app, Choice& choice) {
     CLI::App* command = addCommand(
         app, choice, "server", "Tell which CIM server sennet reaches and why, and what it has.",
@@ -55,6 +61,7 @@ void addServer(CLI::App& app, Choice& choice) {
     command->add_option("-n,--namespace", options->namespaces, "look for this namespace, too")
         ->option_text("NAMESPACE");
     command->add_flag("--classes", options->listClasses, "list the names of the classes");
+    addTimeout(*command, options->timeoutSeconds, "how long each answer may take");
     command->callback([&choice, options] {
         choice.command = [options](const Output& output) { return showServer(*options, output); };
     });
@@ -96,6 +103,7 @@ void addCheck(CLI::App& app, Choice& choice) {
                      "inventory scripts; by default all that sennet reads")
         ->option_text("SCRIPT...");
     command->add_flag("--offline", options->offline, "ask no CIM server");
+    addTimeout(*command, options->timeoutSeconds, "how long the server's first answer may take");
     command->add_flag("--translations", options->translations,
                       "tell names and sizes that the resource properties lack, too");
     command->callback([&choice, options] {

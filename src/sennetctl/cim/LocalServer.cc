@@ -9,28 +9,40 @@ namespace sennetctl {
 
 using namespace Pegasus;
 
-namespace {
-
 /// Calls the operation; what keeps the server from answering is CannotRun.
 template <typename Operation>
-auto asked(Operation operation) {
+auto LocalServer::asked(Operation operation) {
     try {
         return operation();
     } catch (const CIMException&) {
         throw;
+    } catch (const ConnectionTimeoutException&) {
+        throw CannotRun("the CIM server is connected, but does not answer within " +
+                        std::to_string(timeoutMilliseconds / 1000) + " s");
     } catch (const Exception& failure) {
         throw CannotRun("the CIM server: " + reasonOf(failure));
     }
 }
 
-}  // namespace
-
-LocalServer::LocalServer() {
-    client.setTimeout(kTimeoutMilliseconds);
+LocalServer::LocalServer(Uint32 theTimeoutMilliseconds) {
+    setTimeout(theTimeoutMilliseconds);
     try {
         client.connectLocal();
     } catch (const Exception& failure) {
         throw CannotRun(reasonOf(failure) + " (sennetctl server tells each place that is tried)");
+    }
+}
+
+void LocalServer::setTimeout(Uint32 milliseconds) {
+    timeoutMilliseconds = milliseconds;
+    client.setTimeout(milliseconds);
+}
+
+void LocalServer::requireAnswer() {
+    try {
+        getClass("root/cimv2", "CIM_ManagedElement");
+    } catch (const CIMException&) {
+        // A refusal is an answer.
     }
 }
 

@@ -16,7 +16,14 @@ class LocalServer {
     static constexpr Pegasus::Uint32 kTimeoutMilliseconds = 180000;  // as long as sennet waits
 
     /// Connects.
-    LocalServer();
+    /// @param theTimeoutMilliseconds  for the connection and for each answer
+    explicit LocalServer(Pegasus::Uint32 theTimeoutMilliseconds = kTimeoutMilliseconds);
+
+    /// From now on answers may take so long.
+    void setTimeout(Pegasus::Uint32 milliseconds);
+
+    /// Returns when the server answers something small, be it that it does not know it.
+    void requireAnswer();
 
     Pegasus::CIMClass getClass(const std::string& nameSpace, const std::string& className);
     /// The instances of the class and its subclasses, with all properties.
@@ -26,7 +33,11 @@ class LocalServer {
     std::vector<std::string> classNames(const std::string& nameSpace);
 
   private:
+    template <typename Operation>
+    auto asked(Operation operation);
+
     Pegasus::CIMClient client;
+    Pegasus::Uint32 timeoutMilliseconds = 0;
 };
 
 /// Throws CannotRun when the text is no name of a class or property.

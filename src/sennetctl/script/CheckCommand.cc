@@ -43,6 +43,12 @@ std::vector<std::string> installedScripts() {
 
 /// What is asked of the server for all scripts.
 struct Answers {
+    /// The time-out is for the first answer only: later ones may need a look at the whole machine.
+    explicit Answers(unsigned firstTimeoutMilliseconds) : server(firstTimeoutMilliseconds) {
+        server.requireAnswer();
+        server.setTimeout(LocalServer::kTimeoutMilliseconds);
+    }
+
     LocalServer server;
     MissingValues missing{server};
 };
@@ -57,7 +63,7 @@ class ScriptChecker {
             return;
         }
         try {
-            answers = std::make_unique<Answers>();
+            answers = std::make_unique<Answers>(options.timeoutSeconds * 1000);
             part = ServerPart::Asked;
         } catch (const CannotRun& failure) {
             loseServer(failure, "only the scripts themselves are checked");

@@ -4,104 +4,22 @@
 #include <fmt/format.h>
 #include <pwd.h>
 
-#include <algorithm>
-#include <chrono>
-#include <optional>
 #include <ostream>
 
-#include "cim/CimText.h"
 #include "cim/LocalServer.h"
 #include "report/Json.h"
+#include "report/Progress.h"
 #include "report/Text.h"
 #include "report/TextTable.h"
-#include "report/WholeFile.h"
+#include "server/ServerAnswers.h"
 
 namespace sennetctl {
 
 namespace {
 
-constexpr const char* kUsualNamespaces[] = {"root/cimv2", "root/velmira",    "root/interop",
-                                            "interop",    "root/PG_InterOp", "root"};
-constexpr const char* kInteropNamespaces[] = {"root/interop", "interop", "root/PG_InterOp"};
-
-struct NamespaceContent {
-    std::string name;
-    std::optional<std::vector<std::string>> classes;  // none when the server does not tell
-    std::string failure;
-};
-
 std::string userName(unsigned user) {
     const passwd* entry = ::getpwuid(user);
     return entry == nullptr ? std::to_string(user) : entry->pw_name;
-}
-
-bool isKnown(const std::vector<std::string>& names, const std::string& name) {
-    return std::any_of(names.begin(), names.end(), [&](const std::string& known) {
-        return Pegasus::String::equalNoCase(Pegasus::String(known.c_str()),
-                                            Pegasus::String(name.c_str()));
-    });
-}
-
-void addOnce(std::vector<std::string>& names, const std::string& name) {
-    if (!isKnown(names, name)) {
-        names.push_back(name);
-    }
-}
-
-/// The namespaces that a server tells itself by instances of CIM_Namespace.
-void addToldNamespaces(LocalServer& server, std::vector<std::string>& names) {
-    for (const char* place : kInteropNamespaces) {
-        try {
-            for (const Pegasus::CIMInstance& told : server.instances(place, "CIM_Namespace")) {
-                const Pegasus::Uint32 position = told.findProperty(Pegasus::CIMName("Name"));
-                if (position != Pegasus::PEG_NOT_FOUND) {
-                    addOnce(names, textOf(told.getProperty(position).getValue().toString()));
-                }
-            }
-        } catch (const Pegasus::Exception&) {
-            // Most servers have but one of these namespaces, and some have none.
-            continue;
-        }
-    }
-}
-
-std::vector<NamespaceContent> readNamespaces(LocalServer& server, const ServerOptions& options) {
-    std::vector<std::string> candidates(std::begin(kUsualNamespaces), std::end(kUsualNamespaces));
-    for (const std::string& wanted : options.namespaces) {
-        addOnce(candidates, wanted);
-    }
-    addToldNamespaces(server, candidates);
-    std::vector<NamespaceContent> contents;
-    for (const std::string& name : candidates) {
-        try {
-            contents.push_back({name, server.classNames(name), {}});
-        } catch (const Pegasus::CIMException& failure) {
-            if (failure.getCode() != Pegasus::CIM_ERR_INVALID_NAMESPACE) {
-                contents.push_back({name, std::nullopt, reasonOf(failure)});
-            } else if (isKnown(options.namespaces, name)) {
-                contents.push_back({name, std::nullopt, "the server has no such namespace"});
-            }
-        }
-    }
-    return contents;
-}
-
-/// The shortest of a few requests: the others had to wait for something else.
-double roundTripMilliseconds(LocalServer& server) {
-    constexpr int kRequests = 5;
-    double shortest = 0;
-    for (int i = 0; i < kRequests; ++i) {
-        const auto start = std::chrono::steady_clock::now();
-        try {
-            server.getClass("root/cimv2", "CIM_ManagedElement");
-        } catch (const Pegasus::CIMException&) {
-            // A refusal travels as far.
-        }
-        const std::chrono::duration<double, std::milli> taken =
-            std::chrono::steady_clock::now() - start;
-        shortest = i == 0 ? taken.count() : std::min(shortest, taken.count());
-    }
-    return shortest;
 }
 
 void printPlaces(const Pegasus::LocalServerSearch& search, const Output& output) {
@@ -160,42 +78,72 @@ Json namespacesJson(const std::vector<NamespaceContent>& contents) {
     return all;
 }
 
-int showFailure(const Pegasus::LocalServerSearch& search, const Output& output) {
-    if (output.json) {
-        Json document = Json::object();
-        document["places"] = placesJson(search);
-        document["failure"] = search.failure;
-        printJson(document, output);
-        return kFindings;
+void printAnswers(const ServerAnswers& answers, bool listClasses, const Output& output) {
+    if (answers.roundTripMilliseconds) {
+        output.out << fmt::format("Round trip of a request: {:.2f} ms\n\n",
+                                  *answers.roundTripMilliseconds);
     }
-    printPlaces(search, output);
-    output.out << "No server is reached: " << printable(search.failure) << '\n';
-    return kFindings;
+    if (!answers.namespaces.empty()) {
+        printNamespaces(answers.namespaces, listClasses, output);
+    }
+}
+
+void printFailure(const Pegasus::LocalServerSearch& search, const ServerAnswers& answers,
+                  const Output& output) {
+    if (!search.failure.empty()) {
+        output.out << "No server is reached: " << printable(search.failure) << '\n';
+    } else if (!answers.failure.empty()) {
+        output.out << "No useful answer: " << printable(answers.failure) << '\n';
+    }
+}
+
+Json answersJson(const Pegasus::LocalServerSearch& search, const ServerAnswers& answers) {
+    Json document = Json::object();
+    document["places"] = placesJson(search);
+    if (search.failure.empty()) {
+        document["roundTripMilliseconds"] =
+            answers.roundTripMilliseconds ? Json(*answers.roundTripMilliseconds) : Json(nullptr);
+        document["namespaces"] = namespacesJson(answers.namespaces);
+    }
+    const std::string& failure = search.failure.empty() ? answers.failure : search.failure;
+    if (!failure.empty()) {
+        document["failure"] = failure;
+    }
+    return document;
+}
+
+/// Asks the server that the search has reached, if any, while somebody waits.
+ServerAnswers askReached(const Pegasus::LocalServerSearch& search, const ServerOptions& options,
+                         const Output& output) {
+    if (!search.failure.empty()) {
+        return {};
+    }
+    const Progress progress(output);
+    progress.show("waiting for the server's answers");
+    return askServer(options.namespaces, options.timeoutSeconds * 1000);
 }
 
 }  // namespace
 
 int showServer(const ServerOptions& options, const Output& output) {
+    for (const std::string& name : options.namespaces) {
+        namespaceFrom(name);
+    }
     const Pegasus::LocalServerSearch search =
-        Pegasus::searchLocalServer(LocalServer::kTimeoutMilliseconds);
-    if (!search.failure.empty()) {
-        return showFailure(search, output);
+        Pegasus::searchLocalServer(options.timeoutSeconds * 1000);
+    if (!output.json) {
+        printPlaces(search, output);
+        output.out << std::flush;
     }
-    LocalServer server;
-    const std::vector<NamespaceContent> contents = readNamespaces(server, options);
-    const double milliseconds = roundTripMilliseconds(server);
+    const ServerAnswers answers = askReached(search, options, output);
     if (output.json) {
-        Json document = Json::object();
-        document["places"] = placesJson(search);
-        document["roundTripMilliseconds"] = milliseconds;
-        document["namespaces"] = namespacesJson(contents);
-        printJson(document, output);
-        return kFine;
+        printJson(answersJson(search, answers), output);
+    } else {
+        printAnswers(answers, options.listClasses, output);
+        printFailure(search, answers, output);
     }
-    printPlaces(search, output);
-    output.out << fmt::format("Round trip of a request: {:.2f} ms\n\n", milliseconds);
-    printNamespaces(contents, options.listClasses, output);
-    return kFine;
+    const bool fine = search.failure.empty() && answers.failure.empty() && !answers.lacksWanted;
+    return fine ? kFine : kFindings;
 }
 
 }  // namespace sennetctl

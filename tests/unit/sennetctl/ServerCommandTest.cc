@@ -5,6 +5,7 @@
 
 #include "CapturedOutput.h"
 #include "FanServer.h"
+#include "report/WholeFile.h"
 #include "support/TempDirectory.h"
 
 namespace sennetctl {
@@ -63,9 +64,52 @@ TEST_F(ServerCommandTest, ListsClassesWhenAsked) {
 TEST_F(ServerCommandTest, TellsThatAWantedNamespaceIsNotThere) {
     fans.server.onNext(Reply::cimError(3, "none"));
     fans.server.onNext(Reply::cimError(3, "none"));
-    EXPECT_EQ(showServer({{"root/mine", "ROOT/CIMV2"}, false}, output.plain()), 0);
+    EXPECT_EQ(showServer({{"root/mine", "ROOT/CIMV2"}, false}, output.plain()), 1);
     EXPECT_THAT(output.text(), HasSubstr("root/mine   the server has no such namespace\n"));
     EXPECT_THAT(output.text(), Not(HasSubstr("root/own")));
+}
+
+TEST(ServerCommandOfASilentServerTest, ThePlacesAreToldAndThatItDoesNotAnswer) {
+    FanServer fans;
+    ServerOptions options;
+    options.timeoutSeconds = 1;
+    for (int i = 0; i < 2; ++i) {
+        fans.server.onNext(Reply::silence());
+    }
+    CapturedOutput output;
+    EXPECT_EQ(showServer(options, output.plain()), 1);
+    EXPECT_THAT(output.text(), HasSubstr("*  " + fans.server.socketPath() + "  "));
+    EXPECT_THAT(output.text(), HasSubstr("\nNo useful answer: the CIM server is connected, but "
+                                         "does not answer within 1 s\n"));
+    CapturedOutput json;
+    EXPECT_EQ(showServer(options, json.json()), 1);
+    EXPECT_EQ(json.document()["places"][0]["result"], "connected");
+    EXPECT_EQ(json.document()["failure"],
+              "the CIM server is connected, but does not answer within 1 s");
+}
+
+TEST_F(ServerCommandTest, WhatWasAnsweredBeforeTheFailureIsTold) {
+    fans.server.onNext(Reply::closeAtOnce());
+    EXPECT_EQ(showServer({}, output.plain()), 1);
+    EXPECT_THAT(output.text(), HasSubstr("NAMESPACE   CLASSES\nroot/cimv2  2\n"));
+    EXPECT_THAT(output.text(), HasSubstr("\nNo useful answer: the CIM server: "));
+    EXPECT_THAT(output.text(), Not(HasSubstr("Round trip")));
+}
+
+TEST_F(ServerCommandTest, AWantedNamespaceHasALegalName) {
+    EXPECT_THROW(showServer({{"root//mine"}, false}, output.plain()), CannotRun);
+    EXPECT_EQ(output.text(), "");
+}
+
+TEST(ServerCommandOfAnOddServerTest, AToldNamespaceThatIsNoneIsPassedOver) {
+    FanServer fans;
+    fans.server.onNext(
+        Reply::ok(instanceXml("CIM_Namespace", "n",
+                              "<PROPERTY NAME=\"Name\" TYPE=\"string\"><VALUE>root//own</VALUE>"
+                              "</PROPERTY>")));
+    CapturedOutput output;
+    EXPECT_EQ(showServer({}, output.plain()), 0);
+    EXPECT_THAT(output.text(), Not(HasSubstr("root//own")));
 }
 
 TEST(ServerCommandWithoutServerTest, TellsEachPlaceAndTheReason) {
