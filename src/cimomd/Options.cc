@@ -101,7 +101,8 @@ void addSources(CLI::App& app, Options& options) {
 
 void addLimits(CLI::App& app, HttpLimits& limits) {
     app.add_option("--max-connections", limits.maxConnections,
-                   "further connections wait (not with --fd)")
+                   "connections at a time, an eighth of them for root and the server's own user "
+                   "(not with --fd)")
         ->check(CLI::Range(1, 10000))
         ->capture_default_str();
     app.add_option_function<unsigned>(

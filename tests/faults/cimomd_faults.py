@@ -347,62 +347,6 @@ def _(trial):
     return f"refused; afterwards the memory is what it was, within {MAX_GROWTH_BYTES // MIB} MiB"
 
 
-MAX_CONNECTIONS = 8
-
-
-def hold_connections(path, ready):
-    """Silent connections of another user, more than there is room for."""
-    held = []
-    for _ in range(2 * MAX_CONNECTIONS):
-        held.append(socket.socket(socket.AF_UNIX))
-        held[-1].connect(path)
-    os.write(ready, b"!")
-    time.sleep(rows.PATIENCE_S)
-
-
-def is_answered(path):
-    with socket.socket(socket.AF_UNIX) as connection:
-        connection.connect(path)
-        try:
-            return exchange(connection, post(call("EnumerateClassNames"))).startswith(
-                b"HTTP/1.1 200")
-        except (BrokenPipeError, ConnectionResetError):
-            return False
-
-
-def ask_one_after_another(path):
-    """Its connections count until the server has noticed their ends."""
-    return all(waited(lambda: is_answered(path)) for _ in range(2 * MAX_CONNECTIONS))
-
-
-@SUITE.case("another user opens more silent connections than there is room for")
-def _(trial):
-    neighbours.need()
-    with rows.place() as place:
-        pathlib.Path(place).chmod(0o755)
-        path = str(pathlib.Path(place) / "s")
-        server = Server(pathlib.Path(place), trial.bin / "cimomd", "--http", "127.0.0.1:0",
-                        "--socket", path, "--socket-mode", "0666", "--root", neighbours.MACHINE,
-                        "--max-connections", str(MAX_CONNECTIONS), "--idle-timeout", "3600")
-        try:
-            server.port()
-            trial.count()
-            expect(neighbours.as_stranger(ask_one_after_another, path),
-                   "connections that have ended count")
-            seen, ready = os.pipe()
-            neighbours.Deed(hold_connections, path, ready)
-            os.read(seen, 1)
-            for number in range(20):
-                with socket.socket(socket.AF_UNIX) as connection:
-                    connection.settimeout(rows.PATIENCE_S)
-                    connection.connect(path)
-                    octets = exchange(connection, post(call("EnumerateClassNames")), 20)
-                expect(octets.startswith(b"HTTP/1.1 200"), f"request {number}: {octets[:99]!r}")
-        finally:
-            server.end()
-    return "half of the room is the most that it gets; the others are served"
-
-
 def ask_at_once(daemon, names):
     connections = []
     for name in names:

@@ -4,33 +4,29 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
-#include <algorithm>
-#include <atomic>
 #include <chrono>
 #include <stdexcept>
 #include <string>
 #include <utility>
 
+#include "protocol/ConnectionPlaces.h"
 #include "protocol/ConnectionWatch.h"
 #include "protocol/PercentCoding.h"
 #include "protocol/RequestHead.h"
-#include "protocol/UserShares.h"
 
 namespace cimomd {
 
 struct HttpServer::State {
     State(const CimService& cimService, HttpLimits httpLimits)
-        : service(cimService),
-          limits(httpLimits),
-          shares(std::max<std::size_t>(httpLimits.maxConnections / 2, 1)) {}
+        : service(cimService), limits(httpLimits), places(httpLimits.maxConnections) {}
 
     const CimService& service;
     HttpLimits limits;
     std::function<void()> closed;
     ConnectionWatch watch;
-    UserShares shares;
-    /// Handed to the library, which takes them up in its own time, and not closed yet.
-    std::atomic<std::size_t> connections = 0;
+    /// Taken from when a connection is handed to the library, which takes it up in its own time,
+    /// until it is closed.
+    ConnectionPlaces places;
     MHD_Daemon* daemon = nullptr;
 
     MHD_Result handle(MHD_Connection* connection, const char* url, const char* method,
@@ -93,6 +89,10 @@ WatchedConnection* watchedOf(MHD_Connection* connection) {
     const MHD_ConnectionInfo* info =
         MHD_get_connection_info(connection, MHD_CONNECTION_INFO_SOCKET_CONTEXT);
     return static_cast<WatchedConnection*>(info->socket_context);
+}
+
+int socketOf(MHD_Connection* connection) {
+    return MHD_get_connection_info(connection, MHD_CONNECTION_INFO_CONNECTION_FD)->connect_fd;
 }
 
 void addTrailers(const Sending& sending) {
@@ -233,16 +233,12 @@ void HttpServer::start(std::function<void()> closed) {
                             MHD_ConnectionNotificationCode code) {
         auto* server = static_cast<State*>(closure);
         if (code == MHD_CONNECTION_NOTIFY_STARTED) {
-            WatchedConnection* watched = server->watch.add(
-                MHD_get_connection_info(connection, MHD_CONNECTION_INFO_CONNECTION_FD)->connect_fd);
+            WatchedConnection* watched = server->watch.add(socketOf(connection));
             watched->expectProgress(server->limits.patience);
             *socketContext = watched;
         } else {
-            server->shares.giveBack(UserShares::limitedUser(
-                MHD_get_connection_info(connection, MHD_CONNECTION_INFO_CONNECTION_FD)
-                    ->connect_fd));
             server->watch.remove(static_cast<WatchedConnection*>(*socketContext));
-            --server->connections;
+            server->places.giveBack(Peer::of(socketOf(connection)));
             server->closed();
         }
     };
@@ -261,29 +257,27 @@ void HttpServer::start(std::function<void()> closed) {
 }
 
 bool HttpServer::serve(int connectedSocket) {
-    sockaddr_storage peer{};
-    socklen_t length = sizeof peer;
-    const auto user = UserShares::limitedUser(connectedSocket);
-    if (::getpeername(connectedSocket, reinterpret_cast<sockaddr*>(&peer), &length) != 0 ||
-        !state->shares.take(user)) {
+    sockaddr_storage address{};
+    socklen_t length = sizeof address;
+    const Peer peer = Peer::of(connectedSocket);
+    if (::getpeername(connectedSocket, reinterpret_cast<sockaddr*>(&address), &length) != 0 ||
+        !state->places.take(peer)) {
         ::close(connectedSocket);
         return false;
     }
-    ++state->connections;
-    if (MHD_add_connection(state->daemon, connectedSocket, reinterpret_cast<sockaddr*>(&peer),
+    if (MHD_add_connection(state->daemon, connectedSocket, reinterpret_cast<sockaddr*>(&address),
                            length) == MHD_YES)
         return true;
-    --state->connections;
-    state->shares.giveBack(user);
+    state->places.giveBack(peer);
     return false;
 }
 
 std::size_t HttpServer::connections() const {
-    return state->connections;
+    return state->places.taken();
 }
 
-bool HttpServer::hasRoom() const {
-    return connections() < state->limits.maxConnections;
+bool HttpServer::hasRoomAt(int listeningSocket) const {
+    return tellsUser(listeningSocket) ? state->places.hasAny() : state->places.hasForUnknown();
 }
 
 void HttpServer::closeOverdue() {

@@ -33,12 +33,13 @@ class HttpServer {
     void stop();
 
     /// Serves a connected stream socket and closes it at its end, also when false says that it
-    /// cannot be served. A user at a Unix socket who is neither root nor this process's gets half
-    /// of the room at most.
+    /// cannot be served or that there is no place left for its user (ConnectionPlaces).
     bool serve(int connectedSocket);
 
     std::size_t connections() const;
-    bool hasRoom() const;
+    /// Whether some peer at this socket would be served. Where users are told, one has to be
+    /// accepted to know.
+    bool hasRoomAt(int listeningSocket) const;
     /// Ends the connections of clients that are too slow. To be called now and then.
     void closeOverdue();
 

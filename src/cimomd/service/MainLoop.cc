@@ -24,6 +24,8 @@ constexpr int kWatchEveryMs = 500;
 constexpr unsigned kEndSeconds = 5;
 // Without descriptors or memory there is no use in trying again at once.
 constexpr auto kPauseAfterFailure = std::chrono::milliseconds(200);
+// Who connects again and again must not keep the loop from its other work.
+constexpr int kConnectionsInARow = 64;
 
 void logPeer(int connection, const sockaddr_storage& address) {
     ucred peer{};
@@ -75,9 +77,11 @@ void MainLoop::run(const std::function<void()>& reload) {
 
 void MainLoop::wait() {
     std::vector<pollfd> descriptors{{signals.descriptor(), POLLIN, 0}, {ended, POLLIN, 0}};
-    if (server.hasRoom() && Clock::now() >= acceptAgain) {
-        for (const int listener : listeners)
-            descriptors.push_back({listener, POLLIN, 0});
+    if (Clock::now() >= acceptAgain) {
+        for (const int listener : listeners) {
+            if (server.hasRoomAt(listener))
+                descriptors.push_back({listener, POLLIN, 0});
+        }
     }
     ::poll(descriptors.data(), descriptors.size(), onlyOne ? -1 : kWatchEveryMs);
     std::uint64_t count = 0;
@@ -85,7 +89,7 @@ void MainLoop::wait() {
 }
 
 void MainLoop::acceptFrom(int listeningSocket) {
-    while (server.hasRoom()) {
+    for (int i = 0; i < kConnectionsInARow && server.hasRoomAt(listeningSocket); ++i) {
         sockaddr_storage address{};
         socklen_t length = sizeof address;
         const int connection = ::accept4(listeningSocket, reinterpret_cast<sockaddr*>(&address),
