@@ -31,7 +31,8 @@ class Chromium:
              "--no-first-run", "--disable-background-networking", "--remote-debugging-pipe",
              f"--user-data-dir={self.profile.name}", "about:blank"],
             pass_fds=(commands, answers), stdin=subprocess.DEVNULL, stdout=subprocess.DEVNULL,
-            stderr=subprocess.DEVNULL, env={**os.environ, "HOME": self.profile.name})
+            stderr=subprocess.DEVNULL,
+            env={**os.environ, "HOME": self.profile.name, "TMPDIR": self.profile.name})
         os.close(commands)
         os.close(answers)
         self.bytes = b""
