@@ -1,29 +1,23 @@
-// The syntax of key/value files (see PropertiesFile), apart from where their bytes come from.
+// What becomes of the entries of key/value files (see PropertiesFile).
 #pragma once
 
-#include <string>
 #include <string_view>
 
 #include "Velm/Properties.h"
+#include "properties/PropertiesEntries.h"
 
 namespace Velm {
 
 class PropertiesParser {
   public:
     // Parses the bytes of a whole file; they must stay alive as long as this object.
-    explicit PropertiesParser(std::string_view text);
+    explicit PropertiesParser(std::string_view text) : entries(text) {}
 
-    // The key/value set of the text. Every text is accepted.
+    // The key/value set of the text, to be called once. Every text is accepted.
     Properties parse();
 
   private:
-    bool atEnd() const { return position >= text.size(); }
-    std::string_view takeLine();
-    std::string_view takeContinuedLine();
-
-    std::string_view text;
-    std::size_t position = 0;
-    std::string joined;
+    PropertiesEntries entries;
 };
 
 }  // namespace Velm
