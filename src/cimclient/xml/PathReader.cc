@@ -17,6 +17,11 @@ namespace Pegasus {
 
 namespace {
 
+// A reference becomes text when it is a key, with all quotation marks and backslashes doubled, and
+// that again in the next one around it: a small document could make gigabytes of them.
+constexpr unsigned kMostReferences = 4;
+constexpr Uint32 kMostReferenceCharacters = 65536;
+
 CIMKeyBinding::Type keyType(const ElementReader& reader) {
     const std::string_view type = reader.attribute("VALUETYPE").value_or("string");
     if (type == "string") {
@@ -166,9 +171,22 @@ CIMKeyBinding PathReader::readKey(const CIMName& name) {
         return readKeyValue(name);
     }
     if (reader.is("VALUE.REFERENCE")) {
-        return CIMKeyBinding(name, readReference().toString(), CIMKeyBinding::REFERENCE);
+        return CIMKeyBinding(name, readReferenceKey(), CIMKeyBinding::REFERENCE);
     }
     reader.failUnexpected("KEYBINDING, KEYVALUE or VALUE.REFERENCE");
+}
+
+String PathReader::readReferenceKey() {
+    if (references == kMostReferences) {
+        reader.fail("there are too many references inside each other");
+    }
+    ++references;
+    String text = readReference().toString();
+    --references;
+    if (text.size() > kMostReferenceCharacters) {
+        reader.fail("a key's reference is too long");
+    }
+    return text;
 }
 
 CIMKeyBinding PathReader::readKeyValue(const CIMName& name) {

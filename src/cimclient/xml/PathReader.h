@@ -42,7 +42,8 @@ class PathReader {
     /// CLASSNAME.
     CIMName readClassName();
     /// INSTANCENAME: a path of class name and keys. One key without a name, which the grammar
-    /// allows, gets a null name.
+    /// allows, gets a null name. Keys may be references of up to 65,536 characters, whose keys may
+    /// be such again, four inside each other.
     CIMObjectPath readInstanceName();
     /// VALUE.REFERENCE, with any of the six kinds of path in it.
     CIMObjectPath readReference();
@@ -59,6 +60,7 @@ class PathReader {
     void readHost(CIMObjectPath& path);
     CIMKeyBinding readKeyBinding();
     CIMKeyBinding readKey(const CIMName& name);
+    String readReferenceKey();
     CIMKeyBinding readKeyValue(const CIMName& name);
     CIMKeyBinding makeKey(const CIMName& name, CIMKeyBinding::Type type,
                           const ElementText& text) const;
@@ -69,6 +71,8 @@ class PathReader {
     ElementReader& reader;
     DecodeContext& context;
     std::vector<KnownKey>* known;
+    /// Of keys, inside each other, at this place.
+    unsigned references = 0;
 };
 
 }  // namespace Pegasus

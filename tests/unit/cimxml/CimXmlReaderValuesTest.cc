@@ -379,6 +379,38 @@ TEST(CimXmlReaderValues, InstanceNamesWithoutKeyBindings) {
     EXPECT_EQ(utf8(path.getKeyBindings()[0].getValue()), "v");
 }
 
+/// A reference to an instance whose key is a reference, and so on.
+std::string referenceThrough(int count, const std::string& innermost) {
+    std::string path = innermost;
+    for (int i = 0; i < count; ++i) {
+        path = "<INSTANCENAME CLASSNAME=\"C\">" + inReference(path) + "</INSTANCENAME>";
+    }
+    return inReference(path);
+}
+
+std::string instanceNameWithKey(const std::string& text) {
+    return "<INSTANCENAME CLASSNAME=\"D\"><KEYVALUE>" + text + "</KEYVALUE></INSTANCENAME>";
+}
+
+// Each one in another doubles the quotation marks and backslashes of its text.
+TEST(CimXmlReaderValues, ReferencesInKeysAreBounded) {
+    const auto refuse = [](const std::string& reference) {
+        return refusal("<PROPERTY.REFERENCE NAME=\"P\">" + reference + "</PROPERTY.REFERENCE>");
+    };
+    const std::string instance = "<INSTANCENAME CLASSNAME=\"D\"/>";
+    EXPECT_EQ(reference(referenceThrough(2, instance)), "C.=\"C.=\\\"D\\\"\"");
+    EXPECT_EQ(reference(referenceThrough(4, instance)).size(), 43U);
+    EXPECT_TRUE(contains(refuse(referenceThrough(5, instance)), "too many references"));
+    EXPECT_TRUE(contains(refuse(referenceThrough(20, instance)), "too many references"));
+
+    // D.="..." has five characters more than its text.
+    const std::string longest(65536 - 5, 'x');
+    EXPECT_EQ(reference(referenceThrough(1, instanceNameWithKey(longest))).size(), 65536 + 5 + 2U);
+    EXPECT_TRUE(contains(refuse(referenceThrough(1, instanceNameWithKey(longest + "x"))),
+                         "reference is too long"));
+    EXPECT_EQ(reference(referenceThrough(0, instanceNameWithKey(longest + "x"))).size(), 65537U);
+}
+
 TEST(CimXmlReaderValues, KeysRefuse) {
     const auto refuse = [](const std::string& keys) {
         return refusal(
