@@ -106,6 +106,8 @@ void addCheck(CLI::App& app, Choice& choice) {
     addTimeout(*command, options->timeoutSeconds, "how long the server's first answer may take");
     command->add_flag("--translations", options->translations,
                       "tell names and sizes that the resource properties lack, too");
+    command->add_flag("-v,--verbose", options->verbose,
+                      "tell which configuration, directory and resource properties are used, too");
     command->callback([&choice, options] {
         choice.command = [options](const Output& output) { return checkScripts(*options, output); };
     });

@@ -97,11 +97,15 @@ const char* nameOf(Severity severity) {
 }
 
 int printFindings(const std::vector<Finding>& findings, const std::vector<std::string>& files,
-                  const Output& output, ServerPart server) {
+                  const Output& output, ServerPart server,
+                  const std::vector<std::pair<std::string, std::string>>& basis) {
     const std::size_t errors = countOf(findings, Severity::Error);
     const std::size_t warnings = countOf(findings, Severity::Warning);
     if (output.json) {
         Json document = Json::object();
+        for (const auto& [name, value] : basis) {
+            document[name] = value;
+        }
         document["files"] = files;
         document["findings"] = Json::array();
         for (const Finding& finding : findings) {

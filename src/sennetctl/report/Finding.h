@@ -3,6 +3,7 @@
 // What a command found in a file, and how it is told.
 
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "report/Output.h"
@@ -28,9 +29,10 @@ struct Finding {
 enum class ServerPart { NotConcerned, Asked, NotAsked, BrokeDown };
 
 /// Prints each finding as "file:line:column: severity: message" and then how many there are, or all
-/// as JSON, and whether a server was asked. `files` are those that were looked at. Returns the exit
-/// status.
+/// as JSON, and whether a server was asked. `files` are those that were looked at; `basis` are
+/// members that only the JSON document has, name and value. Returns the exit status.
 int printFindings(const std::vector<Finding>& findings, const std::vector<std::string>& files,
-                  const Output& output, ServerPart server = ServerPart::NotConcerned);
+                  const Output& output, ServerPart server = ServerPart::NotConcerned,
+                  const std::vector<std::pair<std::string, std::string>>& basis = {});
 
 }  // namespace sennetctl

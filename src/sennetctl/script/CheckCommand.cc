@@ -1,14 +1,16 @@
 #include "script/CheckCommand.h"
 
 #include <Velm/DirectoryReader.h>
-#include <Velm/PlatformUtilities.h>
 #include <Velm/PropertiesFile.h>
 
 #include <algorithm>
+#include <filesystem>
 #include <map>
 #include <memory>
 #include <ostream>
+#include <system_error>
 #include <tuple>
+#include <utility>
 
 #include "cim/LocalServer.h"
 #include "report/Finding.h"
@@ -17,6 +19,7 @@
 #include "report/WholeFile.h"
 #include "script/MissingValues.h"
 #include "script/NameCheck.h"
+#include "script/PropertiesLint.h"
 #include "script/ScriptLint.h"
 #include "script/ScriptReader.h"
 #include "script/ServerCheck.h"
@@ -27,18 +30,20 @@ namespace {
 
 constexpr std::size_t kLargestScriptOctets = std::size_t(1) << 20;
 
-std::vector<std::string> installedScripts() {
-    const char* directory = Velm::PlatformUtilities::getSennetDirectory();
-    const Velm::DirectoryReader reader(directory, ".script.inv");
+std::vector<std::string> scriptsIn(const std::string& directory) {
+    const Velm::DirectoryReader reader(directory.c_str(), ".script.inv");
     std::vector<std::string> scripts;
     scripts.reserve(static_cast<std::size_t>(reader.getNumberOfFiles()));
     for (int i = 0; i < reader.getNumberOfFiles(); ++i) {
         scripts.emplace_back(reader.getFileName(i));
     }
-    if (scripts.empty()) {
-        throw CannotRun(std::string("there are no inventory scripts in ") + directory);
-    }
     return scripts;
+}
+
+void sortByPlace(std::vector<Finding>& findings) {
+    std::stable_sort(findings.begin(), findings.end(), [](const Finding& one, const Finding& two) {
+        return std::tie(one.line, one.column) < std::tie(two.line, two.column);
+    });
 }
 
 /// What is asked of the server for all scripts.
@@ -55,10 +60,18 @@ struct Answers {
 
 class ScriptChecker {
   public:
-    /// Reaches the server unless the options forbid it.
     explicit ScriptChecker(const CheckOptions& theOptions)
-        : options(theOptions), texts(Velm::PlatformUtilities::getSennetResourceFile()) {
+        : options(theOptions), texts(options.places.resources.c_str()) {
+        std::vector<Finding> found;
+        checkConfiguration(options.places, found);
+        takeOver(found);
+        hasTexts = checkResources(options.places, found);
+        takeOver(found);
         texts.load();
+    }
+
+    /// Unless the options forbid it.
+    void reachServer() {
         if (options.offline) {
             return;
         }
@@ -68,6 +81,19 @@ class ScriptChecker {
         } catch (const CannotRun& failure) {
             loseServer(failure, "only the scripts themselves are checked");
         }
+    }
+
+    /// The scripts of the installation.
+    std::vector<std::string> listScripts() {
+        const std::string& directory = options.places.scriptDirectory;
+        const std::vector<std::string> scripts = scriptsIn(directory);
+        std::error_code error;
+        if (!std::filesystem::is_directory(directory, error)) {
+            troubles.push_back("there is no directory " + directory + " of inventory scripts");
+        } else if (scripts.empty()) {
+            troubles.push_back("there are no inventory scripts in " + directory);
+        }
+        return scripts;
     }
 
     void check(const std::string& file) {
@@ -80,23 +106,38 @@ class ScriptChecker {
         }
         files.push_back(file);
         std::vector<Finding> found = findingsIn(file, octets);
-        std::stable_sort(found.begin(), found.end(), [](const Finding& one, const Finding& two) {
-            return std::tie(one.line, one.column) < std::tie(two.line, two.column);
-        });
-        findings.insert(findings.end(), found.begin(), found.end());
+        takeOver(found);
     }
 
     /// Returns the exit status, which is kCannotRun where some script was not read.
     int tell(std::size_t wanted, const Output& output) const {
+        const Basis basis = {{"configuration", options.places.configuration},
+                             {"directory", options.places.scriptDirectory},
+                             {"resources", options.places.resources}};
+        if (options.verbose && !output.json) {
+            for (const auto& [name, path] : basis) {
+                output.out << name << ": " << printable(path) << '\n';
+            }
+        }
         for (const std::string& trouble : troubles) {
             output.err << "sennetctl: " << printable(trouble) << '\n';
         }
-        const int status =
-            files.empty() ? kCannotRun : printFindings(findings, files, output, part);
-        return files.size() < wanted ? kCannotRun : status;
+        const int status = files.empty() && findings.empty()
+                               ? kCannotRun
+                               : printFindings(findings, files, output, part, basis);
+        return files.empty() || files.size() < wanted ? kCannotRun : status;
     }
 
   private:
+    using Basis = std::vector<std::pair<std::string, std::string>>;
+
+    /// Findings of one file.
+    void takeOver(std::vector<Finding>& found) {
+        sortByPlace(found);
+        findings.insert(findings.end(), found.begin(), found.end());
+        found.clear();
+    }
+
     std::vector<Finding> findingsIn(const std::string& file, std::string_view octets) {
         std::vector<Finding> found;
         ScriptModel model = ScriptReader(file, found).read(octets);
@@ -105,7 +146,7 @@ class ScriptChecker {
         if (answers && !model.givenUp) {
             askServer(model, found);
         }
-        if (options.translations) {
+        if (options.translations && hasTexts) {
             checkTranslations(model, texts.getProperties(), found);
         }
         return found;
@@ -126,7 +167,7 @@ class ScriptChecker {
     void askServer(ScriptModel& model, std::vector<Finding>& found) {
         try {
             ServerCheck(answers->server, answers->missing, texts.getProperties(),
-                        options.translations, found)
+                        {hasTexts && options.translations, hasTexts}, found)
                 .check(model);
         } catch (const CannotRun& failure) {
             loseServer(failure,
@@ -143,6 +184,7 @@ class ScriptChecker {
 
     const CheckOptions& options;
     Velm::PropertiesFile texts;
+    bool hasTexts = false;             // without them each name would be told
     std::unique_ptr<Answers> answers;  // none when there is no server
     ServerPart part = ServerPart::NotAsked;
     std::map<std::string, std::string> fileOfTitle;
@@ -154,10 +196,11 @@ class ScriptChecker {
 }  // namespace
 
 int checkScripts(const CheckOptions& options, const Output& output) {
-    const std::vector<std::string> files =
-        options.scripts.empty() ? installedScripts() : options.scripts;
     ScriptChecker checker(options);
-    {
+    const std::vector<std::string> files =
+        options.scripts.empty() ? checker.listScripts() : options.scripts;
+    if (!files.empty()) {
+        checker.reachServer();
         const Progress progress(output);
         for (std::size_t i = 0; i < files.size(); ++i) {
             progress.show("script " + std::to_string(i + 1) + " of " +

@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "report/Output.h"
+#include "script/Places.h"
 
 namespace sennetctl {
 
@@ -14,11 +15,14 @@ struct CheckOptions {
     bool offline = false;              // asks no server
     bool translations = false;         // tells missing names and sizes, too
     unsigned timeoutSeconds = 10;      // for the server's first answer
+    bool verbose = false;              // tells the places, too
+    Places places = placesInUse();
 };
 
-/// Prints the findings. A server that cannot be reached or does not answer is told on standard
-/// error, and then only the scripts themselves are checked. Throws CannotRun when a script cannot
-/// be read.
+/// Prints the findings, those about the configuration and the resource properties first. A server
+/// that cannot be reached or does not answer is told on standard error, and then only the scripts
+/// themselves are checked. Returns the exit status, which is kCannotRun where some script was not
+/// read.
 int checkScripts(const CheckOptions& options, const Output& output);
 
 }  // namespace sennetctl

@@ -20,12 +20,18 @@ bool hasQualifier(const Column& column, const char* name) {
     return column.declared && column.declared->findQualifier(CIMName(name)) != PEG_NOT_FOUND;
 }
 
+/// What the resource properties give; null for nothing.
+const char* givenSize(const Column& column, const AnsweredClass& answered,
+                      const Velm::Properties& texts) {
+    const std::string key =
+        textOf(answered.definition.getClassName()) + "." + textOf(column.name) + ".Size";
+    return texts.getPropertyValue(key.c_str());
+}
+
 /// The size that the resource properties give, else the class; 0 for none.
 std::size_t declaredSize(const Column& column, const AnsweredClass& answered,
                          const Velm::Properties& texts) {
-    const std::string key =
-        textOf(answered.definition.getClassName()) + "." + textOf(column.name) + ".Size";
-    if (const char* size = texts.getPropertyValue(key.c_str())) {
+    if (const char* size = givenSize(column, answered, texts)) {
         return std::strtoul(size, nullptr, 10);
     }
     if (!hasQualifier(column, "MaxLen")) {
@@ -137,7 +143,7 @@ std::vector<std::string> lossesIn(const Column& column, const AnsweredClass& ans
 }
 
 bool lacksSize(const Column& column, const AnsweredClass& answered, const Velm::Properties& texts) {
-    if (!column.declared || column.declared->isArray()) {
+    if (!column.declared || column.declared->isArray() || givenSize(column, answered, texts)) {
         return false;
     }
     const CIMType type = column.declared->getType();

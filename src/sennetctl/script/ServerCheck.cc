@@ -31,7 +31,9 @@ void ServerCheck::check(ScriptModel& model) {
     for (const AnsweredClass& answered : classes) {
         checkColumns(model, answered);
     }
-    checkNames(model, classes, texts, findings);
+    if (scope.names) {
+        checkNames(model, classes, texts, findings);
+    }
 }
 
 std::optional<AnsweredClass> ServerCheck::ask(const ScriptModel& model, ScriptSlot& slot) {
@@ -98,7 +100,7 @@ void ServerCheck::checkColumns(const ScriptModel& model, const AnsweredClass& an
         for (const std::string& message : lossesIn(*column, answered, texts)) {
             add(model, property, Severity::Warning, message);
         }
-        if (wantSizes && lacksSize(*column, answered, texts)) {
+        if (scope.sizes && lacksSize(*column, answered, texts)) {
             add(model, property, Severity::Warning,
                 "neither the class nor the resource properties (" + nameOf(answered) + "." +
                     property.value + ".Size) give a size: 255 are taken");

@@ -18,14 +18,16 @@ namespace sennetctl {
 
 class ServerCheck {
   public:
-    /// All must outlive the check. Where `wantSizes`, columns without a size are told, too.
+    /// What is told besides classes, properties and values.
+    struct Scope {
+        bool sizes = false;  ///< columns whose size is a guess
+        bool names = true;   ///< what becomes of titles and names
+    };
+
+    /// All must outlive the check.
     ServerCheck(LocalServer& server, MissingValues& missing, const Velm::Properties& texts,
-                bool wantSizes, std::vector<Finding>& findings)
-        : server(server),
-          missing(missing),
-          texts(texts),
-          wantSizes(wantSizes),
-          findings(findings) {}
+                Scope scope, std::vector<Finding>& findings)
+        : server(server), missing(missing), texts(texts), scope(scope), findings(findings) {}
 
     /// Appends the findings for a script that the generator does not give up, and enters how the
     /// server spells the classes. Throws CannotRun when the server breaks down.
@@ -41,7 +43,7 @@ class ServerCheck {
     LocalServer& server;
     MissingValues& missing;
     const Velm::Properties& texts;
-    bool wantSizes;
+    Scope scope;
     std::vector<Finding>& findings;
 };
 

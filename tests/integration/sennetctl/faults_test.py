@@ -73,7 +73,8 @@ class FaultsTest(unittest.TestCase):
         cls.place = pathlib.Path(cls.enterClassContext(
             tempfile.TemporaryDirectory(prefix="sennet-faults-")))
         (cls.place / "mof.d").mkdir()
-        (cls.place / "velm.properties").touch()
+        (cls.place / "texts").touch()
+        (cls.place / "velm.properties").write_text(f"sennet.resources={cls.place}/texts\n")
         programs = installation.programs_of(ARGUMENTS)
         cls.server = cls.enterClassContext(installation.Cimomd(
             programs, cls.place, ARGUMENTS.machines.resolve() / "server", cls.place / "mof.d"))

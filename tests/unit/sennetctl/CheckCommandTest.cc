@@ -17,15 +17,22 @@ constexpr const char* kGood = "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=CIM_Fan\nA[0]=
 
 class CheckCommandTest : public testing::Test {
   protected:
+    /// With resource properties that say nothing.
+    CheckOptions wanted(const std::vector<std::string>& scripts, bool offline = false,
+                        bool translations = false) const {
+        return {scripts, offline, translations, 10, false, places};
+    }
+
     FanServer fans;
     support::TempDirectory directory;
+    Places places{directory.path("none"), false, directory.path(""), directory.write("texts", "")};
     CapturedOutput output;
 };
 
 TEST_F(CheckCommandTest, FindingsStandInTheOrderOfTheLines) {
     const std::string file = directory.write(
         "x.script.inv", "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=CIM_Fan\nA[0]=DeviceID\nnonsense\n");
-    EXPECT_EQ(checkScripts({{file}, false, false}, output.plain()), 1);
+    EXPECT_EQ(checkScripts(wanted({file}, false, false), output.plain()), 1);
     EXPECT_EQ(output.text(),
               file + ":4:6: note: CIM_Fan: 2 instances\n" + file +
                   ":6:1: warning: line without effect: an entry is G[n]=class, N[n]=namespace or "
@@ -34,7 +41,7 @@ TEST_F(CheckCommandTest, FindingsStandInTheOrderOfTheLines) {
 
 TEST_F(CheckCommandTest, OfflineAsksNoServer) {
     const std::string file = directory.write("x.script.inv", kGood);
-    EXPECT_EQ(checkScripts({{file}, true, false}, output.plain()), 0);
+    EXPECT_EQ(checkScripts(wanted({file}, true, false), output.plain()), 0);
     EXPECT_EQ(output.text(), "1 file: 0 errors, 0 warnings (no server was asked)\n");
     EXPECT_EQ(fans.server.connectionCount(), 0U);
 }
@@ -42,7 +49,7 @@ TEST_F(CheckCommandTest, OfflineAsksNoServer) {
 TEST_F(CheckCommandTest, WithoutAServerTheScriptsAreChecked) {
     fans.server.stop();
     const std::string file = directory.write("x.script.inv", kGood);
-    EXPECT_EQ(checkScripts({{file}, false, false}, output.plain()), 0);
+    EXPECT_EQ(checkScripts(wanted({file}, false, false), output.plain()), 0);
     EXPECT_THAT(output.errors(), HasSubstr("only the scripts themselves are checked\n"));
     EXPECT_EQ(output.text(), "1 file: 0 errors, 0 warnings (no server was asked)\n");
 }
@@ -50,7 +57,9 @@ TEST_F(CheckCommandTest, WithoutAServerTheScriptsAreChecked) {
 TEST_F(CheckCommandTest, AServerThatDoesNotAnswerLeavesTheFindingsOfTheScripts) {
     fans.server.onNext(support::Reply::silence());
     const std::string file = directory.write("x.script.inv", std::string(kGood) + "nonsense\n");
-    EXPECT_EQ(checkScripts({{file}, false, false, 1}, output.plain()), 1);
+    CheckOptions options = wanted({file});
+    options.timeoutSeconds = 1;
+    EXPECT_EQ(checkScripts(options, output.plain()), 1);
     EXPECT_EQ(output.errors(),
               "sennetctl: the CIM server is connected, but does not answer within 1 s\n"
               "sennetctl: only the scripts themselves are checked\n");
@@ -61,11 +70,11 @@ TEST_F(CheckCommandTest, AServerThatDoesNotAnswerLeavesTheFindingsOfTheScripts) 
 // Whoever reads only the status or the JSON has to learn that "no errors" is half the truth.
 TEST_F(CheckCommandTest, JsonSaysWhetherAServerWasAsked) {
     const std::string file = directory.write("x.script.inv", kGood);
-    EXPECT_EQ(checkScripts({{file}, false, false}, output.json()), 0);
+    EXPECT_EQ(checkScripts(wanted({file}, false, false), output.json()), 0);
     EXPECT_EQ(output.document()["server"], "asked");
     fans.server.stop();
     CapturedOutput later;
-    EXPECT_EQ(checkScripts({{file}, false, false}, later.json()), 0);
+    EXPECT_EQ(checkScripts(wanted({file}, false, false), later.json()), 0);
     EXPECT_EQ(later.document()["server"], "not asked");
 }
 
@@ -73,7 +82,7 @@ TEST_F(CheckCommandTest, AServerThatBreaksDownLeavesTheFindingsOfTheScripts) {
     fans.server.onGetClass("CIM_Fan", support::Reply::closeAtOnce());
     const std::string one = directory.write("one.script.inv", std::string(kGood) + "nonsense\n");
     const std::string two = directory.write("two.script.inv", std::string(kGood) + "nonsense\n");
-    EXPECT_EQ(checkScripts({{one, two}, false, false}, output.plain()), 1);
+    EXPECT_EQ(checkScripts(wanted({one, two}, false, false), output.plain()), 1);
     EXPECT_THAT(output.text(), HasSubstr(one + ":6:1: warning"));
     EXPECT_THAT(output.text(), HasSubstr(two + ":6:1: warning"));
     EXPECT_THAT(output.text(), HasSubstr("3 warnings (the server was not asked about all)\n"));
@@ -84,14 +93,14 @@ TEST_F(CheckCommandTest, AServerThatBreaksDownLeavesTheFindingsOfTheScripts) {
 TEST_F(CheckCommandTest, TranslationsAreThoseOfTheServersSpelling) {
     const std::string file = directory.write(
         "x.script.inv", "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=cim_fan\nA[0]=DeviceID,State\n");
-    EXPECT_EQ(checkScripts({{file}, false, true}, output.plain()), 1);
+    EXPECT_EQ(checkScripts(wanted({file}, false, true), output.plain()), 1);
     EXPECT_THAT(output.text(), HasSubstr("the resource properties have no CIM_Fan.State\n"));
 }
 
 TEST_F(CheckCommandTest, AServerIsNotAskedForAScriptThatIsGivenUp) {
     const std::string file =
         directory.write("x.script.inv", std::string(kGood) + "G[10]=CIM_Fan\n");
-    EXPECT_EQ(checkScripts({{file}, false, false}, output.json()), 1);
+    EXPECT_EQ(checkScripts(wanted({file}, false, false), output.json()), 1);
     EXPECT_EQ(output.document()["errors"], 1);
     for (const support::RecordedRequest& request : fans.server.requests()) {
         EXPECT_NE(request.className, "CIM_Fan");
@@ -106,7 +115,7 @@ TEST_F(CheckCommandTest, TheServerIsAskedOnceWhyValuesAreMissing) {
     fans.server.onGetClass("Velmira_MissingValue",
                            support::Reply::ok("<CLASS NAME=\"Velmira_MissingValue\"/>"));
     fans.server.onEnumerateInstances("Velmira_MissingValue", support::Reply::ok(""));
-    EXPECT_EQ(checkScripts({{one, two}, false, false}, output.plain()), 0);
+    EXPECT_EQ(checkScripts(wanted({one, two}, false, false), output.plain()), 0);
     int asked = 0;
     for (const support::RecordedRequest& request : fans.server.requests()) {
         asked += request.className == "Velmira_MissingValue" ? 1 : 0;
@@ -117,7 +126,7 @@ TEST_F(CheckCommandTest, TheServerIsAskedOnceWhyValuesAreMissing) {
 TEST_F(CheckCommandTest, TwoScriptsOfOneTitle) {
     const std::string one = directory.write("one.script.inv", kGood);
     const std::string two = directory.write("two.script.inv", kGood);
-    EXPECT_EQ(checkScripts({{one, two}, true, false}, output.plain()), 1);
+    EXPECT_EQ(checkScripts(wanted({one, two}, true, false), output.plain()), 1);
     EXPECT_EQ(output.text(), two + ":2:7: warning: " + one +
                                  " has the title Fans, too: both tables get the same MIF class\n"
                                  "2 files: 0 errors, 1 warning (no server was asked)\n");
@@ -126,7 +135,7 @@ TEST_F(CheckCommandTest, TwoScriptsOfOneTitle) {
 TEST_F(CheckCommandTest, ATitleThatBreaksTheFile) {
     const std::string file = directory.write(
         "x.script.inv", "[DEFAULT]\ntitle=17\" Fans\n[CIM]\nG[0]=CIM_Fan\nA[0]=DeviceID\n");
-    EXPECT_EQ(checkScripts({{file}, true, false}, output.plain()), 1);
+    EXPECT_EQ(checkScripts(wanted({file}, true, false), output.plain()), 1);
     EXPECT_THAT(output.text(), HasSubstr(file + ":2:7: error: the title 17\"_Fans has a double "
                                                 "quote or a control character"));
 }
@@ -134,21 +143,86 @@ TEST_F(CheckCommandTest, ATitleThatBreaksTheFile) {
 TEST_F(CheckCommandTest, AScriptThatCannotBeReadLeavesTheFindingsOfTheOthers) {
     const std::string none = directory.path("none");
     const std::string file = directory.write("x.script.inv", std::string(kGood) + "nonsense\n");
-    EXPECT_EQ(checkScripts({{none, file}, true, false}, output.plain()), 2);
+    EXPECT_EQ(checkScripts(wanted({none, file}, true, false), output.plain()), 2);
     EXPECT_EQ(output.errors(), "sennetctl: " + none + ": there is no such file\n");
     EXPECT_THAT(output.text(), HasSubstr("1 file: 0 errors, 1 warning (no server was asked)\n"));
 }
 
 TEST_F(CheckCommandTest, NothingIsToldOfScriptsOfWhichNoneCanBeRead) {
-    EXPECT_EQ(checkScripts({{directory.path("none")}, true, false}, output.plain()), 2);
+    EXPECT_EQ(checkScripts(wanted({directory.path("none")}, true, false), output.plain()), 2);
     EXPECT_EQ(output.text(), "");
+}
+
+TEST_F(CheckCommandTest, AFaultOfTheResourcePropertiesIsToldOnce) {
+    directory.write("texts",
+                    "title.Fans=Fans\nCIM_Fan.State.Size=abc\nCIM_Fan.DeviceID=Fan\n"
+                    "CIM_Fan.State=State\n");
+    const std::string file = directory.write(
+        "x.script.inv", "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=CIM_Fan\nA[0]=DeviceID,State\n");
+    EXPECT_EQ(checkScripts(wanted({file}, false, true), output.plain()), 1);
+    EXPECT_EQ(output.text(),
+              places.resources +
+                  ":2:20: error: the size 'abc' is written as it is: readers refuse a MIF file "
+                  "with String(abc), and databases the table\n" +
+                  file + ":4:6: note: CIM_Fan: 2 instances\n1 file: 1 error, 0 warnings\n");
+}
+
+// Each name would be told otherwise.
+TEST_F(CheckCommandTest, ResourcePropertiesThatCannotBeReadAreToldOnce) {
+    places.resources = directory.path("none");
+    const std::string file = directory.write(
+        "x.script.inv",
+        "[DEFAULT]\ntitle=Fans of this machine\n[CIM]\nG[0]=CIM_Fan\nA[0]=DeviceID,State\n");
+    EXPECT_EQ(checkScripts(wanted({file}, false, true), output.plain()), 1);
+    EXPECT_EQ(output.text(), places.resources +
+                                 ": error: there is no such file: sennet shows titles and "
+                                 "properties as the scripts have them\n" +
+                                 file +
+                                 ":4:6: note: CIM_Fan: 2 instances\n1 file: 1 error, 0 "
+                                 "warnings\n");
+}
+
+TEST_F(CheckCommandTest, AConfigurationThatIsNamedAndNotThere) {
+    places.isConfigured = true;
+    const std::string file = directory.write("x.script.inv", kGood);
+    EXPECT_EQ(checkScripts(wanted({file}, true), output.plain()), 1);
+    EXPECT_EQ(output.text(), places.configuration +
+                                 ": error: there is no such file: sennet takes its default "
+                                 "places\n1 file: 1 error, 0 warnings (no server was asked)\n");
+}
+
+TEST_F(CheckCommandTest, VerboselyThePlacesAreTold) {
+    CheckOptions options = wanted({directory.write("x.script.inv", kGood)}, true);
+    options.verbose = true;
+    EXPECT_EQ(checkScripts(options, output.plain()), 0);
+    EXPECT_EQ(output.text(), "configuration: " + places.configuration + "\ndirectory: " +
+                                 places.scriptDirectory + "\nresources: " + places.resources +
+                                 "\n1 file: 0 errors, 0 warnings (no server was asked)\n");
+    CapturedOutput document;
+    EXPECT_EQ(checkScripts(options, document.json()), 0);
+    EXPECT_EQ(document.document()["configuration"], places.configuration);
+    EXPECT_EQ(document.document()["directory"], places.scriptDirectory);
+    EXPECT_EQ(document.document()["resources"], places.resources);
+}
+
+TEST_F(CheckCommandTest, ADirectoryWithoutScripts) {
+    EXPECT_EQ(checkScripts(wanted({}, true), output.plain()), 2);
+    EXPECT_EQ(output.errors(),
+              "sennetctl: there are no inventory scripts in " + directory.path("") + "\n");
+    places.scriptDirectory = directory.path("none");
+    places.isConfigured = true;
+    CapturedOutput later;
+    EXPECT_EQ(checkScripts(wanted({}, true), later.plain()), 2);
+    EXPECT_EQ(later.errors(), "sennetctl: there is no directory " + places.scriptDirectory +
+                                  " of inventory scripts\n");
+    EXPECT_THAT(later.text(), HasSubstr("none: error: there is no such file"));
 }
 
 TEST_F(CheckCommandTest, ProgressIsTakenAwayAtTheEnd) {
     const std::string file = directory.write("x.script.inv", kGood);
     Output shown = output.plain();
     shown.progress = true;
-    checkScripts({{file}, true, false}, shown);
+    checkScripts(wanted({file}, true, false), shown);
     EXPECT_EQ(output.errors(), "\r\x1B[Kscript 1 of 1: " + file + "\r\x1B[K");
 }
 

@@ -66,8 +66,10 @@ TEST_F(NewCommandTest, WhatItWritesIsWithoutFault) {
     options.classes = {"CIM_Fan"};
     options.title = "Fans";
     writeNewScript(options, output.plain());
+    const Places places{directory.path("none"), false, "", directory.path("coolers.properties")};
     CapturedOutput checked;
-    EXPECT_EQ(checkScripts({{options.script}, false, false}, checked.plain()), 0) << checked.text();
+    EXPECT_EQ(checkScripts({{options.script}, false, false, 10, false, places}, checked.plain()), 0)
+        << checked.text();
 }
 
 TEST_F(NewCommandTest, ClassesWithoutInstancesListEverything) {

@@ -23,7 +23,7 @@ class ServerCheckTest : public testing::Test {
         EXPECT_TRUE(findings.empty()) << findings[0].message;
         LocalServer server;
         MissingValues missing(server);
-        ServerCheck(server, missing, texts, wantSizes, findings).check(model);
+        ServerCheck(server, missing, texts, {wantSizes, true}, findings).check(model);
         std::string text;
         for (const Finding& finding : findings) {
             if (finding.severity != Severity::Note || wantNotes) {
