@@ -1,18 +1,16 @@
 #!/usr/bin/env python3
 """CIM servers whose HTTP is right and whose documents are not: broken XML, answers to something
-else, values that do not fit, and answers made to exhaust a client."""
+else, and values that do not fit."""
 
 import re
 import sys
 
 import rows
 import wire
-from generator import MEMORY_LIMIT
 from hostile_run import (ABANDONED, BOTH, CLASS, DROPPED, EMPTY, INSTANCES, WHOLE, HostileRun,
                          right, sends_document)
 
 SUITE = rows.Suite(__doc__)
-GIB = 1 << 30
 
 
 def both(name, make, **options):
@@ -260,119 +258,6 @@ def _(trial):
             run.expect(EMPTY, INSTANCES, sends_document(lambda request, _, attributes=attributes:
                        wire.result(request, wire.named("CIM_Faulty", "", attributes))), attributes)
     return f"{EMPTY}; next script right"
-
-
-# ---- answers made to exhaust a client
-
-def stream(start, pieces):
-    """A fault: a document that begins as the right one does up to IRETURNVALUE, goes on with `start`
-    and all of the pieces, and then ends in the middle."""
-    def fault(peer, request):
-        document = right(request)
-        peer.send(wire.HEAD + b"Connection: close\r\n\r\n")
-        peer.send(document[:document.index(b"<IRETURNVALUE>") + 14] + start)
-        for piece in pieces():
-            peer.send(piece)
-    return fault
-
-
-def again(octets, total):
-    """The octets again and again, in large pieces."""
-    block = octets * (1 + (1 << 16) // len(octets))
-    return lambda: (block for _ in range(total // len(block)))
-
-
-def exhausting(name, start, octets, full=16 * rows.MIB, small=16 * rows.MIB, memory=MEMORY_LIMIT):
-    """A case: an answer that goes on with these octets for so long."""
-    @SUITE.case(name)
-    def _(trial):
-        total = full if trial.full else small
-        with HostileRun(trial) as run:
-            for where, lost in ((CLASS, ABANDONED), (INSTANCES, EMPTY)):
-                run.expect(lost, where, stream(start[where], again(octets, total)), name,
-                           memory=memory, patience_s=240)
-        return (f"{BOTH}; less than {memory // rows.MIB} MiB of memory, {total // rows.MIB} MiB "
-                "offered")
-
-
-def at_both(octets):
-    return {CLASS: octets, INSTANCES: octets}
-
-
-# The begin of a property, in a class and in an instance.
-PROPERTY = {CLASS: b'<CLASS NAME="CIM_Faulty"><PROPERTY NAME="P" TYPE="string">',
-            INSTANCES: b'<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME="CIM_Faulty"/><INSTANCE '
-                       b'CLASSNAME="CIM_Faulty"><PROPERTY NAME="P" TYPE="string">'}
-
-
-def inside_property(octets):
-    return {where: begin + octets for where, begin in PROPERTY.items()}
-
-
-exhausting("nesting of a million", at_both(b""), b"<VALUE.ARRAY>")
-exhausting("nesting of a million where it is allowed", inside_property(b"<VALUE>"), b"<VALUE>")
-exhausting("endless tag", at_both(b"<"), b"VALUE", 4 * GIB, 8 * rows.MIB, 3 * MEMORY_LIMIT)
-exhausting("endless attribute", at_both(b'<CLASS NAME="'), b"CIM", 4 * GIB, 8 * rows.MIB,
-           3 * MEMORY_LIMIT)
-exhausting("endless comment", at_both(b"<!--"), b"more", 4 * GIB, 8 * rows.MIB, 3 * MEMORY_LIMIT)
-exhausting("endless value", inside_property(b"<VALUE>"), b"text", 4 * GIB, 8 * rows.MIB,
-           4 * MEMORY_LIMIT)
-exhausting("endless value in pieces", inside_property(b"<VALUE>"), b"text<!-- -->", 4 * GIB,
-           8 * rows.MIB, 4 * MEMORY_LIMIT)
-exhausting("endless blanks", at_both(b""), b" ", 4 * GIB, 8 * rows.MIB, 3 * MEMORY_LIMIT)
-exhausting("endless comments", at_both(b""), b"<!-- more -->", 4 * GIB + rows.MIB, 20 * rows.MIB)
-
-
-# Parts of instances, of which many take much more memory than octets.
-INSTANCE_PARTS = {
-    "instances": (b"", b'<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME="CIM_Faulty"/>'
-                       b'<INSTANCE CLASSNAME="CIM_Faulty"/></VALUE.NAMEDINSTANCE>'),
-    "elements of an array": (b'<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME="CIM_Faulty"/><INSTANCE '
-                             b'CLASSNAME="CIM_Faulty"><PROPERTY.ARRAY NAME="P" TYPE="string">'
-                             b'<VALUE.ARRAY>', b"<VALUE/>"),
-}
-for _name, _octets in INSTANCE_PARTS.items():
-    @SUITE.case(f"endless {_name}, 2 GiB of memory at most")
-    def _(trial, name=_name, octets=_octets):
-        if not trial.full:
-            raise rows.Skip("takes long: at full effort only")
-        start, part = octets
-        at_most = 2 * GIB
-        with HostileRun(trial) as run:
-            run.expect(EMPTY, INSTANCES, stream(start, again(part, 4 * GIB)), name,
-                       memory=at_most, patience_s=240,
-                       limits=[f"--as={at_most}"])
-        return f"{EMPTY}; next script right"
-
-
-# All of it is one class, and all of it right until it breaks off.
-CLASS_PARTS = {
-    "properties": b'<PROPERTY NAME="P%d" TYPE="uint8"/>',
-    "qualifiers": b'<QUALIFIER NAME="Q%d" TYPE="uint8"><VALUE>1</VALUE></QUALIFIER>',
-    "methods": b'<METHOD NAME="M%d" TYPE="uint8"/>',
-}
-for _name, _part in CLASS_PARTS.items():
-    @SUITE.case(f"a class of endless {_name}")
-    def _(trial, name=_name, part=_part):
-        total = 4 * GIB if trial.full else 2 * rows.MIB
-        def parts():
-            for first in range(0, total // len(part), 1000):
-                yield b"".join(part % number for number in range(first, first + 1000))
-        with HostileRun(trial) as run:
-            run.expect(ABANDONED, CLASS, stream(b'<CLASS NAME="CIM_Faulty">', parts), name,
-                       memory=3 * MEMORY_LIMIT, patience_s=240)
-        return f"{ABANDONED}; next script right; less than {3 * MEMORY_LIMIT // rows.MIB} MiB"
-
-
-@SUITE.case("a million attributes")
-def _(trial):
-    def attributes():
-        for first in range(0, 1000000, 1000):
-            yield b"".join(b' a%d="b"' % number for number in range(first, first + 1000))
-    with HostileRun(trial) as run:
-        for where, lost in ((CLASS, ABANDONED), (INSTANCES, EMPTY)):
-            run.expect(lost, where, stream(b"<CLASS", attributes), "attributes")
-    return f"{BOTH}; less than {MEMORY_LIMIT // rows.MIB} MiB of memory"
 
 
 if __name__ == "__main__":
