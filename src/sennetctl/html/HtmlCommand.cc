@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <filesystem>
 #include <map>
+#include <optional>
 #include <ostream>
 
 #include "html/InventoryPage.h"
@@ -36,45 +37,71 @@ std::vector<std::string> shortNames(const std::vector<std::string>& files) {
 std::time_t modifiedAt(const std::string& file) {
     struct stat status = {};
     if (::stat(file.c_str(), &status) != 0) {
-        throw CannotRun(file + ": cannot be read");
+        throw CannotRun(file, "cannot be read");
     }
     return status.st_mtime;
 }
 
-InventoryPage composePage(const HtmlOptions& options, const Output& output) {
+/// The page, and what came of the files.
+struct Composition {
+    InventoryPage page;
+    std::vector<std::string> files;  // that are on the page
+    std::vector<Failure> failures;   // of those that are not
+};
+
+void addFile(const std::string& file, const std::string& name, Composition& composed) {
+    MifContent content;
+    std::time_t modified = 0;
+    try {
+        content = readMifFile(file);
+        modified = modifiedAt(file);
+    } catch (const CannotRun& cause) {
+        composed.failures.push_back(cause.failure());
+        Failure shown = cause.failure();
+        shown.file = name;
+        composed.page.addMissing(shown);
+        return;
+    }
+    composed.page.add(name, modified, content);
+    composed.files.push_back(file);
+}
+
+Composition composePage(const HtmlOptions& options, const Output& output) {
     const std::vector<std::string> names = shortNames(options.files);
-    InventoryPage page(options.title);
+    Composition composed{InventoryPage(options.title), {}, {}};
     const Progress progress(output);
     for (std::size_t i = 0; i < options.files.size(); ++i) {
         const std::string& file = options.files[i];
         progress.show("file " + std::to_string(i + 1) + " of " +
                       std::to_string(options.files.size()) + ": " + file);
-        const MifContent content = readMifFile(file);
-        page.add(names[i], modifiedAt(file), content);
+        addFile(file, names[i], composed);
     }
-    return page;
+    return composed;
 }
 
 void makeDirectory(const std::string& directory) {
     if (Velm::TextFile(directory.c_str()).mkdir(1) != 0) {
-        throw CannotRun(directory + ": cannot be made");
+        throw CannotRun(directory, "cannot be made");
     }
 }
 
-void report(const std::string& path, const HtmlOptions& options, const InventoryPage& page,
+void report(const std::optional<std::string>& path, const Composition& composed,
             const Output& output) {
+    tellFailures(composed.failures, output);
+    const InventoryPage& page = composed.page;
     if (output.json) {
         Json document = Json::object();
-        document["page"] = path;
-        document["files"] = options.files;
+        document["page"] = path ? Json(*path) : Json(nullptr);
+        document["files"] = composed.files;
         document["tables"] = page.tables();
         document["rows"] = page.rows();
+        addFailures(composed.failures, document);
         printJson(document, output);
-        return;
+    } else if (path) {
+        output.out << "Written: " << printable(*path) << ", " << counted(page.tables(), "table")
+                   << " from " << counted(page.files(), "file") << " with "
+                   << counted(page.rows(), "row") << '\n';
     }
-    output.out << "Written: " << printable(path) << ", " << counted(page.tables(), "table")
-               << " from " << counted(page.files(), "file") << " with "
-               << counted(page.rows(), "row") << '\n';
 }
 
 }  // namespace
@@ -84,11 +111,15 @@ int writeHtmlPage(const HtmlOptions& options, const Output& output) {
     if (!options.replace) {
         refuseExisting(path);
     }
-    const InventoryPage page = composePage(options, output);
+    const Composition composed = composePage(options, output);
+    if (composed.files.empty()) {
+        report(std::nullopt, composed, output);
+        return kCannotRun;
+    }
     makeDirectory(options.directory);
-    writeWholeFile(path, page.text());
-    report(path, options, page, output);
-    return kFine;
+    writeWholeFile(path, composed.page.text());
+    report(path, composed, output);
+    return composed.failures.empty() ? kFine : kCannotRun;
 }
 
 }  // namespace sennetctl

@@ -17,8 +17,10 @@ struct HtmlOptions {
 };
 
 /// Writes the page inventory.html into the directory, which is made if it is missing, and prints
-/// what was written. Throws CannotRun when a file cannot be read or is no MIF file, when the page
-/// is there already and not to be replaced, and when it cannot be written; then nothing is changed.
+/// what was written. A file that cannot be read or is no MIF file is told, here and on the page,
+/// and the status is then kCannotRun; of such files alone no page is made. Throws CannotRun when
+/// the page is there already and not to be replaced, when it becomes too large, and when it cannot
+/// be written; then nothing is changed.
 int writeHtmlPage(const HtmlOptions& options, const Output& output);
 
 }  // namespace sennetctl

@@ -61,6 +61,10 @@ void InventoryPage::add(const std::string& file, std::time_t modified, const Mif
     sections += "</section>\n";
 }
 
+void InventoryPage::addMissing(const Failure& failure) {
+    missing += "<li>" + html(textOf(failure)) + "</li>\n";
+}
+
 void InventoryPage::addTable(const MifTable& table, const std::string& origin, int level) {
     ++tableCount;
     rowCount += table.rows.size();
@@ -92,7 +96,14 @@ std::string InventoryPage::text() const {
         html(title), counted(tableCount, "table"), counted(fileCount, "file"),
         counted(rowCount, "row"));
     page.append("<nav aria-label=\"Tables\">\n<ul>\n").append(links).append("</ul>\n</nav>\n");
-    page.append("<main id=\"tables\">\n").append(sections).append("</main>\n");
+    page.append("<main id=\"tables\">\n");
+    if (!missing.empty()) {
+        page.append(
+                "<section aria-labelledby=\"missing\">\n<h2 id=\"missing\">Not shown</h2>\n<ul>\n")
+            .append(missing)
+            .append("</ul>\n</section>\n");
+    }
+    page.append(sections).append("</main>\n");
     page.append(
         "<footer>\n<p>Made by sennetctl from MIF files. Columns without any value and "
         "row numbers are left out.</p>\n</footer>\n");

@@ -10,6 +10,7 @@
 #include <string>
 
 #include "mif/MifTables.h"
+#include "report/Failure.h"
 
 namespace sennetctl {
 
@@ -24,6 +25,9 @@ class InventoryPage {
     /// Throws CannotRun when the page becomes larger than kLargestPageOctets.
     void add(const std::string& file, std::time_t modified, const MifContent& content);
 
+    /// Says on the page that a file, by its name for people, is missing there, and why.
+    void addMissing(const Failure& failure);
+
     /// The whole page.
     std::string text() const;
 
@@ -37,6 +41,7 @@ class InventoryPage {
     std::string title;
     std::string links;     // items of the list of tables
     std::string sections;  // the tables
+    std::string missing;   // items of the list of files that are not shown
     std::size_t fileCount = 0;
     std::size_t tableCount = 0;
     std::size_t rowCount = 0;

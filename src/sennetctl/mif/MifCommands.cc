@@ -145,21 +145,30 @@ Json jsonOf(const MifChange& change) {
     return one;
 }
 
+void checkMifFile(const std::string& file, MifLint& lint, CheckResult& result) {
+    try {
+        const std::vector<Finding> found = lint.check(file, readWholeFile(file));
+        result.files.push_back(file);
+        result.findings.insert(result.findings.end(), found.begin(), found.end());
+    } catch (const CannotRun& cause) {
+        result.failures.push_back(cause.failure());
+    }
+}
+
 }  // namespace
 
 int checkMifFiles(const std::vector<std::string>& files, const LintOptions& options,
                   const Output& output) {
     MifLint lint(options);
-    std::vector<Finding> findings;
+    CheckResult result;
     {
         const Progress progress(output);
         for (const std::string& file : files) {
             progress.show("checking " + file);
-            const std::vector<Finding> found = lint.check(file, readWholeFile(file));
-            findings.insert(findings.end(), found.begin(), found.end());
+            checkMifFile(file, lint, result);
         }
     }
-    return printFindings(findings, files, output);
+    return printResult(result, output);
 }
 
 int showMifFile(const std::string& file, const Output& output) {

@@ -10,12 +10,12 @@
 
 namespace sennetctl {
 
-// All of these throw CannotRun when a file cannot be read; those that need to understand the file
-// also when it is no MIF file.
-
-/// Checks the files in their order, as one site that imports them one after the other.
+/// Checks the files in their order, as one site that imports them one after the other. Those that
+/// cannot be read are told, and the status is then kCannotRun.
 int checkMifFiles(const std::vector<std::string>& files, const LintOptions& options,
                   const Output& output);
+
+// Both of the others throw CannotRun when a file cannot be read or is no MIF file.
 
 /// Prints the tables of a file, as JSON when the output is to be JSON.
 int showMifFile(const std::string& file, const Output& output);

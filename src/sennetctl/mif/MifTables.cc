@@ -108,7 +108,8 @@ Mif::Component readComponent(const std::string& path) {
         try {
             return Mif::MifReader(tolerances).read(text.octets);
         } catch (const Mif::Error&) {
-            throw CannotRun(path + ":" + error.what());
+            throw CannotRun(
+                Failure{path, error.position().line, error.position().column, error.message()});
         }
     }
 }
@@ -120,7 +121,7 @@ MifContent readMifFile(const std::string& path) {
     try {
         return {fromLatin1(component.name), TableFiller().tablesOf(component)};
     } catch (const CannotRun& failure) {
-        throw CannotRun(path + ": " + failure.what());
+        throw CannotRun(path, failure.failure().reason);
     }
 }
 

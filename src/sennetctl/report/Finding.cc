@@ -96,33 +96,36 @@ const char* nameOf(Severity severity) {
     return "note";
 }
 
-int printFindings(const std::vector<Finding>& findings, const std::vector<std::string>& files,
-                  const Output& output, ServerPart server,
-                  const std::vector<std::pair<std::string, std::string>>& basis) {
-    const std::size_t errors = countOf(findings, Severity::Error);
-    const std::size_t warnings = countOf(findings, Severity::Warning);
+int printResult(const CheckResult& result, const Output& output) {
+    const std::size_t errors = countOf(result.findings, Severity::Error);
+    const std::size_t warnings = countOf(result.findings, Severity::Warning);
+    tellFailures(result.failures, output);
     if (output.json) {
         Json document = Json::object();
-        for (const auto& [name, value] : basis) {
+        for (const auto& [name, value] : result.basis) {
             document[name] = value;
         }
-        document["files"] = files;
+        document["files"] = result.files;
         document["findings"] = Json::array();
-        for (const Finding& finding : findings) {
+        for (const Finding& finding : result.findings) {
             document["findings"].push_back(jsonOf(finding));
         }
         document["errors"] = errors;
         document["warnings"] = warnings;
-        if (server != ServerPart::NotConcerned) {
-            document["server"] = nameOf(server);
+        if (result.server != ServerPart::NotConcerned) {
+            document["server"] = nameOf(result.server);
         }
+        addFailures(result.failures, document);
         printJson(document, output);
-    } else {
-        for (const Finding& finding : findings) {
+    } else if (!result.files.empty() || !result.findings.empty() || result.failures.empty()) {
+        for (const Finding& finding : result.findings) {
             printFinding(finding, output);
         }
-        output.out << counted(files.size(), "file") << ": " << counted(errors, "error") << ", "
-                   << counted(warnings, "warning") << remarkOn(server) << '\n';
+        output.out << counted(result.files.size(), "file") << ": " << counted(errors, "error")
+                   << ", " << counted(warnings, "warning") << remarkOn(result.server) << '\n';
+    }
+    if (!result.failures.empty()) {
+        return kCannotRun;
     }
     return errors + warnings > 0 ? kFindings : kFine;
 }

@@ -6,6 +6,7 @@
 #include <utility>
 #include <vector>
 
+#include "report/Failure.h"
 #include "report/Output.h"
 
 namespace sennetctl {
@@ -28,11 +29,19 @@ struct Finding {
 /// What a CIM server had to do with the findings: NotConcerned where there is nothing to ask it.
 enum class ServerPart { NotConcerned, Asked, NotAsked, BrokeDown };
 
-/// Prints each finding as "file:line:column: severity: message" and then how many there are, or all
-/// as JSON, and whether a server was asked. `files` are those that were looked at; `basis` are
-/// members that only the JSON document has, name and value. Returns the exit status.
-int printFindings(const std::vector<Finding>& findings, const std::vector<std::string>& files,
-                  const Output& output, ServerPart server = ServerPart::NotConcerned,
-                  const std::vector<std::pair<std::string, std::string>>& basis = {});
+/// What a check of several files comes to.
+struct CheckResult {
+    std::vector<Finding> findings;
+    std::vector<std::string> files;  ///< that were looked at
+    ServerPart server = ServerPart::NotConcerned;
+    std::vector<Failure> failures;  ///< of the files that could not be looked at
+    /// Members that only the JSON document has, name and value.
+    std::vector<std::pair<std::string, std::string>> basis;
+};
+
+/// Tells the failures, and prints each finding as "file:line:column: severity: message" and then
+/// how many there are, or all as JSON, and whether a server was asked. Returns the exit status,
+/// which is kCannotRun where something failed.
+int printResult(const CheckResult& result, const Output& output);
 
 }  // namespace sennetctl

@@ -13,34 +13,33 @@ std::string readWholeFile(const std::string& path, std::size_t limitOctets) {
     std::error_code error;
     const std::filesystem::file_status status = std::filesystem::status(path, error);
     if (status.type() == std::filesystem::file_type::not_found) {
-        throw CannotRun(path + ": there is no such file");
+        throw CannotRun(path, "there is no such file");
     }
     // A pipe or a terminal would keep the command waiting.
     if (!error && status.type() != std::filesystem::file_type::regular) {
-        throw CannotRun(path + ": is no regular file");
+        throw CannotRun(path, "is no regular file");
     }
     std::ifstream file(path, std::ios::binary);
     if (!file) {
-        throw CannotRun(path + ": " + std::generic_category().message(errno));
+        throw CannotRun(path, std::generic_category().message(errno));
     }
     std::string octets;
     char piece[64 * 1024];
     while (file.read(piece, sizeof piece) || file.gcount() > 0) {
         octets.append(piece, static_cast<std::size_t>(file.gcount()));
         if (octets.size() > limitOctets) {
-            throw CannotRun(path + ": is larger than " + std::to_string(limitOctets >> 20) +
-                            " MiB");
+            throw CannotRun(path, "is larger than " + std::to_string(limitOctets >> 20) + " MiB");
         }
     }
     if (file.bad()) {
-        throw CannotRun(path + ": cannot be read to its end");
+        throw CannotRun(path, "cannot be read to its end");
     }
     return octets;
 }
 
 void refuseExisting(const std::string& path) {
     if (Velm::TextFile(path.c_str()).exists()) {
-        throw CannotRun(path + ": exists already");
+        throw CannotRun(path, "exists already");
     }
 }
 
@@ -50,7 +49,7 @@ void writeWholeFile(const std::string& path, const std::string& octets) {
     const bool written = file.open(kOpenForWriting) == 0 &&
                          file.writeLine(octets.data(), static_cast<int>(octets.size())) >= 0;
     if (file.close() != 0 || !written) {
-        throw CannotRun(path + ": cannot be written");
+        throw CannotRun(path, "cannot be written");
     }
 }
 

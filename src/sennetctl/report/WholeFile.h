@@ -3,16 +3,11 @@
 // Files read and written whole.
 
 #include <cstddef>
-#include <stdexcept>
 #include <string>
 
-namespace sennetctl {
+#include "report/CannotRun.h"
 
-/// A command cannot do its work; the message is for people and names the file or the server.
-class CannotRun : public std::runtime_error {
-  public:
-    using std::runtime_error::runtime_error;
-};
+namespace sennetctl {
 
 /// Far more than any MIF file that a product takes, and little enough to hold what it says.
 constexpr std::size_t kLargestFileOctets = std::size_t(16) << 20;

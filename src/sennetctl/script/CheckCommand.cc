@@ -68,6 +68,10 @@ class ScriptChecker {
         hasTexts = checkResources(options.places, found);
         takeOver(found);
         texts.load();
+        result.server = ServerPart::NotAsked;
+        result.basis = {{"configuration", options.places.configuration},
+                        {"directory", options.places.scriptDirectory},
+                        {"resources", options.places.resources}};
     }
 
     /// Unless the options forbid it.
@@ -77,7 +81,7 @@ class ScriptChecker {
         }
         try {
             answers = std::make_unique<Answers>(options.timeoutSeconds * 1000);
-            part = ServerPart::Asked;
+            result.server = ServerPart::Asked;
         } catch (const CannotRun& failure) {
             loseServer(failure, "only the scripts themselves are checked");
         }
@@ -89,9 +93,9 @@ class ScriptChecker {
         const std::vector<std::string> scripts = scriptsIn(directory);
         std::error_code error;
         if (!std::filesystem::is_directory(directory, error)) {
-            troubles.push_back("there is no directory " + directory + " of inventory scripts");
+            fail("there is no directory " + directory + " of inventory scripts");
         } else if (scripts.empty()) {
-            troubles.push_back("there are no inventory scripts in " + directory);
+            fail("there are no inventory scripts in " + directory);
         }
         return scripts;
     }
@@ -101,40 +105,32 @@ class ScriptChecker {
         try {
             octets = readWholeFile(file, kLargestScriptOctets);
         } catch (const CannotRun& failure) {
-            troubles.emplace_back(failure.what());
+            result.failures.push_back(failure.failure());
             return;
         }
-        files.push_back(file);
+        result.files.push_back(file);
         std::vector<Finding> found = findingsIn(file, octets);
         takeOver(found);
     }
 
     /// Returns the exit status, which is kCannotRun where some script was not read.
-    int tell(std::size_t wanted, const Output& output) const {
-        const Basis basis = {{"configuration", options.places.configuration},
-                             {"directory", options.places.scriptDirectory},
-                             {"resources", options.places.resources}};
+    int tell(const Output& output) const {
         if (options.verbose && !output.json) {
-            for (const auto& [name, path] : basis) {
+            for (const auto& [name, path] : result.basis) {
                 output.out << name << ": " << printable(path) << '\n';
             }
         }
-        for (const std::string& trouble : troubles) {
-            output.err << "sennetctl: " << printable(trouble) << '\n';
-        }
-        const int status = files.empty() && findings.empty()
-                               ? kCannotRun
-                               : printFindings(findings, files, output, part, basis);
-        return files.empty() || files.size() < wanted ? kCannotRun : status;
+        tellFailures(troubles, output);
+        return printResult(result, output);
     }
 
   private:
-    using Basis = std::vector<std::pair<std::string, std::string>>;
+    void fail(const std::string& reason) { result.failures.push_back({{}, 0, 0, reason}); }
 
     /// Findings of one file.
     void takeOver(std::vector<Finding>& found) {
         sortByPlace(found);
-        findings.insert(findings.end(), found.begin(), found.end());
+        result.findings.insert(result.findings.end(), found.begin(), found.end());
         found.clear();
     }
 
@@ -172,25 +168,23 @@ class ScriptChecker {
         } catch (const CannotRun& failure) {
             loseServer(failure,
                        "from " + model.file + " on only the scripts themselves are checked");
-            part = ServerPart::BrokeDown;
+            result.server = ServerPart::BrokeDown;
             answers.reset();
         }
     }
 
     void loseServer(const CannotRun& failure, const std::string& consequence) {
-        troubles.emplace_back(failure.what());
-        troubles.push_back(consequence);
+        troubles.push_back(failure.failure());
+        troubles.push_back({{}, 0, 0, consequence});
     }
 
     const CheckOptions& options;
     Velm::PropertiesFile texts;
     bool hasTexts = false;             // without them each name would be told
     std::unique_ptr<Answers> answers;  // none when there is no server
-    ServerPart part = ServerPart::NotAsked;
     std::map<std::string, std::string> fileOfTitle;
-    std::vector<std::string> files;  // that were read
-    std::vector<Finding> findings;
-    std::vector<std::string> troubles;
+    CheckResult result;
+    std::vector<Failure> troubles;  // with the server, which leave the scripts' own findings
 };
 
 }  // namespace
@@ -208,7 +202,7 @@ int checkScripts(const CheckOptions& options, const Output& output) {
             checker.check(files[i]);
         }
     }
-    return checker.tell(files.size(), output);
+    return checker.tell(output);
 }
 
 }  // namespace sennetctl

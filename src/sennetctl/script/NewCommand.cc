@@ -25,7 +25,7 @@ constexpr std::string_view kSuffix = ".script.inv";
 std::string pathWithoutSuffix(const std::string& script) {
     if (script.size() <= kSuffix.size() ||
         script.compare(script.size() - kSuffix.size(), kSuffix.size(), kSuffix) != 0) {
-        throw CannotRun(script + ": the name of a script ends in .script.inv");
+        throw CannotRun(script, "the name of a script ends in .script.inv");
     }
     return script.substr(0, script.size() - kSuffix.size());
 }

@@ -79,13 +79,47 @@ TEST_F(HtmlCommandTest, AnEarlierPageIsReplacedOnlyOnDemand) {
     EXPECT_THAT(readWholeFile(page()), HasSubstr("<td>second</td>"));
 }
 
-TEST_F(HtmlCommandTest, NothingIsWrittenWhenAFileCannotBeRead) {
+TEST_F(HtmlCommandTest, ThePageLacksWhatCannotBeReadAndSaysSo) {
+    const std::string good = fans("good.mif");
+    const std::string broken = directory.write("<broken>.mif", "Start Component\nName = 7\n");
+    const std::string none = directory.path("none");
+    EXPECT_EQ(writeHtmlPage(options({broken, good, none}), output.plain()), 2);
+    EXPECT_EQ(output.errors(), "sennetctl: " + broken +
+                                   ":2:8: expected a literal, found 7\n"
+                                   "sennetctl: " +
+                                   none + ": there is no such file\n");
+    EXPECT_EQ(output.text(), "Written: " + page() + ", 1 table from 1 file with 1 row\n");
+    const std::string text = readWholeFile(page());
+    EXPECT_THAT(text, HasSubstr("1 row from <b>good.mif</b>"));
+    EXPECT_THAT(text, HasSubstr("<h2 id=\"missing\">Not shown</h2>\n<ul>\n"
+                                "<li>&lt;broken&gt;.mif:2:8: expected a literal, found 7</li>\n"
+                                "<li>none: there is no such file</li>\n</ul>"));
+}
+
+TEST_F(HtmlCommandTest, JsonTellsWhatIsNotOnThePage) {
     const std::string good = fans("good.mif");
     const std::string broken = directory.write("broken.mif", "Start Component\nName = 7\n");
-    EXPECT_EQ(refusal(options({good, broken})), broken + ":2:8: expected a literal, found 7");
-    EXPECT_EQ(refusal(options({good, directory.path("none")})),
-              directory.path("none") + ": there is no such file");
+    EXPECT_EQ(writeHtmlPage(options({good, broken}), output.json()), 2);
+    EXPECT_EQ(output.document()["files"].dump(), "[\"" + good + "\"]");
+    EXPECT_EQ(output.document()["error"].dump(),
+              "{\"file\":\"" + broken +
+                  R"(","line":2,"column":8,"message":"expected a literal, found 7"})");
+    EXPECT_EQ(output.document()["failures"].size(), 1U);
+}
+
+TEST_F(HtmlCommandTest, NoPageIsMadeOfFilesThatCannotBeRead) {
+    EXPECT_EQ(writeHtmlPage(options({directory.path("none")}), output.plain()), 2);
+    EXPECT_EQ(output.text(), "");
     EXPECT_FALSE(std::filesystem::exists(directory.path("web")));
+    CapturedOutput json;
+    EXPECT_EQ(writeHtmlPage(options({directory.path("none")}), json.json()), 2);
+    EXPECT_EQ(json.document()["page"], nullptr);
+    EXPECT_EQ(json.document()["error"]["message"], "there is no such file");
+}
+
+TEST_F(HtmlCommandTest, APageOfAllFilesMissesNothing) {
+    writeHtmlPage(options({fans("one.mif")}), output.plain());
+    EXPECT_EQ(readWholeFile(page()).find("Not shown"), std::string::npos);
 }
 
 TEST_F(HtmlCommandTest, ADirectoryThatCannotBeMade) {
