@@ -1,24 +1,23 @@
 #include "CommandLine.h"
 
 #include <Pegasus/Common/Exception.h>
-#include <unistd.h>
 
 #include <CLI/CLI.hpp>
-#include <cstdlib>
+#include <algorithm>
 #include <exception>
 #include <functional>
 #include <iostream>
 #include <memory>
 #include <string>
-#include <string_view>
 #include <utility>
 #include <vector>
 
 #include "cim/CimText.h"
 #include "html/HtmlCommand.h"
 #include "mif/MifCommands.h"
+#include "report/CannotRun.h"
 #include "report/Output.h"
-#include "report/Text.h"
+#include "report/StandardStreams.h"
 #include "script/CheckCommand.h"
 #include "script/NewCommand.h"
 #include "server/GetCommand.h"
@@ -158,7 +157,7 @@ void addMifCheck(CLI::App& mif, Choice& choice) {
         ->check(CLI::IsMember({"dmi", "sms", "ca", "landesk"}));
     command
         ->add_option("--max-kb", options->lint.largestKilobytes,
-                     "the size that the site takes, by default 250 KB")
+                     "the size that the site takes, by default 250 KB; for sms only")
         ->option_text("KB")
         ->check(CLI::Range(1, 5120));
     command
@@ -167,8 +166,11 @@ void addMifCheck(CLI::App& mif, Choice& choice) {
                      "with the classes of the earlier ones")
         ->option_text("FILE...")
         ->required();
-    command->callback([&choice, options] {
+    command->callback([&choice, options, command] {
         options->lint.profile = parseMifProfile(options->profile).value_or(MifProfile::Dmi);
+        if (command->count("--max-kb") > 0 && options->lint.profile != MifProfile::Sms) {
+            throw CLI::ValidationError("--max-kb", "only --profile sms has a largest size");
+        }
         choice.command = [options](const Output& output) {
             return checkMifFiles(options->files, options->lint, output);
         };
@@ -244,40 +246,70 @@ void addMif(CLI::App& app, Choice& choice) {
     addMifHtml(*mif, choice);
 }
 
-/// Whether there is a terminal that moves its cursor and shows colours.
-bool takesEscapes(int descriptor) {
-    const char* kind = std::getenv("TERM");
-    return ::isatty(descriptor) == 1 && (kind == nullptr || std::string_view(kind) != "dumb");
-}
-
-/// As https://no-color.org has it: any value but the empty one refuses colours.
-bool wantsColour() {
-    const char* refused = std::getenv("NO_COLOR");
-    return takesEscapes(STDOUT_FILENO) && (refused == nullptr || *refused == '\0');
-}
-
-int runCommand(const Choice& choice) {
-    const Output output{std::cout, std::cerr, choice.json, wantsColour(),
-                        takesEscapes(STDERR_FILENO)};
-    std::string failure;
-    try {
-        const int status = choice.command(output);
-        if (std::cout.flush()) {
-            return status;
-        }
-        failure = "standard output cannot be written";
-    } catch (const Pegasus::Exception& error) {
-        failure = reasonOf(error);
-    } catch (const std::exception& error) {
-        failure = error.what();
+/// The names of the commands on the level of the one that lacks its own: "check, get or mif".
+std::string expectedCommands(const CLI::App& app) {
+    const std::vector<CLI::App*> chosen = app.get_subcommands();
+    const CLI::App& level = chosen.empty() ? app : *chosen.front();
+    const std::vector<const CLI::App*> commands = level.get_subcommands({});
+    std::string names;
+    for (const CLI::App* command : commands) {
+        const char* separator = command == commands.back() ? " or " : ", ";
+        names += (names.empty() ? "" : separator) + command->get_name();
     }
-    std::cerr << "sennetctl: " << printable(failure) << '\n';
+    return names;
+}
+
+/// CLI11 only says that a command is missing.
+std::string parsingFailure(const CLI::ParseError& error, const CLI::App& app) {
+    if (std::string(error.what()) != "A subcommand is required") {
+        return error.what();
+    }
+    const std::vector<std::string> words = app.remaining(true);
+    const auto wrong = std::find_if(words.begin(), words.end(), [](const std::string& word) {
+        return word.rfind('-', 0) != 0;
+    });
+    return (wrong == words.end() ? "a command is missing" : "'" + *wrong + "' is no command") +
+           ": expected " + expectedCommands(app);
+}
+
+/// What the command line asks for, wrong as it may be.
+bool asksForJson(const std::vector<std::string>& arguments) {
+    const bool printsJson = arguments.size() > 1 && arguments[0] == "mif" && arguments[1] == "json";
+    return printsJson || std::find(arguments.begin(), arguments.end(), "--json") != arguments.end();
+}
+
+/// Help and the version, too, come as an exception.
+int endParsing(const CLI::ParseError& error, const CLI::App& app, const Output& output) {
+    if (error.get_exit_code() == 0) {
+        return app.exit(error, output.out, output.err);
+    }
+    printFailure({{}, 0, 0, parsingFailure(error, app)}, output);
+    output.err << "Run with --help for more information.\n";
     return kCannotRun;
 }
 
-}  // namespace
+int runCommand(const Choice& choice, const Output& output) {
+    try {
+        return choice.command(output);
+    } catch (const CannotRun& cause) {
+        printFailure(cause.failure(), output);
+    } catch (const Pegasus::Exception& error) {
+        printFailure({{}, 0, 0, reasonOf(error)}, output);
+    } catch (const std::exception& error) {
+        printFailure({{}, 0, 0, error.what()}, output);
+    }
+    return kCannotRun;
+}
 
-int runCommandLine(int argc, char** argv) {
+void addCommands(CLI::App& app, Choice& choice) {
+    addCheck(app, choice);
+    addServer(app, choice);
+    addGet(app, choice);
+    addMif(app, choice);
+    addNew(app, choice);
+}
+
+int parseAndRun(int argc, char** argv, StandardStreams& streams) {
     Choice choice;
     CLI::App app("What an administrator needs around sennet, the generator of MIF files.",
                  "sennetctl");
@@ -292,17 +324,26 @@ int runCommandLine(int argc, char** argv) {
         "The exit status is 0 when all is fine, 1 when something was found, and 2 when the "
         "command\n"
         "could not do its work. 'sennetctl COMMAND --help' tells more about a command.");
-    addCheck(app, choice);
-    addServer(app, choice);
-    addGet(app, choice);
-    addMif(app, choice);
-    addNew(app, choice);
+    addCommands(app, choice);
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
-        return app.exit(error) == 0 ? kFine : kCannotRun;
+        return endParsing(error, app, streams.output(asksForJson({argv + 1, argv + argc})));
     }
-    return runCommand(choice);
+    return runCommand(choice, streams.output(choice.json));
+}
+
+}  // namespace
+
+int runCommandLine(int argc, char** argv) {
+    StandardStreams streams;
+    const int status = parseAndRun(argc, argv, streams);
+    const std::string trouble = streams.flush();
+    if (!trouble.empty()) {
+        std::cerr << "sennetctl: " << trouble << '\n';
+        return kCannotRun;
+    }
+    return status;
 }
 
 }  // namespace sennetctl

@@ -72,6 +72,63 @@ TEST_F(ProgramTest, AWrongCommandLineCannotRun) {
     EXPECT_EQ(runWithoutServer({"server", "--wrong"}).exitStatus, 2);
 }
 
+TEST_F(ProgramTest, AWrongCommandIsNamed) {
+    EXPECT_EQ(runWithoutServer({"chek"}).err,
+              "sennetctl: 'chek' is no command: expected check, server, get, mif or new\n"
+              "Run with --help for more information.\n");
+    EXPECT_THAT(runWithoutServer({"mif", "shwo", "a.mif"}).err,
+                HasSubstr("'shwo' is no command: expected check, show, json, diff or html\n"));
+    EXPECT_THAT(runWithoutServer({"--json", "chek"}).err, HasSubstr("'chek' is no command"));
+    EXPECT_THAT(runWithoutServer({}).err, HasSubstr("a command is missing: expected check, "));
+}
+
+TEST_F(ProgramTest, ASizeThatTheProfileHasNotIsRefused) {
+    for (const std::string profile : {"dmi", "ca", "landesk"}) {
+        const ProgramResult result = runWithoutServer(
+            {"mif", "check", "--profile", profile, "--max-kb", "1", directory.path("none")});
+        EXPECT_EQ(result.exitStatus, 2);
+        EXPECT_THAT(result.err, HasSubstr("--max-kb: only --profile sms has a largest size\n"));
+    }
+    const std::string large = directory.write("large.mif", std::string(1025, ' '));
+    const ProgramResult result =
+        runWithoutServer({"mif", "check", "--max-kb", "1", "--profile", "sms", large});
+    EXPECT_THAT(result.out, HasSubstr("file of 2 KB: the site takes 1\n"));
+}
+
+TEST_F(ProgramTest, JsonSaysThatACommandCouldNotRun) {
+    const std::string none = directory.path("none");
+    EXPECT_EQ(runWithoutServer({"mif", "json", none}).out,
+              "{\n  \"error\": {\n    \"file\": \"" + none +
+                  "\",\n    \"message\": \"there is no such file\"\n  }\n}\n");
+    const std::string broken = directory.write("broken.mif", "Start Component\nName = 7\n");
+    const ProgramResult result = runWithoutServer({"mif", "diff", "--json", broken, broken});
+    EXPECT_EQ(result.exitStatus, 2);
+    EXPECT_THAT(result.out, HasSubstr("\"line\": 2,\n    \"column\": 8,\n    \"message\": "
+                                      "\"expected a literal, found 7\""));
+    EXPECT_EQ(result.err, "sennetctl: " + broken + ":2:8: expected a literal, found 7\n");
+    EXPECT_THAT(runWithoutServer({"get", "CIM_Processor", "--json"}).out,
+                HasSubstr("\"message\": \"Cannot connect to CIM server: "));
+    EXPECT_THAT(runWithoutServer({"get", "--json"}).out,
+                HasSubstr("\"message\": \"CLASS is required\""));
+}
+
+TEST_F(ProgramTest, OutputThatIsLostIsAFailure) {
+    const std::string file = directory.write("x.script.inv", "[CIM]\n");
+    const std::string check = "exec " TEST_BIN_DIR "/sennetctl check --offline " + file;
+    const ProgramResult closed = support::runProgram("/bin/sh", {"-c", check + " >&-"}, {});
+    EXPECT_EQ(closed.exitStatus, 2);
+    EXPECT_EQ(closed.err, "sennetctl: standard output is closed\n");
+    for (const std::string& command : {check, std::string(TEST_BIN_DIR "/sennetctl --help"),
+                                       std::string(TEST_BIN_DIR "/sennetctl mif json none"),
+                                       std::string(TEST_BIN_DIR "/sennetctl server --timeout 1")}) {
+        const ProgramResult full =
+            support::runProgram("/bin/sh", {"-c", command + " >/dev/full"},
+                                {{"CIM_LOCAL_SOCKET", directory.path("none")}});
+        EXPECT_EQ(full.exitStatus, 2) << command;
+        EXPECT_THAT(full.err, HasSubstr("sennetctl: standard output: No space left on device\n"));
+    }
+}
+
 TEST_F(ProgramTest, GetCannotRunWithoutAServer) {
     const ProgramResult result = runWithoutServer({"get", "CIM_Processor"});
     EXPECT_EQ(result.exitStatus, 2);
