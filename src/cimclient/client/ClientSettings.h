@@ -21,7 +21,7 @@ struct ClientSettings {
     /// The same of an answer that describes one class; real ones have some 60,000.
     Uint64 classBodyLimit = Uint64(16) << 20;
     /// Octets of one answer's header and trailer lines together.
-    std::size_t headLimit = 64 * 1024;
+    std::size_t headLimit = std::size_t{64} << 10;
 
     static ClientSettings standard();
 };

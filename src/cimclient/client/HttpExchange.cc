@@ -17,8 +17,8 @@ namespace Pegasus {
 
 namespace {
 
-constexpr long kBufferOctets = 256 * 1024;
-constexpr std::size_t kSkipOctets = 16 * 1024;
+constexpr long kBufferOctets = 256L << 10;
+constexpr std::size_t kSkipOctets = std::size_t{16} << 10;
 
 void initializeCurlOnce() {
     static const CURLcode initialized = curl_global_init(CURL_GLOBAL_NOTHING);
