@@ -308,6 +308,28 @@ def _(trial):
     return "every class is answered, with an error or with what is left; below 256 MiB"
 
 
+def get_instance_through(references):
+    """A request for an instance whose key is a reference, and so on."""
+    name = '<INSTANCENAME CLASSNAME="Test_Place"><KEYVALUE>x</KEYVALUE></INSTANCENAME>'
+    for _ in range(references):
+        name = ('<INSTANCENAME CLASSNAME="Test_Place"><VALUE.REFERENCE>' + name +
+                "</VALUE.REFERENCE></INSTANCENAME>")
+    return post(call("GetInstance", f'<IPARAMVALUE NAME="InstanceName">{name}</IPARAMVALUE>'))
+
+
+@SUITE.case("requests with references in each other's keys, 25 deep")
+def _(trial):
+    with rows.place() as place, Daemon(trial, pathlib.Path(place)) as daemon:
+        for references, status in ((4, b"200"), (5, b"400"), *[(25, b"400")] * 50):
+            trial.count()
+            with socket.create_connection(("127.0.0.1", daemon.http_port)) as connection:
+                octets = exchange(connection, get_instance_through(references), rows.PATIENCE_S)
+            expect(octets.startswith(b"HTTP/1.1 " + status), f"{references}: {octets[:300]!r}")
+        daemon.expect_memory_below(daemon.memory("VmHWM"), 64 * MIB, "at most")
+        daemon.expect_end()
+    return "refused, beyond four; below 64 MiB"
+
+
 @SUITE.case("a source that never answers")
 def _(trial):
     neighbours.need()

@@ -110,6 +110,12 @@ AMBIGUOUS = {
     "a NUL behind the host": with_lines(HOST, HOST + b"\0.evil.example"),
     "a NUL at the end of the head": with_lines(
         HOST + b"\r\n", b"").replace(b"\r\n\r\n", b"\r\n" + HOST + b"\0evil\r\n\r\n", 1),
+    "a NUL behind the path": KEPT_OPEN.replace(b"/cimom ", b"/cimom\0/evil "),
+    "a NUL behind the version": KEPT_OPEN.replace(b"HTTP/1.1\r", b"HTTP/1.1\0evil\r", 1),
+    "a NUL behind the method": KEPT_OPEN.replace(b"POST ", b"POST\0evil ", 1),
+    "a host on two lines": with_lines(HOST, b"Host:\r\n localhost"),
+    "a NUL in a line of two": with_lines(HOST, HOST + b"\r\nX-Field: a\r\n b\0c"),
+    "a NUL before a line of two": with_lines(HOST, HOST + b"\0evil\r\nX-Field: a\r\n b"),
     "two lengths, the wrong one last": with_lines(LENGTH, LENGTH, b"Content-Length: 3"),
     "two lengths, the wrong one first": with_lines(LENGTH, b"Content-Length: 3", LENGTH),
     "a length beside chunks": in_chunks(LENGTH, CHUNKED),
@@ -127,6 +133,8 @@ def _(trial):
         daemon.expect_served(in_chunks(CHUNKED + b"\r\nConnection: close"), "a body in chunks")
         daemon.expect_served(GOOD.replace(b"\r\n", b"\n"), "lines that end with LF alone")
         daemon.expect_served(GOOD.replace(b": ", b": \t "), "blanks before the values")
+        for field in (b"X-Empty:", b"X-Blank: ", b"Cookie: a=b; c", b"X-Field:a \t"):
+            daemon.expect_served(GOOD.replace(HOST, HOST + b"\r\n" + field), field)
         for what, request in AMBIGUOUS.items():
             trial.count()
             daemon.expect_refused(request, 400, what)

@@ -29,10 +29,9 @@ struct HttpServer::State {
     ConnectionPlaces places;
     MHD_Daemon* daemon = nullptr;
 
-    MHD_Result handle(MHD_Connection* connection, const char* url, const char* method,
-                      std::string_view data, void** context);
-    MHD_Result begin(MHD_Connection* connection, const char* url, const char* method,
-                     void** context);
+    MHD_Result handle(MHD_Connection* connection, const RequestLine& line, std::string_view data,
+                      void** context);
+    MHD_Result begin(MHD_Connection* connection, const RequestLine& line, void** context);
 };
 
 namespace {
@@ -169,10 +168,10 @@ void freeExchange(void** context) {
 
 }  // namespace
 
-MHD_Result HttpServer::State::begin(MHD_Connection* connection, const char* url, const char* method,
+MHD_Result HttpServer::State::begin(MHD_Connection* connection, const RequestLine& line,
                                     void** context) {
     auto exchange = std::make_unique<Exchange>();
-    exchange->head = requestHead(connection, url, method);
+    exchange->head = requestHead(connection, line);
     exchange->refusal = service.refusalOf(exchange->head);
     const bool asksFirst =
         MHD_lookup_connection_value(connection, MHD_HEADER_KIND, MHD_HTTP_HEADER_EXPECT) != nullptr;
@@ -185,11 +184,11 @@ MHD_Result HttpServer::State::begin(MHD_Connection* connection, const char* url,
     return MHD_YES;
 }
 
-MHD_Result HttpServer::State::handle(MHD_Connection* connection, const char* url,
-                                     const char* method, std::string_view data, void** context) {
+MHD_Result HttpServer::State::handle(MHD_Connection* connection, const RequestLine& line,
+                                     std::string_view data, void** context) {
     auto* exchange = static_cast<Exchange*>(*context);
     if (exchange == nullptr)
-        return begin(connection, url, method, context);
+        return begin(connection, line, context);
     if (!data.empty())
         return exchange->takes(data) ? MHD_YES : MHD_NO;
     const ServersTurn turn(watchedOf(connection), limits.patience);
@@ -214,11 +213,12 @@ void HttpServer::stop() {
 void HttpServer::start(std::function<void()> closed) {
     state->closed = std::move(closed);
     const auto handle = [](void* closure, MHD_Connection* connection, const char* url,
-                           const char* method, const char*, const char* data, std::size_t* size,
-                           void** context) -> MHD_Result {
+                           const char* method, const char* version, const char* data,
+                           std::size_t* size, void** context) -> MHD_Result {
         try {
             const std::string_view piece(data, std::exchange(*size, 0));
-            return static_cast<State*>(closure)->handle(connection, url, method, piece, context);
+            return static_cast<State*>(closure)->handle(connection, {method, url, version}, piece,
+                                                        context);
         } catch (...) {
             // Out of memory: give this connection up, the others go on.
             return MHD_NO;

@@ -27,11 +27,14 @@ std::optional<std::string> header(MHD_Connection* connection, const char* name) 
 class HeadCheck {
   public:
     /// The library cuts the head up where it lies, which starts with the method.
-    HeadCheck(MHD_Connection* connection, const char* method) : begin(method), end(method) {
+    HeadCheck(MHD_Connection* connection, const RequestLine& line)
+        : begin(line.method), end(line.method), checked(line.method) {
         const MHD_ConnectionInfo* info =
             MHD_get_connection_info(connection, MHD_CONNECTION_INFO_REQUEST_HEADER_SIZE);
         if (info != nullptr)
             end += info->header_size;
+        for (const char* part : {line.method, line.url, line.version})
+            takePart(part);
         const auto each = [](void* self, MHD_ValueKind, const char* name, std::size_t nameSize,
                              const char* value, std::size_t valueSize) -> MHD_Result {
             static_cast<HeadCheck*>(self)->take({name, nameSize}, {value, valueSize});
@@ -48,9 +51,14 @@ class HeadCheck {
     }
 
   private:
+    void takePart(std::string_view part) {
+        expectBlank(part.data());
+        checked = part.data() + part.size();
+    }
+
     void take(std::string_view name, std::string_view value) {
         expectBlank(name.data());
-        lineEnd = value.data() + value.size();
+        checked = value.data() + value.size();
         if (equalsIgnoringCase(name, MHD_HTTP_HEADER_HOST)) {
             ++hosts;
         } else if (equalsIgnoringCase(name, MHD_HTTP_HEADER_CONTENT_LENGTH)) {
@@ -61,15 +69,14 @@ class HeadCheck {
         }
     }
 
-    /// A value ends at a NUL in it for the library. What its line had behind that still lies
-    /// between the value and `next`; where lines end otherwise, nothing is left of their ends.
+    /// A text ends at a NUL in it for the library, whatever sizes it tells. What the client sent
+    /// behind that still lies before the next text; where texts end otherwise, nothing is left of
+    /// their ends. Where the library has a text elsewhere nobody can tell, so it is refused.
     void expectBlank(const char* next) {
-        if (!isInHead(lineEnd) || !isInHead(next))
-            return;
         constexpr std::string_view kBlank("\0\r\n \t", 5);
-        hidesText = hidesText || std::any_of(lineEnd, std::max(lineEnd, next), [&](char c) {
-                        return kBlank.find(c) == std::string_view::npos;
-                    });
+        hidesText = hidesText || !isInHead(checked) || !isInHead(next) ||
+                    std::any_of(checked, std::max(checked, next),
+                                [&](char c) { return kBlank.find(c) == std::string_view::npos; });
     }
 
     bool isInHead(const char* place) const {
@@ -79,7 +86,8 @@ class HeadCheck {
 
     const char* begin;
     const char* end;
-    const char* lineEnd = nullptr;
+    /// Where the text ends that was looked at last.
+    const char* checked;
     bool hidesText = false;
     bool unknownCoding = false;
     unsigned hosts = 0;
@@ -89,12 +97,12 @@ class HeadCheck {
 
 }  // namespace
 
-HttpHead requestHead(MHD_Connection* connection, const char* url, const char* method) {
+HttpHead requestHead(MHD_Connection* connection, const RequestLine& line) {
     HttpHead head;
-    head.method = method;
-    head.path = url;
+    head.method = line.method;
+    head.path = line.url;
     head.fromNetwork = isFromNetwork(connection);
-    head.isAmbiguous = HeadCheck(connection, method).isAmbiguous();
+    head.isAmbiguous = HeadCheck(connection, line).isAmbiguous();
     head.host = header(connection, MHD_HTTP_HEADER_HOST);
     head.contentType = header(connection, MHD_HTTP_HEADER_CONTENT_TYPE);
     head.contentLength = header(connection, MHD_HTTP_HEADER_CONTENT_LENGTH);

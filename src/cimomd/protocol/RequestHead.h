@@ -8,7 +8,14 @@ struct MHD_Connection;
 
 namespace cimomd {
 
-/// To be called when the library first tells of a request; `url` and `method` are what it tells.
-HttpHead requestHead(MHD_Connection* connection, const char* url, const char* method);
+/// The first line of a request, as the library cut it up where it lies.
+struct RequestLine {
+    const char* method;
+    const char* url;
+    const char* version;
+};
+
+/// To be called when the library first tells of a request.
+HttpHead requestHead(MHD_Connection* connection, const RequestLine& line);
 
 }  // namespace cimomd
