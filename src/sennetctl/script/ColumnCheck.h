@@ -1,6 +1,6 @@
 #pragma once
 
-// What becomes of the values of one column on their way into the files.
+// One column of a script as the server and the resource properties describe it.
 
 #include <Pegasus/Common/CIMProperty.h>
 #include <Velm/Properties.h>
@@ -21,12 +21,15 @@ struct Column {
 /// None when neither the class nor an instance has the property.
 std::optional<Column> columnOf(const AnsweredClass& answered, const std::string& property);
 
+/// Whether the class declares the property with this qualifier.
+bool hasQualifier(const Column& column, const char* name);
+
 bool isEmpty(const Column& column, const AnsweredClass& answered);
 
-/// A sentence for each way in which values are changed: texts that are cut or longer than the
-/// column, integers that do not survive 32 bits.
-std::vector<std::string> lossesIn(const Column& column, const AnsweredClass& answered,
-                                  const Velm::Properties& texts);
+/// The width that the resource properties give, else the class, in characters; 0 for none and for
+/// what is no number.
+std::size_t declaredSize(const Column& column, const AnsweredClass& answered,
+                         const Velm::Properties& texts);
 
 /// Whether the width of a text column is only a guess.
 bool lacksSize(const Column& column, const AnsweredClass& answered, const Velm::Properties& texts);

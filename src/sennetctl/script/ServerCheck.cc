@@ -4,6 +4,7 @@
 #include "report/Text.h"
 #include "script/ColumnCheck.h"
 #include "script/NameCheck.h"
+#include "script/ValueCheck.h"
 
 namespace sennetctl {
 
@@ -13,6 +14,12 @@ namespace {
 
 std::string nameOf(const AnsweredClass& answered) {
     return textOf(answered.definition.getClassName());
+}
+
+/// What an empty column shows nevertheless.
+std::string insteadOf(const Column& column, const AnsweredClass& answered) {
+    const std::string stand = standInFor(column, answered);
+    return stand.empty() ? "" : "; " + stand + " is written";
 }
 
 }  // namespace
@@ -97,8 +104,8 @@ void ServerCheck::checkColumns(const ScriptModel& model, const AnsweredClass& an
                     ": the column stays empty");
             continue;
         }
-        for (const std::string& message : lossesIn(*column, answered, texts)) {
-            add(model, property, Severity::Warning, message);
+        for (const ValueRemark& remark : remarksOn(*column, answered, texts)) {
+            add(model, property, remark.severity, remark.message);
         }
         if (scope.sizes && lacksSize(*column, answered, texts)) {
             add(model, property, Severity::Warning,
@@ -109,7 +116,7 @@ void ServerCheck::checkColumns(const ScriptModel& model, const AnsweredClass& an
             const std::string reason = missing.reasonFor(answered, property.value);
             add(model, property, Severity::Note,
                 "the column " + property.value + " is empty" +
-                    (reason.empty() ? "" : ": " + reason));
+                    (reason.empty() ? "" : ": " + reason) + insteadOf(*column, answered));
         }
     }
 }

@@ -124,6 +124,31 @@ TEST_F(ServerCheckTest, TextsThatAreCutOrLongerThanTheirColumn) {
               "values at 32\n");
 }
 
+TEST_F(ServerCheckTest, NamesOfNumbersThatAreLongerThanTheirColumn) {
+    texts.set("CIM_Fan.State.Size", "7");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=State\n"),
+              "5:6: warning: 1 value of State longer than the column of 7\n")
+        << "Disabled has eight letters, Enabled seven";
+}
+
+TEST_F(ServerCheckTest, LettersThatBecomeBlanks) {
+    fans.setFans(fanXml("L\xC3\xBC"
+                        "fter",
+                        "2", "1") +
+                 fanXml("Luefter", "2", "1") + fanXml("a&#9;b", "2", "1"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),
+              "5:6: warning: 2 values of DeviceID with letters beyond ASCII or control characters: "
+              "each becomes a blank\n");
+}
+
+TEST_F(ServerCheckTest, ValuesThatAreMissingInSomeRows) {
+    wantNotes = true;
+    fans.setFans(fanXml("a", "2", "1") + instanceXml("CIM_Fan", "b", ""));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,Bytes\n"),
+              "4:6: note: CIM_Fan: 2 instances\n"
+              "5:15: note: 1 value of Bytes missing: 0 (for QVE null) is written\n");
+}
+
 TEST_F(ServerCheckTest, EmptyColumnsAndTheirReason) {
     wantNotes = true;
     EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Spare\n"),
