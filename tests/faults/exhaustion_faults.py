@@ -228,7 +228,7 @@ for _name, _make in TOKENS.items():
                 if trial.full or outcome == WHOLE:
                     blocks = [b"x" * BLOCK] * (count // BLOCK) + [b"x" * (count % BLOCK)]
                     run.expect(outcome, INSTANCES, filled(make, blocks), f"{count} octets",
-                               memory=4 * MEMORY_LIMIT)
+                               memory=5 * MEMORY_LIMIT)
         return f"{WHOLE}; {EMPTY}; next script right"
 
 
