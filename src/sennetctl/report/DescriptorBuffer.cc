@@ -8,7 +8,7 @@ namespace sennetctl {
 
 namespace {
 
-constexpr std::size_t kBufferOctets = 16 * 1024;
+constexpr std::size_t kBufferOctets = std::size_t{16} << 10;
 
 }  // namespace
 
