@@ -1,8 +1,9 @@
 #include "script/NewCommand.h"
 
+#include <Velm/PropertiesFile.h>
 #include <Velm/TextFile.h>
-#include <algorithm>
 
+#include <algorithm>
 #include <filesystem>
 #include <ostream>
 
@@ -12,32 +13,67 @@
 #include "report/Progress.h"
 #include "report/Text.h"
 #include "report/WholeFile.h"
+#include "script/ColumnNames.h"
 #include "script/NewScript.h"
 #include "script/ScriptModel.h"
+#include "script/ScriptText.h"
+#include "utf8/Utf8.h"
 
 namespace sennetctl {
 
 namespace {
 
 constexpr std::string_view kSuffix = ".script.inv";
+constexpr std::size_t kLongestTitle = 13;  // what no product shortens
 
 /// The path without .script.inv.
 std::string pathWithoutSuffix(const std::string& script) {
-    if (script.size() <= kSuffix.size() ||
-        script.compare(script.size() - kSuffix.size(), kSuffix.size(), kSuffix) != 0) {
-        throw CannotRun(script, "the name of a script ends in .script.inv");
+    const std::string name = std::filesystem::path(script).filename().string();
+    if (name.size() <= kSuffix.size() ||
+        name.compare(name.size() - kSuffix.size(), kSuffix.size(), kSuffix) != 0) {
+        throw CannotRun(script + ": the name of a script ends in .script.inv");
     }
     return script.substr(0, script.size() - kSuffix.size());
 }
 
 /// A script has no way to write these.
 void refuseTitle(const std::string& title) {
+    constexpr std::size_t kLongestTitle = 200;
     const bool any = std::any_of(title.begin(), title.end(), [](char c) {
         return c == '"' || c == '=' || static_cast<unsigned char>(c) < 0x20 || c == 0x7F;
     });
     if (any) {
         throw CannotRun("a title has no double quote, no '=' and no control character");
     }
+    if (title.empty() || title.size() > kLongestTitle || utf8::clean(title) != title) {
+        throw CannotRun("a title is a text in UTF-8 of 1 to 200 octets");
+    }
+}
+
+void refuseRepeatedClasses(const std::vector<std::string>& classes) {
+    for (auto name = classes.begin(); name != classes.end(); ++name) {
+        const bool repeated = std::any_of(classes.begin(), name, [&](const std::string& other) {
+            return sameIgnoringCase(other, *name);
+        });
+        if (repeated) {
+            throw CannotRun("the class " + *name + " is given twice");
+        }
+    }
+}
+
+/// Files, title and texts; the classes are for the server to tell.
+NewScriptPlan planFor(const NewOptions& options) {
+    NewScriptPlan plan;
+    plan.fileName = std::filesystem::path(options.script).filename().string();
+    const std::string stem = readableName(pathWithoutSuffix(plan.fileName));
+    plan.title = options.title.empty() ? trimmed(stem) + " Inventory" : trimmed(options.title);
+    refuseTitle(plan.title);
+    plan.shownTitle = withShorterWords(options.title.empty() ? stem : plan.title, kLongestTitle);
+    plan.nameSpace = options.nameSpace;
+    Velm::PropertiesFile texts(options.resources.c_str());
+    texts.load();
+    plan.texts = texts.getProperties();
+    return plan;
 }
 
 std::vector<AnsweredClass> askFor(const NewOptions& options, const Output& output) {
@@ -56,18 +92,24 @@ std::vector<AnsweredClass> askFor(const NewOptions& options, const Output& outpu
     return classes;
 }
 
-void report(const std::string& script, const std::string& properties, const NewScript& texts,
+void report(const NewOptions& options, const std::string& properties, const NewScript& texts,
             const Output& output) {
+    const std::string& script = options.script;
     if (output.json) {
         Json document = Json::object();
         document["script"] = script;
         document["properties"] = properties;
         document["leftOut"] = texts.leftOut;
+        document["present"] = texts.present;
         printJson(document, output);
         return;
     }
     for (const std::string& leftOut : texts.leftOut) {
         output.out << "not listed: " << printable(leftOut) << '\n';
+    }
+    for (const std::string& present : texts.present) {
+        output.out << "in " << printable(options.resources) << " already: " << printable(present)
+                   << '\n';
     }
     output.out
         << "Written: " << printable(script) << " and " << printable(properties)
@@ -84,13 +126,12 @@ int writeNewScript(const NewOptions& options, const Output& output) {
     if (options.classes.size() > ScriptModel::kSlots) {
         throw CannotRun("a script has room for 10 classes");
     }
-    refuseTitle(options.title);
+    refuseRepeatedClasses(options.classes);
+    NewScriptPlan plan = planFor(options);
     refuseExisting(options.script);
     refuseExisting(properties);
-    const std::string stem = std::filesystem::path(path).filename().string();
-    const std::string title =
-        options.title.empty() ? readableName(stem) + " Inventory" : options.title;
-    const NewScript texts = composeScript(stem, title, options.nameSpace, askFor(options, output));
+    plan.classes = askFor(options, output);
+    const NewScript texts = composeScript(plan);
     writeWholeFile(properties, texts.properties);
     try {
         writeWholeFile(options.script, texts.script);
@@ -98,7 +139,7 @@ int writeNewScript(const NewOptions& options, const Output& output) {
         Velm::TextFile(properties.c_str()).remove();
         throw;
     }
-    report(options.script, properties, texts, output);
+    report(options, properties, texts, output);
     return kFine;
 }
 

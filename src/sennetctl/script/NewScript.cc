@@ -3,8 +3,13 @@
 #include <algorithm>
 #include <string_view>
 
+#include "SennetConverter/framework/NameRules.h"
 #include "cim/CimText.h"
+#include "report/Text.h"
+#include "report/WholeFile.h"
 #include "script/ColumnCheck.h"
+#include "script/ColumnNames.h"
+#include "script/ValueCheck.h"
 
 namespace sennetctl {
 
@@ -13,66 +18,102 @@ using namespace Pegasus;
 namespace {
 
 constexpr std::size_t kLineLimit = 1024;
-constexpr std::size_t kLongestTitle = 13;  // what no product shortens
-constexpr const char* kGuessedSize = "64";
-
-bool isCapital(char c) {
-    return c >= 'A' && c <= 'Z';
-}
+constexpr std::size_t kLongestText = 255;
 
 bool endsWith(const std::string& text, std::string_view end) {
     return text.size() >= end.size() &&
            text.compare(text.size() - end.size(), end.size(), end) == 0;
 }
 
-std::string withUnderscores(std::string text) {
-    std::replace(text.begin(), text.end(), ' ', '_');
+/// A key as a file of properties has it, in which some characters mean something.
+std::string escapedKey(const std::string& key) {
+    std::string text;
+    for (const char c : key) {
+        if (c == '\\' || c == ':' || c == '=') {
+            text += '\\';
+        }
+        text += c;
+    }
     return text;
+}
+
+std::string escapedValue(const std::string& value) {
+    std::string text;
+    for (const char c : value) {
+        text.append(c == '\\' ? 2 : 1, c);
+    }
+    return text;
+}
+
+/// A guess with room for longer values.
+std::size_t sizeFor(std::size_t longest) {
+    for (const std::size_t size : {std::size_t(64), std::size_t(128)}) {
+        if (longest <= size) {
+            return size;
+        }
+    }
+    return kLongestText;
 }
 
 class Composer {
   public:
-    NewScript compose(const std::string& stem, const std::string& title,
-                      const std::string& nameSpace, const std::vector<AnsweredClass>& classes) {
-        result.script = "[DEFAULT]\ntitle=" + title + "\n\n[CIM]\n";
-        result.properties = "# " + stem + ".script.inv\ntitle." + withUnderscores(title) + "=" +
-                            readableName(stem).substr(0, kLongestTitle) + "\n";
-        for (std::size_t i = 0; i < classes.size(); ++i) {
-            addClass(std::to_string(i), nameSpace, classes[i]);
+    explicit Composer(const NewScriptPlan& thePlan) : plan(thePlan) {}
+
+    NewScript compose() {
+        result.script = "[DEFAULT]\ntitle=" + plan.title + "\n\n[CIM]\n";
+        result.properties = "# " + printable(plan.fileName) + "\n";
+        std::string key = "title." + plan.title;
+        std::replace(key.begin(), key.end(), ' ', '_');
+        addText(key, plan.shownTitle);
+        // Behind a class without instances the others would get its columns.
+        for (const bool empty : {false, true}) {
+            for (const AnsweredClass& answered : plan.classes) {
+                if (answered.instances.empty() == empty) {
+                    addClass(answered);
+                }
+            }
+        }
+        for (const Entry& entry : entries) {
+            addNames(entry);
         }
         return result;
     }
 
   private:
-    void addClass(const std::string& slot, const std::string& nameSpace,
-                  const AnsweredClass& answered) {
+    /// A property that is listed.
+    struct Entry {
+        const AnsweredClass* answered;
+        std::string key;
+        std::string property;
+    };
+
+    void addClass(const AnsweredClass& answered) {
         const std::string className = textOf(answered.definition.getClassName());
-        std::string list = "A[" + slot + "]=";
-        bool first = true;
-        CIMClass definition = answered.definition;
-        for (Uint32 i = 0; i < definition.getPropertyCount(); ++i) {
-            const std::string name = textOf(definition.getProperty(i).getName());
-            const std::string reason = reasonToLeaveOut(answered, name);
+        const std::string number = "[" + std::to_string(slot++) + "]=";
+        std::string list = "A" + number;
+        const std::size_t start = list.size();
+        for (Uint32 i = 0; i < answered.definition.getPropertyCount(); ++i) {
+            const std::string name = textOf(CIMClass(answered.definition).getProperty(i).getName());
+            const std::string key = className + "." + name;
             const bool tooLong = list.size() + 1 + name.size() > kLineLimit;
-            if (!reason.empty() || tooLong) {
-                leaveOut(className, name, tooLong ? "the line would be too long" : reason);
+            const std::string reason =
+                tooLong ? "the line would be too long" : reasonToLeaveOut(answered, key, name);
+            if (!reason.empty()) {
+                result.leftOut.push_back(key + ": " + reason);
                 continue;
             }
-            list.append(first ? "" : ",").append(name);
-            first = false;
-            addNames(answered, className, name);
+            list.append(list.size() == start ? "" : ",").append(name);
+            entries.push_back({&answered, key, name});
+        }
+        if (list.size() == start) {
+            throw CannotRun(className + " has no property that a script can list");
         }
         result.script +=
-            "G[" + slot + "]=" + className + "\nN[" + slot + "]=" + nameSpace + "\n" + list + "\n";
+            "G" + number + className + "\nN" + number + plan.nameSpace + "\n" + list + "\n";
     }
 
-    void leaveOut(const std::string& className, const std::string& name,
-                  const std::string& reason) {
-        std::string text = className;
-        result.leftOut.push_back(text.append(".").append(name).append(": ").append(reason));
-    }
-
-    static std::string reasonToLeaveOut(const AnsweredClass& answered, const std::string& name) {
+    std::string reasonToLeaveOut(const AnsweredClass& answered, const std::string& key,
+                                 const std::string& name) {
         const std::optional<Column> column = columnOf(answered, name);
         const CIMType type = column->declared->getType();
         if (type == CIMTYPE_REFERENCE || type == CIMTYPE_OBJECT || type == CIMTYPE_INSTANCE) {
@@ -81,44 +122,61 @@ class Composer {
         if (endsWith(name, "CreationClassName")) {
             return "it is the name of a class";
         }
-        const bool empty = !answered.instances.empty() && isEmpty(*column, answered);
-        return empty ? "it has no value on this machine" : "";
+        if (!answered.instances.empty() && isEmpty(*column, answered)) {
+            return "it has no value on this machine";
+        }
+        if (countWideValues(*column, answered) > 0) {
+            return "it has numbers beyond 32 bits with sign";
+        }
+        if (hasText(key) && !names.take(textGivenTo(answered, name))) {
+            return "its name " + textGivenTo(answered, name) + " is that of another column";
+        }
+        return {};
     }
 
-    void addNames(const AnsweredClass& answered, const std::string& className,
-                  const std::string& name) {
-        const std::string key = className + "." + name;
-        result.properties += key + "=" + readableName(name) + "\n";
-        if (lacksSize(*columnOf(answered, name), answered, Velm::Properties())) {
-            result.properties += key + ".Size=" + kGuessedSize + "\n";
+    bool hasText(const std::string& key) const {
+        return plan.texts.getPropertyValue(key.c_str()) != nullptr;
+    }
+
+    std::string textGivenTo(const AnsweredClass& answered, const std::string& name) const {
+        return textOf(translatedPropertyName(
+            plan.texts, answered.definition.getClassName().getString(), String(name.c_str())));
+    }
+
+    void addNames(const Entry& entry) {
+        const Column column = *columnOf(*entry.answered, entry.property);
+        const bool isNamed = hasText(entry.key);
+        addText(entry.key, isNamed ? "" : names.choose(readableName(entry.property)));
+        const std::size_t longest =
+            column.declared->isArray()
+                ? 0
+                : std::min(longestText(column, *entry.answered), kLongestText);
+        const std::size_t declared = declaredSize(column, *entry.answered, Velm::Properties());
+        if (lacksSize(column, *entry.answered, Velm::Properties()) ||
+            (declared > 0 && longest > declared)) {
+            addText(entry.key + ".Size", std::to_string(sizeFor(longest)));
         }
     }
 
+    void addText(const std::string& key, const std::string& text) {
+        if (hasText(key)) {
+            result.present.push_back(key);
+        } else {
+            result.properties += escapedKey(key) + "=" + escapedValue(text) + "\n";
+        }
+    }
+
+    const NewScriptPlan& plan;
+    unsigned slot = 0;
+    ColumnNames names;
+    std::vector<Entry> entries;
     NewScript result;
 };
 
 }  // namespace
 
-NewScript composeScript(const std::string& stem, const std::string& title,
-                        const std::string& nameSpace, const std::vector<AnsweredClass>& classes) {
-    return Composer().compose(stem, title, nameSpace, classes);
-}
-
-std::string readableName(const std::string& name) {
-    std::string text;
-    for (std::size_t i = 0; i < name.size(); ++i) {
-        const bool afterSmall = i > 0 && !isCapital(name[i - 1]);
-        const bool beforeSmall =
-            i > 0 && i + 1 < name.size() && name[i + 1] >= 'a' && name[i + 1] <= 'z';
-        if (isCapital(name[i]) && (afterSmall || beforeSmall)) {
-            text += ' ';
-        }
-        text += name[i] == '_' ? ' ' : name[i];
-    }
-    if (!text.empty() && text[0] >= 'a' && text[0] <= 'z') {
-        text[0] = static_cast<char>(text[0] - 'a' + 'A');
-    }
-    return text;
+NewScript composeScript(const NewScriptPlan& plan) {
+    return Composer(plan).compose();
 }
 
 }  // namespace sennetctl

@@ -7,7 +7,6 @@
 #include "FanServer.h"
 #include "report/WholeFile.h"
 #include "script/CheckCommand.h"
-#include "script/NewScript.h"
 #include "support/TempDirectory.h"
 
 namespace sennetctl {
@@ -31,7 +30,11 @@ class NewCommandTest : public testing::Test {
     FanServer fans;
     support::TempDirectory directory;
     CapturedOutput output;
-    NewOptions options{directory.path("coolers.script.inv"), {"CIM_Fan"}, "root/cimv2", ""};
+    NewOptions options{directory.path("coolers.script.inv"),
+                       {"CIM_Fan"},
+                       "root/cimv2",
+                       "",
+                       directory.path("texts")};
 };
 
 TEST_F(NewCommandTest, WritesScriptAndProperties) {
@@ -98,7 +101,82 @@ TEST_F(NewCommandTest, TitlesThatNoScriptCanHave) {
         EXPECT_EQ(failureOf(options),
                   "a title has no double quote, no '=' and no control character");
     }
+    for (const std::string& title :
+         {std::string("M\xFCller"), std::string(" "), std::string(201, 'x')}) {
+        options.title = title;
+        EXPECT_EQ(failureOf(options), "a title is a text in UTF-8 of 1 to 200 octets");
+    }
+    options = {directory.path("a\"b.script.inv"), {"CIM_Fan"}, "root/cimv2", "", ""};
+    EXPECT_EQ(failureOf(options), "a title has no double quote, no '=' and no control character");
     EXPECT_THAT(directory.names(), ElementsAre());
+}
+
+TEST_F(NewCommandTest, TitlesAreTrimmedAndShownShort) {
+    options.title = " Coolers: all \\ of them ";
+    writeNewScript(options, output.plain());
+    EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("title=Coolers: all \\ of them\n"));
+    EXPECT_THAT(directory.read("coolers.properties"),
+                HasSubstr("\ntitle.Coolers\\:_all_\\\\_of_them=Co al \\\\ of th\n"));
+}
+
+TEST_F(NewCommandTest, WhatIsNamedAlreadyIsNotNamedAgain) {
+    directory.write("texts",
+                    "title.Coolers_Inventory=Cold\nCIM_Fan.DeviceID=State\n"
+                    "CIM_Fan.State.Size=8\n");
+    writeNewScript(options, output.plain());
+    EXPECT_EQ(directory.read("coolers.properties"),
+              "# coolers.script.inv\nCIM_Fan.State=State 2\nCIM_Fan.Bytes=Bytes\n");
+    const std::string in = "in " + options.resources + " already: ";
+    EXPECT_THAT(output.text(), HasSubstr(in + "title.Coolers_Inventory\n" + in +
+                                         "CIM_Fan.DeviceID\n" + in + "CIM_Fan.State.Size\n"));
+}
+
+TEST_F(NewCommandTest, ANameThatAnotherColumnHasLeavesThePropertyOut) {
+    directory.write("texts", "CIM_Fan.DeviceID=Fan\nCIM_Fan.State=FAN\n");
+    writeNewScript(options, output.json());
+    EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("A[0]=DeviceID,Bytes\n"));
+    EXPECT_EQ(output.document()["leftOut"][0],
+              "CIM_Fan.State: its name FAN is that of another column");
+    EXPECT_EQ(output.document()["present"].dump(), "[\"CIM_Fan.DeviceID\"]");
+}
+
+TEST_F(NewCommandTest, NumbersThatDoNotFitAreLeftOut) {
+    fans.setFans(fanXml("a", "2", "2147483648"));
+    writeNewScript(options, output.json());
+    EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("A[0]=DeviceID,State\n"));
+    EXPECT_EQ(output.document()["leftOut"][0],
+              "CIM_Fan.Bytes: it has numbers beyond 32 bits with sign");
+}
+
+TEST_F(NewCommandTest, SizesHaveRoomForTheValues) {
+    fans.setFans(fanXml(std::string(65, 'x'), "2", "1"));
+    writeNewScript(options, output.plain());
+    EXPECT_THAT(directory.read("coolers.properties"), HasSubstr("CIM_Fan.DeviceID.Size=128\n"));
+}
+
+TEST_F(NewCommandTest, ClassesWithoutInstancesComeLast) {
+    fans.server.onGetClass(
+        "CIM_None", support::Reply::ok(
+                        R"(<CLASS NAME="CIM_None"><PROPERTY NAME="ID" TYPE="string"/></CLASS>)"));
+    fans.server.onEnumerateInstances("CIM_None", support::Reply::ok(""));
+    options.classes = {"CIM_None", "CIM_Fan"};
+    writeNewScript(options, output.plain());
+    EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("G[0]=CIM_Fan\n"));
+    EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("G[1]=CIM_None\n"));
+}
+
+TEST_F(NewCommandTest, AClassOfWhichNothingCanBeListed) {
+    fans.server.onGetClass(
+        "CIM_Fan",
+        support::Reply::ok(R"(<CLASS NAME="CIM_Fan"><PROPERTY.REFERENCE NAME="Other"/></CLASS>)"));
+    EXPECT_EQ(failureOf(options), "CIM_Fan has no property that a script can list");
+    EXPECT_THAT(directory.names(), IsEmpty());
+}
+
+TEST_F(NewCommandTest, AClassThatIsGivenTwice) {
+    options.classes = {"CIM_Fan", "CIM_None", "cim_fan"};
+    EXPECT_EQ(failureOf(options), "the class cim_fan is given twice");
+    EXPECT_THAT(directory.names(), IsEmpty());
 }
 
 TEST_F(NewCommandTest, NothingIsReplaced) {
@@ -111,22 +189,15 @@ TEST_F(NewCommandTest, NothingIsReplaced) {
 TEST_F(NewCommandTest, NothingIsLeftBehindByAFailure) {
     options.classes = {"CIM_Fan", "CIM_None"};
     EXPECT_THAT(failureOf(options), HasSubstr("root/cimv2:CIM_None: CIM_ERR_NOT_FOUND (6)"));
-    options.classes.assign(11, "CIM_Fan");
+    options.classes.assign(11, "CIM_None");
     EXPECT_EQ(failureOf(options), "a script has room for 10 classes");
-    options = {directory.path("fans.inv"), {"CIM_Fan"}, "root/cimv2", ""};
+    options.script = directory.path("fans.inv");
     EXPECT_EQ(failureOf(options),
               directory.path("fans.inv") + ": the name of a script ends in .script.inv");
-    options = {directory.path("none/fans.script.inv"), {"CIM_Fan"}, "root/cimv2", ""};
+    options.script = directory.path("none/fans.script.inv");
+    options.classes = {"CIM_Fan"};
     EXPECT_EQ(failureOf(options), directory.path("none/fans.properties") + ": cannot be written");
     EXPECT_THAT(directory.names(), IsEmpty());
-}
-
-TEST(ReadableNameTest, WordsBeginWithCapitals) {
-    EXPECT_EQ(readableName("MaxClockSpeed"), "Max Clock Speed");
-    EXPECT_EQ(readableName("DeviceID"), "Device ID");
-    EXPECT_EQ(readableName("OSType"), "OS Type");
-    EXPECT_EQ(readableName("own_name"), "Own name");
-    EXPECT_EQ(readableName(""), "");
 }
 
 }  // namespace
