@@ -15,7 +15,20 @@ std::string textIn(const CIMInstance& instance, const char* property) {
                                      : textOf(instance.getProperty(position).getValue().toString());
 }
 
-/// The name of the reason.
+/// What is to be done about a reason, or why nothing can be; empty for one that is not known here.
+std::string meaningOf(const std::string& reason) {
+    static const std::map<std::string, std::string> kMeanings = {
+        {"Absent", "the machine does not tell it"},
+        {"Needs Root", "run as root or let the service run"},
+        {"Filtered", "the maker left a placeholder"},
+        {"Timed Out", "a file server or a driver does not answer"},
+        {"Unreadable", "the source cannot be read or understood"},
+    };
+    const auto found = kMeanings.find(reason);
+    return found == kMeanings.end() ? std::string() : ", " + found->second;
+}
+
+/// The name of the reason, and what it means.
 std::string reasonIn(const CIMInstance& missing, const CIMClass& definition) {
     const Uint32 inInstance = missing.findProperty(CIMName("Reason"));
     const Uint32 inClass = definition.findProperty(CIMName("Reason"));
@@ -23,7 +36,9 @@ std::string reasonIn(const CIMInstance& missing, const CIMClass& definition) {
         return {};
     }
     const CIMProperty declared = CIMClass(definition).getProperty(inClass);
-    return ValueText().shown(missing.getProperty(inInstance).getValue(), &declared);
+    const std::string name =
+        ValueText().shown(missing.getProperty(inInstance).getValue(), &declared);
+    return name + meaningOf(name);
 }
 
 }  // namespace

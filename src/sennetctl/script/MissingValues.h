@@ -18,7 +18,8 @@ class MissingValues {
     /// must look at the whole machine.
     explicit MissingValues(LocalServer& theServer) : server(theServer) {}
 
-    /// Such as "Needs Root"; empty when the server does not tell, as only cimomd does.
+    /// Such as "Needs Root, run as root or let the service run"; empty when the server does not
+    /// tell, as only cimomd does.
     /// @param property  empty for the reason why the class has no instances
     std::string reasonFor(const AnsweredClass& answered, const std::string& property);
 

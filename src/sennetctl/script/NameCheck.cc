@@ -6,6 +6,7 @@
 #include "SennetConverter/framework/NameRules.h"
 #include "SennetConverter/framework/SennetUtilities.h"
 #include "cim/CimText.h"
+#include "script/ScriptText.h"
 
 namespace sennetctl {
 
@@ -17,7 +18,8 @@ namespace {
 struct NamedColumn {
     ScriptText place;
     String name;
-    Uint32 number;  // its Id in the group
+    Uint32 number;    // its Id in the group
+    bool isRepeated;  // its property has a column already, which has been told
 };
 
 String pegasusText(const std::string& text) {
@@ -34,6 +36,13 @@ bool breaksLiteral(const std::string& text) {
 constexpr const char* kBreaksLiteral =
     " has a double quote or a control character: the MIF file cannot be read";
 
+bool isRepeated(const ScriptSlot& slot, const ScriptText& property) {
+    return std::any_of(
+        slot.properties.begin(), slot.properties.end(), [&](const ScriptText& other) {
+            return other.column < property.column && sameIgnoringCase(other.value, property.value);
+        });
+}
+
 std::vector<NamedColumn> columnsOf(const std::vector<AnsweredClass>& classes,
                                    const Velm::Properties& texts) {
     std::vector<NamedColumn> columns;
@@ -43,7 +52,7 @@ std::vector<NamedColumn> columnsOf(const std::vector<AnsweredClass>& classes,
             const auto number = static_cast<Uint32>(columns.size() + 2);
             columns.push_back(
                 {property, translatedPropertyName(texts, className, pegasusText(property.value)),
-                 number});
+                 number, isRepeated(*answered.slot, property)});
         }
     }
     return columns;
@@ -93,7 +102,7 @@ class NameChecker {
             const bool taken =
                 std::any_of(written.begin(), written.end(),
                             [&](const String& other) { return String::equalNoCase(other, name); });
-            if (taken) {
+            if (taken && !column.isRepeated) {
                 add(column.place, "two columns are called " + textOf(name) +
                                       " for QVE with Lumo, which refuses the table");
             }
@@ -129,7 +138,8 @@ class NameChecker {
 
     void tellOtherCase(const std::vector<NamedColumn>& columns, const NamedColumn& column) {
         for (const NamedColumn& other : columns) {
-            if (other.number < column.number && String::equalNoCase(other.name, column.name) &&
+            if (!column.isRepeated && other.number < column.number &&
+                String::equalNoCase(other.name, column.name) &&
                 !String::equal(other.name, column.name)) {
                 add(column.place, "the names " + textOf(other.name) + " and " +
                                       textOf(column.name) +
@@ -142,7 +152,7 @@ class NameChecker {
     void tellRepeated(const NamedColumn& column, const std::string& product, const String& name,
                       Array<String>& used) {
         const String unique = SennetUtilities::makeUnique(name, number(column), used);
-        if (!String::equal(unique, name)) {
+        if (!String::equal(unique, name) && !column.isRepeated) {
             add(column.place, "two columns are called " + textOf(name) + ": for " + product +
                                   " this one becomes " + textOf(unique));
         }

@@ -13,6 +13,46 @@ constexpr const char* kBrokenOff =
     ": sennet breaks the MIF file off in its middle, for CA and QVE the file of all scripts";
 constexpr const char* kSuffix = ".script.inv";
 
+struct Meaning {
+    std::string text;
+    const char* reason = nullptr;
+};
+
+/// The text without what often stands around it by mistake.
+Meaning likelyMeant(const std::string& value) {
+    Meaning meaning{value, nullptr};
+    const auto strip = [&](const std::string& text, const char* reason) {
+        if (text != meaning.text) {
+            meaning = {text, reason};
+        }
+    };
+    const auto end = [&](std::size_t position) {
+        return meaning.text.substr(0, std::min(position, meaning.text.size()));
+    };
+    if (!meaning.text.empty() && meaning.text.back() == '\r') {
+        strip(end(meaning.text.size() - 1),
+              "the carriage return at the end of the file belongs to it");
+    }
+    strip(trimmed(meaning.text), "blanks beside it belong to it");
+    strip(end(meaning.text.find_first_of("#;")), "a comment has a line of its own");
+    meaning.text = trimmed(meaning.text);
+    const std::size_t first = meaning.text.find_first_not_of("\"'");
+    const std::size_t last = meaning.text.find_last_not_of("\"'");
+    if (first != std::string::npos) {
+        strip(meaning.text.substr(first, last - first + 1), "quotes belong to it");
+    }
+    return meaning;
+}
+
+/// Why the text is no name, and what to write; empty when nobody knows.
+std::string adviceOn(const std::string& value, bool (*isLegal)(const std::string&)) {
+    const Meaning meaning = likelyMeant(value);
+    if (meaning.reason == nullptr || !isLegal(meaning.text)) {
+        return {};
+    }
+    return std::string(", for ") + meaning.reason + "; write " + meaning.text;
+}
+
 class Checker {
   public:
     Checker(ScriptModel& model, std::vector<Finding>& findings)
@@ -35,10 +75,14 @@ class Checker {
         findings.push_back({model.file, place.line, place.column, severity, message});
     }
 
-    void giveUp(const ScriptText& place, const std::string& message,
-                const char* consequence = kGivenUp) {
-        add(Severity::Error, place, message + consequence);
+    void giveUp(const ScriptText& place, const char* kind, bool (*isLegal)(const std::string&)) {
         model.givenUp = true;
+        // What is only blanks has been told where it was read.
+        if (!trimmed(place.value).empty()) {
+            add(Severity::Error, place,
+                "'" + place.value + "' is no name of a " + kind + adviceOn(place.value, isLegal) +
+                    kGivenUp);
+        }
     }
 
     void checkFileName() {
@@ -76,7 +120,7 @@ class Checker {
     void checkClass(const ScriptSlot& slot, std::size_t number) {
         const std::string& name = slot.className.value;
         if (!isLegalName(name)) {
-            giveUp(slot.className, "'" + name + "' is no name of a class");
+            giveUp(slot.className, "class", isLegalName);
         }
         for (std::size_t i = 0; i < number; ++i) {
             if (sameIgnoringCase(model.slots[i].className.value, name)) {
@@ -92,7 +136,7 @@ class Checker {
         const bool own = !slot.nameSpace.value.empty();
         const ScriptText& text = own ? slot.nameSpace : model.defaultNamespace;
         if (!isLegalNamespace(text.value)) {
-            giveUp(text, "'" + text.value + "' is no name of a namespace");
+            giveUp(text, "namespace", isLegalNamespace);
         }
     }
 
@@ -105,19 +149,26 @@ class Checker {
             property.value = name;
             property.column += static_cast<unsigned>(begin);
             begin += name.size();
+            if (name[0] == '#') {
+                tellNoProperty(property, ", for a comment has a line of its own");
+                return;
+            }
             checkProperty(slot, property);
         }
+    }
+
+    void tellNoProperty(const ScriptText& property, const std::string& advice) {
+        add(Severity::Error, property,
+            "'" + property.value + "' is no name of a property" + advice + kBrokenOff);
     }
 
     void checkProperty(ScriptSlot& slot, const ScriptText& property) {
         if (!isLegalName(property.value)) {
             const char last = property.value.back();
             const bool separator = last == ',' || last == ' ';
-            giveUp(property,
-                   "'" + property.value + "' is no name of a property" +
-                       (separator ? ", for a comma or blank at the end of the line belongs to it"
-                                  : ""),
-                   kBrokenOff);
+            tellNoProperty(property,
+                           separator ? ", for a comma or blank at the end of the line belongs to it"
+                                     : adviceOn(property.value, isLegalName));
             return;
         }
         const bool repeated = std::any_of(

@@ -33,7 +33,7 @@ struct ScriptModel {
     ScriptText title;
     ScriptText defaultNamespace{"root/velmira", 0, 0};
     std::array<ScriptSlot, kSlots> slots;
-    bool givenUp = false;  // the generator writes nothing for the script, or half a file
+    bool givenUp = false;  // the generator writes nothing for the script
 
     const std::string& namespaceOf(const ScriptSlot& slot) const {
         return slot.nameSpace.value.empty() ? defaultNamespace.value : slot.nameSpace.value;

@@ -53,6 +53,14 @@ ScriptModel ScriptReader::read(std::string_view octets) {
         model.givenUp = true;
         return model;
     }
+    if (octets.find('\n') == std::string_view::npos &&
+        octets.substr(0, octets.size() - 1).find('\r') != std::string_view::npos) {
+        add(Severity::Error,
+            "lines that end in carriage returns alone, so that sennet sees one line and no entry: "
+            "end them with line feeds");
+        model.givenUp = true;
+        return model;
+    }
     for (std::size_t begin = 0; begin < octets.size(); ++lineNumber) {
         const std::size_t end = std::min(octets.find('\n', begin), octets.size());
         std::string_view line = octets.substr(begin, end - begin);
@@ -79,10 +87,9 @@ void ScriptReader::readLine(std::string_view line) {
     if (line.empty() || !isReadable(line)) {
         return;
     }
-    if (line == "[DEFAULT]") {
-        section = Section::Default;
-    } else if (line == "[CIM]") {
-        section = Section::Cim;
+    if (line == "[DEFAULT]" || line == "[CIM]") {
+        section = line == "[CIM]" ? Section::Cim : Section::Default;
+        isHeaderLost = false;
     } else if (isComment(line)) {
         return;
     } else if (trimmed(line).front() == '[' || line.substr(0, 3) == "\xEF\xBB\xBF") {
@@ -92,7 +99,7 @@ void ScriptReader::readLine(std::string_view line) {
     } else if (section == Section::Cim) {
         readCim(std::string(line));
     } else {
-        add(Severity::Warning, "line without effect: it stands before the first section");
+        addWithoutEffect("it stands before the first section");
     }
 }
 
@@ -114,6 +121,7 @@ void ScriptReader::readHeader(std::string_view line) {
     if (line.substr(0, 3) == "\xEF\xBB\xBF") {
         add(Severity::Error,
             "byte-order mark, which hides this line from sennet: save the file without it");
+        isHeaderLost = trimmed(line.substr(3)).substr(0, 1) == "[";
         return;
     }
     const std::string text = trimmed(line);
@@ -121,6 +129,7 @@ void ScriptReader::readHeader(std::string_view line) {
         if (sameIgnoringCase(text, header)) {
             add(Severity::Warning, "line without effect: the header has to be exactly " +
                                        std::string(header) + ", in capitals and without blanks");
+            isHeaderLost = true;
             return;
         }
     }
@@ -133,7 +142,7 @@ void ScriptReader::readDefault(const std::string& line) {
     const std::vector<std::string> tokens = scriptTokens(line, "\t=");
     const std::string key = tokens.empty() ? "" : tokens[0];
     if (looksLikeCimEntry(line)) {
-        add(Severity::Warning, "line without effect: entries of classes belong below [CIM]");
+        addWithoutEffect("entries of classes belong below [CIM]");
         return;
     }
     if (tokens.size() < 2) {
@@ -176,7 +185,8 @@ void ScriptReader::explainCim(const std::string& line, const std::vector<std::st
     const std::string letter = tokens.empty() ? "" : tokens[0];
     std::string reason = "an entry is G[n]=class, N[n]=namespace or A[n]=properties";
     if (looksLikeDefaultEntry(line)) {
-        reason = "title and defaultnamespace belong below [DEFAULT]";
+        addWithoutEffect("title and defaultnamespace belong below [DEFAULT]");
+        return;
     } else if (isLetter(letter) && tokens.size() < 3) {
         reason = "it has no value";
     } else if (isLetter(letter)) {
@@ -204,8 +214,7 @@ void ScriptReader::storeCim(const std::string& line, const std::vector<std::stri
     }
     ScriptSlot& target = model.slots[static_cast<std::size_t>(slot)];
     if (trimmed(tokens[2]).empty()) {
-        add(Severity::Error, "blanks around '=' are taken for the value; write " + tokens[0] + "[" +
-                                 tokens[1] + "]=" + trimmed(tokens.back()));
+        tellBlank(tokens);
     } else if (tokens.size() > 3) {
         add(Severity::Warning, "only " + quoted(tokens[2]) +
                                    " is taken: a bracket, a second '=' or a tab ends the value");
@@ -220,6 +229,16 @@ void ScriptReader::storeCim(const std::string& line, const std::vector<std::stri
     }
 }
 
+// A blank is no name; of properties it is an empty list.
+void ScriptReader::tellBlank(const std::vector<std::string>& tokens) {
+    const bool isList = tokens[0] == "A" || tokens[0] == "a";
+    const std::string meant = trimmed(tokens.back());
+    add(Severity::Error,
+        std::string("blanks around '=' are taken for the value") + (isList ? "" : kGivenUp) +
+            (meant.empty() ? std::string()
+                           : "; write " + tokens[0] + "[" + tokens[1] + "]=" + meant));
+}
+
 void ScriptReader::store(ScriptText& text, const std::string& line, const std::string& value,
                          const std::string& what) {
     if (text.line > 0) {
@@ -229,6 +248,13 @@ void ScriptReader::store(ScriptText& text, const std::string& line, const std::s
     if (&text == &model.title && trimmed(value) != value) {
         add(Severity::Warning, "the title " + quoted(value) + " begins or ends with a blank",
             text.column);
+    }
+}
+
+// Below a header that is none, the header is the fault.
+void ScriptReader::addWithoutEffect(const std::string& reason) {
+    if (!isHeaderLost) {
+        add(Severity::Warning, "line without effect: " + reason);
     }
 }
 

@@ -30,13 +30,16 @@ class ScriptReader {
     void readCim(const std::string& line);
     void explainCim(const std::string& line, const std::vector<std::string>& tokens);
     void storeCim(const std::string& line, const std::vector<std::string>& tokens);
+    void tellBlank(const std::vector<std::string>& tokens);
     void store(ScriptText& text, const std::string& line, const std::string& value,
                const std::string& what);
+    void addWithoutEffect(const std::string& reason);
     void add(Severity severity, const std::string& message, std::size_t column = 1);
 
     std::vector<Finding>& findings;
     ScriptModel model;
     Section section = Section::None;
+    bool isHeaderLost = false;  // what is meant for the next section is in this one
     unsigned lineNumber = 0;
 };
 

@@ -107,6 +107,15 @@ TEST_F(CheckCommandTest, AServerIsNotAskedForAScriptThatIsGivenUp) {
     }
 }
 
+// The file breaks off, but what is right in the script can be checked.
+TEST_F(CheckCommandTest, AnIllegalPropertyLeavesTheOthersToTheServer) {
+    const std::string file = directory.write(
+        "x.script.inv", "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=CIM_Fan\nA[0]=Colour,Bad-Name\n");
+    EXPECT_EQ(checkScripts(wanted({file}), output.plain()), 1);
+    EXPECT_THAT(output.text(), HasSubstr("no property Colour: the column stays empty\n"));
+    EXPECT_THAT(output.text(), HasSubstr("'Bad-Name' is no name of a property"));
+}
+
 // To tell why values are missing, the server looks at the whole machine.
 TEST_F(CheckCommandTest, TheServerIsAskedOnceWhyValuesAreMissing) {
     const std::string text = "[CIM]\nG[0]=CIM_Fan\nA[0]=Spare\n";

@@ -70,6 +70,45 @@ TEST_F(ScriptLintTest, NamesThatAreNone) {
               "all scripts\n");
 }
 
+TEST_F(ScriptLintTest, NamesWithWhatIsNotMeant) {
+    const std::string end = ": sennet gives the whole script up\n";
+    EXPECT_EQ(
+        check("G[0]=A \nA[0]=C\n"),
+        "4:6: error: 'A ' is no name of a class, for blanks beside it belong to it; write A" + end);
+    EXPECT_EQ(check("G[0]=A # the fans\nA[0]=C\n"),
+              "4:6: error: 'A # the fans' is no name of a class, for a comment has a line of its "
+              "own; write A" +
+                  end);
+    EXPECT_EQ(check("G[0]=\"A\"\nA[0]=C\n"),
+              "4:6: error: '\"A\"' is no name of a class, for quotes belong to it; write A" + end);
+    EXPECT_EQ(check("A[0]=C\nG[0]=A\r"),
+              "5:6: error: 'A\r' is no name of a class, for the carriage return at the end of the "
+              "file belongs to it; write A" +
+                  end);
+    EXPECT_EQ(check("G[0]=A\nN[0]= root/cimv2\nA[0]=C\n"),
+              "5:6: error: ' root/cimv2' is no name of a namespace, for blanks beside it belong to "
+              "it; write root/cimv2" +
+                  end);
+    EXPECT_EQ(check("G[0]=# A\nA[0]=C\n"), "4:6: error: '# A' is no name of a class" + end);
+}
+
+TEST_F(ScriptLintTest, PropertiesWithWhatIsNotMeant) {
+    const std::string end =
+        ": sennet breaks the MIF file off in its middle, for CA and QVE the file of all scripts\n";
+    EXPECT_EQ(check("G[0]=A\nA[0]=\"B,C\"\n"),
+              "5:6: error: '\"B' is no name of a property, for quotes belong to it; write B" + end +
+                  "5:9: error: 'C\"' is no name of a property, for quotes belong to it; write C" +
+                  end);
+    EXPECT_EQ(
+        check("G[0]=A\nA[0]=B # all of them\n"),
+        "5:8: error: '#' is no name of a property, for a comment has a line of its own" + end);
+    EXPECT_EQ(check("G[0]=A\nA[0]=B,C\r"),
+              "5:8: error: 'C\r' is no name of a property, for the carriage return at the end of "
+              "the file belongs to it; write C" +
+                  end);
+    EXPECT_FALSE(model.givenUp) << "what is right in it can still be checked";
+}
+
 TEST_F(ScriptLintTest, WhatIsListedTwice) {
     EXPECT_EQ(check("G[0]=A\nA[0]=B,b\n"),
               "5:8: warning: the property b is listed twice, and so gets two columns\n");

@@ -63,6 +63,34 @@ TEST_F(ScriptReaderTest, HeadersThatAreNone) {
               "and the one before goes on\n");
 }
 
+TEST_F(ScriptReaderTest, WhatFollowsALostHeaderIsNotToldAgain) {
+    EXPECT_EQ(inDefault("[cim]\nG[0]=X\nA[0]=Y\n[CIM]\ntitle=Z"),
+              "2:1: warning: line without effect: the header has to be exactly [CIM], in capitals "
+              "and without blanks\n"
+              "6:1: warning: line without effect: title and defaultnamespace belong below "
+              "[DEFAULT]\n");
+    EXPECT_EQ(read("[default]\ntitle=x\n"),
+              "1:1: warning: line without effect: the header has to be exactly [DEFAULT], in "
+              "capitals and without blanks\n");
+    EXPECT_EQ(read("\xEF\xBB\xBF[DEFAULT]\ntitle=x\n"),
+              "1:1: error: byte-order mark, which hides this line from sennet: save the file "
+              "without it\n");
+    EXPECT_EQ(read("\xEF\xBB\xBF# Fans\ntitle=x\n"),
+              "1:1: error: byte-order mark, which hides this line from sennet: save the file "
+              "without it\n"
+              "2:1: warning: line without effect: it stands before the first section\n");
+}
+
+TEST_F(ScriptReaderTest, LinesThatEndInCarriageReturnsAlone) {
+    EXPECT_EQ(read("[CIM]\rG[0]=X\r"),
+              "1:1: error: lines that end in carriage returns alone, so that sennet sees one line "
+              "and no entry: end them with line feeds\n");
+    EXPECT_TRUE(model.givenUp);
+    EXPECT_EQ(read("[CIM]"), "");
+    EXPECT_EQ(read(""), "");
+    EXPECT_FALSE(model.givenUp);
+}
+
 TEST_F(ScriptReaderTest, EntriesOfTheFirstSection) {
     EXPECT_EQ(inDefault("title = X"),
               "2:1: warning: line without effect: blanks around '=' belong to key and value; write "
@@ -104,9 +132,17 @@ TEST_F(ScriptReaderTest, EntriesOfTheSecondSection) {
 }
 
 TEST_F(ScriptReaderTest, EntriesThatHaveAnotherEffectThanMeant) {
-    EXPECT_EQ(inCim("G[0] = X"),
-              "2:1: error: blanks around '=' are taken for the value; write G[0]=X\n");
+    EXPECT_EQ(
+        inCim("G[0] = X"),
+        "2:1: error: blanks around '=' are taken for the value: sennet gives the whole script "
+        "up; write G[0]=X\n");
     EXPECT_EQ(model.slots[0].className.value, " ");
+    EXPECT_EQ(inCim("A[0] = X"),
+              "2:1: error: blanks around '=' are taken for the value; write A[0]=X\n");
+    EXPECT_EQ(
+        inCim("N[0]= "),
+        "2:1: error: blanks around '=' are taken for the value: sennet gives the whole script "
+        "up\n");
     EXPECT_EQ(inCim("G[x]=X"), "2:3: warning: slot number 'x' is read as 0\n");
     EXPECT_EQ(model.slots[0].className.value, "X");
     EXPECT_EQ(inCim("A[3]=One=Two"),

@@ -168,7 +168,8 @@ TEST_F(ServerCheckTest, EmptyColumnsAndTheirReason) {
             R"(<PROPERTY NAME="Reason" TYPE="uint16"><VALUE>3</VALUE></PROPERTY>)")));
     EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Spare\n"),
               "4:6: note: CIM_Fan: 2 instances\n"
-              "5:6: note: the column Spare is empty: Needs Root\n");
+              "5:6: note: the column Spare is empty: Needs Root, run as root or let the service "
+              "run\n");
 }
 
 TEST_F(ServerCheckTest, ColumnsWithoutASize) {
@@ -185,6 +186,23 @@ TEST_F(ServerCheckTest, NamesThatCollideForAllProducts) {
     EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State\n"),
               "5:15: warning: two columns are called Thing: for all products this one becomes "
               "Thing3\n");
+}
+
+// That it is listed twice is told without a server.
+TEST_F(ServerCheckTest, ARepeatedPropertyIsNotToldAgain) {
+    std::vector<Finding> findings;
+    ScriptModel model = ScriptReader("x.script.inv", findings)
+                            .read(
+                                "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=CIM_Fan\n"
+                                "A[0]=DeviceID,deviceid\n");
+    checkScript(model, findings);
+    LocalServer server;
+    MissingValues missing(server);
+    ServerCheck(server, missing, texts, {}, findings).check(model);
+    ASSERT_EQ(findings.size(), 2U);
+    EXPECT_EQ(findings[0].message,
+              "the property deviceid is listed twice, and so gets two columns");
+    EXPECT_EQ(findings[1].message, "CIM_Fan: 2 instances");
 }
 
 TEST_F(ServerCheckTest, NamesThatBreakTheFile) {
