@@ -49,6 +49,15 @@ FAULTS = {
     "long line": ("Name", "Name" + " " * 1100, 7, 1025, "warning", "only the first 1024"),
     "encoding": ("Disks", "M\xfchle", 2, 8, "error", "octets that are not UTF-8"),
     "byte-order mark": ("[DEFAULT]", "\xef\xbb\xbf[DEFAULT]", 1, 1, "error", "byte-order mark"),
+    "blank behind a class": ("DiskDrive", "DiskDrive ", 5, 6, "error", "write CIM_DiskDrive:"),
+    "class in quotes": ("CIM_DiskDrive", '"CIM_DiskDrive"', 5, 6, "error", "quotes belong to it"),
+    "comment behind a class": (
+        "CIM_DiskDrive", "CIM_DiskDrive # x", 5, 6, "error", "a comment has a line of its own"),
+    "comment behind properties": (
+        "Name", "Name # x", 7, 20, "error", "a comment has a line of its own"),
+    "blank before a namespace": ("=root", "= root", 6, 6, "error", "write root/cimv2:"),
+    "CR at the end of the file": (
+        "Name\n", "Name\r", 7, 15, "error", "the carriage return at the end of the file"),
     "64-bit number": ("Name", "MaxMediaSize", 7, 15, "warning", "beyond 32 bits"),
     "title that is cut": ("Disks", "Disks of this machine", 2, 7, "warning", "with Lumo"),
 }
@@ -58,12 +67,19 @@ GIVEN_UP = {
     "class": ("CIM_DiskDrive", "CIM-DiskDrive"),
     "namespace": ("root/cimv2", "root//cimv2"),
     "blank behind =": ("N[0]=", "N[0]= "),
+    "blank around =": ("G[0]=", "G[0] = "),
+    "blank behind a class": ("DiskDrive", "DiskDrive "),
+    "class in quotes": ("CIM_DiskDrive", '"CIM_DiskDrive"'),
+    "comment behind a class": ("CIM_DiskDrive", "CIM_DiskDrive # x"),
     "encoding": ("Disks", "M\xfchle"),
 }
 BROKEN_OFF = {
     "name": ("Name", "Na-me"),
     "comma at the end": ("Name", "Name,"),
     "blank at the end": ("Name", "Name "),
+    "CR at the end of the file": ("Name\n", "Name\r"),
+    "comment behind properties": ("Name", "Name # x"),
+    "properties in quotes": ("DeviceID,Name", '"DeviceID,Name"'),
 }
 
 
@@ -133,6 +149,15 @@ class FaultsTest(unittest.TestCase):
                 run = self.run_with("SMS", text)
                 self.assertNotIn("one0", run.result.stdout)
                 self.assertEqual(list(run.mif.glob("*.mif")), [])
+
+    def test_carriage_returns_alone_are_no_lines(self):
+        text = GOOD.replace("\n", "\r")
+        _, found = self.check(text)
+        self.assertEqual([(each["line"], each["severity"]) for each in found], [(1, "error")])
+        self.assertIn("sennet sees one line and no entry", found[0]["message"])
+        run = self.run_with("SMS", text)
+        self.assertIn("Deleting one0", run.result.stdout)
+        self.assertEqual(run.files(), [])
 
     def escapes_on_a_terminal(self, **environment):
         """Whether a finding is shown in colour on a terminal."""

@@ -75,7 +75,8 @@ class ValuesTest(unittest.TestCase):
             f"A[0]={','.join(COLUMNS)}\n")
         cls.texts = cls.inventory / "sennet.properties"
         cls.texts.write_text("".join(f"Example_Thing.{name}.Size={size}\n"
-                                     for name, size in SIZES.items()))
+                                     for name, size in SIZES.items())
+                             + "Example_Thing.Label=L\xfcfter\n", encoding="latin-1")
         programs = installation.programs_of(ARGUMENTS)
         server = cls.enterClassContext(installation.Cimomd(
             programs, cls.place, ARGUMENTS.machines.resolve() / "server", own))
@@ -115,10 +116,15 @@ class ValuesTest(unittest.TestCase):
             self.assertRegex(self.mif, rf'Name = "{name}"\n.*\n +Type = String\({size}\)')
         refused = [each for each in self.found if each["file"] == str(self.texts)]
         self.assertEqual([(each["line"], each["column"], each["severity"]) for each in refused],
-                         [(4, 24, "error")])
+                         [(4, 24, "error"), (5, 21, "warning")])
         self.assertIn("String(abc)", refused[0]["message"])
         self.assertEqual([each["message"] for each in self.found
                           if "Example_Thing.Odd.Size" in each["message"]], [])
+
+    def test_octets_that_are_not_utf8(self):
+        self.assertIn('Name = "L\ufffdfter"\n', self.mif.encode("latin-1").decode("utf-8"))
+        self.assertTrue(any("not UTF-8: sennet takes each for U+FFFD" in each["message"]
+                            for each in self.found))
 
     def test_the_places_that_were_used(self):
         self.assertEqual(
