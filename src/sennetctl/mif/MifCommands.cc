@@ -17,14 +17,6 @@ namespace {
 
 constexpr std::size_t kWidestCell = 48;
 
-std::string typeName(const Mif::Type& type) {
-    static constexpr const char* kNames[] = {"Integer",       "Integer64",   "Gauge",
-                                             "Counter",       "Counter64",   "String",
-                                             "DisplayString", "OctetString", "Date"};
-    const std::string name = kNames[static_cast<std::size_t>(type.base)];
-    return type.length > 0 ? name + "(" + std::to_string(type.length) + ")" : name;
-}
-
 Json jsonOf(const Mif::Value& value) {
     if (value.kind == Mif::Value::Kind::Integer) {
         constexpr std::uint64_t kLowest = std::uint64_t(1) << 63;
@@ -45,7 +37,7 @@ Json jsonOf(const MifTable& table) {
     for (const MifColumn& column : table.columns) {
         Json attribute = Json::object();
         attribute["name"] = column.name;
-        attribute["type"] = typeName(column.type);
+        attribute["type"] = shownType(column.type);
         attribute["key"] = column.isKey;
         one["attributes"].push_back(std::move(attribute));
     }
@@ -106,21 +98,23 @@ const char* nameOf(MifChange::Kind kind) {
 }
 
 std::string descriptionOf(const MifChange& change) {
-    if (change.row.empty()) {
-        return change.attribute.empty() ? "table" : "attribute " + change.attribute;
+    const bool changed = change.kind == MifChange::Kind::Changed;
+    std::string what = change.row;
+    if (change.row.empty() && !change.attribute.empty()) {
+        what = "attribute " + change.attribute;
+    } else if (change.row.empty()) {
+        what = changed ? "name" : "table";
+    } else if (changed) {
+        what += ": " + change.attribute;
     }
-    if (change.kind != MifChange::Kind::Changed) {
-        return change.row;
-    }
-    return change.row + ": " + change.attribute + ": '" + change.before + "' is now '" +
-           change.after + "'";
+    return changed ? what + ": '" + change.before + "' is now '" + change.after + "'" : what;
 }
 
 void printChanges(const std::vector<MifChange>& changes, const Output& output) {
     const std::string* table = nullptr;
     for (const MifChange& change : changes) {
         if (table == nullptr || *table != change.table) {
-            output.out << printable(change.table) << '\n';
+            output.out << (change.table.empty() ? "Component" : printable(change.table)) << '\n';
             table = &change.table;
         }
         output.out << "  " << signOf(change.kind) << ' ' << printable(descriptionOf(change))
@@ -134,7 +128,7 @@ Json jsonOf(const MifChange& change) {
         return text.empty() ? Json(nullptr) : Json(text);
     };
     Json one = Json::object();
-    one["table"] = change.table;
+    one["table"] = textOrNull(change.table);
     one["change"] = nameOf(change.kind);
     one["row"] = textOrNull(change.row);
     one["attribute"] = textOrNull(change.attribute);
@@ -192,7 +186,7 @@ int showMifFile(const std::string& file, const Output& output) {
 
 int compareMifFiles(const std::string& oldFile, const std::string& newFile, const Output& output) {
     const std::vector<MifChange> changes =
-        differencesOf(readMifFile(oldFile).tables, readMifFile(newFile).tables);
+        differencesOf(readMifFile(oldFile), readMifFile(newFile));
     if (output.json) {
         Json document = Json::object();
         document["changes"] = Json::array();

@@ -12,6 +12,10 @@ namespace {
 
 using Texts = std::vector<std::string>;
 
+std::string definitionOf(const MifColumn& column) {
+    return shownType(column.type) + (column.isKey ? ", key" : "");
+}
+
 /// One of the tables with what is compared: its columns without row numbers, its values as texts.
 struct ComparedTable {
     explicit ComparedTable(const MifTable& table) {
@@ -22,6 +26,7 @@ struct ComparedTable {
                 placesByName.emplace(table.columns[i].name, names.size());
                 names.push_back(table.columns[i].name);
                 keys.push_back(table.columns[i].isKey);
+                definitions.push_back(definitionOf(table.columns[i]));
             }
         }
         for (const std::vector<Mif::Value>& values : table.rows) {
@@ -42,6 +47,7 @@ struct ComparedTable {
     Texts names;
     std::unordered_map<std::string, std::size_t> placesByName;
     std::vector<bool> keys;
+    Texts definitions;
     std::vector<Texts> rows;
 };
 
@@ -74,10 +80,20 @@ class TableComparison {
         }
         for (const std::string& column : after.names) {
             if (before.placeOf(column)) {
+                compareDefinitions(column);
                 common.push_back(column);
             } else {
                 add(MifChange::Kind::Added, {}, column);
             }
+        }
+    }
+
+    /// Of a column that both have.
+    void compareDefinitions(const std::string& column) {
+        const std::string& oldDefinition = before.definitions[*before.placeOf(column)];
+        const std::string& newDefinition = after.definitions[*after.placeOf(column)];
+        if (oldDefinition != newDefinition) {
+            add(MifChange::Kind::Changed, {}, column, oldDefinition, newDefinition);
         }
     }
 
@@ -184,6 +200,13 @@ class TableComparison {
     Texts identity;
 };
 
+void compareNames(const std::string& table, const std::string& before, const std::string& after,
+                  std::vector<MifChange>& changes) {
+    if (before != after) {
+        changes.push_back({table, MifChange::Kind::Changed, {}, {}, before, after});
+    }
+}
+
 using TablesByClass = std::unordered_map<std::string, const MifTable*>;
 
 TablesByClass byClass(const std::vector<MifTable>& tables) {
@@ -196,22 +219,23 @@ TablesByClass byClass(const std::vector<MifTable>& tables) {
 
 }  // namespace
 
-std::vector<MifChange> differencesOf(const std::vector<MifTable>& oldTables,
-                                     const std::vector<MifTable>& newTables) {
-    const TablesByClass oldClasses = byClass(oldTables);
-    const TablesByClass newClasses = byClass(newTables);
+std::vector<MifChange> differencesOf(const MifContent& before, const MifContent& after) {
+    const TablesByClass oldClasses = byClass(before.tables);
+    const TablesByClass newClasses = byClass(after.tables);
     std::vector<MifChange> changes;
-    for (const MifTable& before : oldTables) {
-        const auto after = newClasses.find(before.className);
-        if (after != newClasses.end()) {
-            TableComparison(before, *after->second, changes).run();
+    compareNames({}, before.component, after.component, changes);
+    for (const MifTable& table : before.tables) {
+        const auto like = newClasses.find(table.className);
+        if (like != newClasses.end()) {
+            compareNames(like->second->name, table.name, like->second->name, changes);
+            TableComparison(table, *like->second, changes).run();
         } else {
-            changes.push_back({before.name, MifChange::Kind::Removed, {}, {}, {}, {}});
+            changes.push_back({table.name, MifChange::Kind::Removed, {}, {}, {}, {}});
         }
     }
-    for (const MifTable& after : newTables) {
-        if (oldClasses.count(after.className) == 0) {
-            changes.push_back({after.name, MifChange::Kind::Added, {}, {}, {}, {}});
+    for (const MifTable& table : after.tables) {
+        if (oldClasses.count(table.className) == 0) {
+            changes.push_back({table.name, MifChange::Kind::Added, {}, {}, {}, {}});
         }
     }
     return changes;

@@ -12,19 +12,19 @@ namespace sennetctl {
 struct MifChange {
     enum class Kind { Added, Removed, Changed };
 
-    std::string table;
+    std::string table;  // its name; empty for the component, of which the name may have changed
     Kind kind = Kind::Changed;
     std::string row;        // what tells the row from others; empty when the change is of all rows
-    std::string attribute;  // empty when the change is of a whole row or table
-    std::string before;     // the value that changed
-    std::string after;
+    std::string attribute;  // empty when the change is of a whole row or table, or of its name
+    std::string before;     // what changed: the value in the row, the definition of the attribute,
+    std::string after;      // or the name
 };
 
-/// The changes from the old tables to the new ones, in the order of the old ones and then of what
-/// is new. Tables are the same by their class, rows by their key or, where that only counts rows,
-/// by their first other attribute; rows that this does not tell apart are added or removed as a
-/// whole. The order of rows and their numbers are no change.
-std::vector<MifChange> differencesOf(const std::vector<MifTable>& oldTables,
-                                     const std::vector<MifTable>& newTables);
+/// The changes from the old file to the new one, in the order of the old tables and then of what is
+/// new: names, definitions of attributes (type, size and whether they are keys) and rows. Tables
+/// are the same by their class, rows by their key or, where that only counts rows, by their first
+/// other attribute; rows that this does not tell apart are added or removed as a whole. The order
+/// of rows and their numbers are no change.
+std::vector<MifChange> differencesOf(const MifContent& before, const MifContent& after);
 
 }  // namespace sennetctl

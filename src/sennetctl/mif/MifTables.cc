@@ -125,6 +125,14 @@ MifContent readMifFile(const std::string& path) {
     }
 }
 
+std::string shownType(const Mif::Type& type) {
+    static constexpr const char* kNames[] = {"Integer",       "Integer64",   "Gauge",
+                                             "Counter",       "Counter64",   "String",
+                                             "DisplayString", "OctetString", "Date"};
+    const std::string name = kNames[static_cast<std::size_t>(type.base)];
+    return type.length > 0 ? name + "(" + std::to_string(type.length) + ")" : name;
+}
+
 bool isRowNumber(const MifColumn& column) {
     return column.isKey && (column.name == "Index" || column.name == "Row_Index");
 }

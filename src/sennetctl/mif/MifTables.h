@@ -40,6 +40,9 @@ struct MifContent {
 /// be held, and as readWholeFile does.
 MifContent readMifFile(const std::string& path);
 
+/// As a MIF file writes it, in the standard's letters: "Integer", "String(8)".
+std::string shownType(const Mif::Type& type);
+
 /// Whether this is the row number that the generator puts first; it says nothing about the machine.
 bool isRowNumber(const MifColumn& column);
 

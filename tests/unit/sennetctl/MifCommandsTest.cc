@@ -192,6 +192,46 @@ TEST_F(MifCommandsTest, TablesAndAttributesComeAndGo) {
               "3 differences\n");
 }
 
+// A reader that has made its table by the old definition cuts or refuses the new values.
+TEST_F(MifCommandsTest, DefinitionsOfAttributesAreCompared) {
+    const std::string size = attributeMif(1, "Size", "Integer", "1");
+    const std::string wide = attributeMif(1, "Size", "Integer64", "1");
+    const std::string name = attributeMif(2, "Name", "String(8)", "\"x\"");
+    const std::string longName = attributeMif(2, "Name", "String(64)", "\"x\"");
+    const std::string before =
+        file("old", kMifStart + groupMif(2, "A", "Own|A|1", size + name) + kMifEnd);
+    const std::string after = file(
+        "new", kMifStart + groupMif(2, "A", "Own|A|1", "Key = 1\n" + wide + longName) + kMifEnd);
+    EXPECT_EQ(difference(before, after),
+              "A\n"
+              "  ~ attribute Size: 'Integer' is now 'Integer64, key'\n"
+              "  ~ attribute Name: 'String(8)' is now 'String(64)'\n"
+              "2 differences\n");
+    CapturedOutput json;
+    compareMifFiles(before, after, json.json());
+    EXPECT_EQ(json.document()["changes"][1].dump(),
+              R"j({"table":"A","change":"changed","row":null,"attribute":"Name",)j"
+              R"j("old":"String(8)","new":"String(64)"})j");
+}
+
+TEST_F(MifCommandsTest, NamesOfComponentAndTableAreCompared) {
+    const std::string one = attributeMif(1, "One", "Integer", "1");
+    const std::string before = file("old", kMifStart + groupMif(2, "A", "Own|A|1", one) + kMifEnd);
+    const std::string after = file(
+        "new", "Start Component\n Name = \"Other\"\n" + groupMif(2, "B", "Own|A|1", one) + kMifEnd);
+    EXPECT_EQ(difference(before, after),
+              "Component\n"
+              "  ~ name: 'Machine' is now 'Other'\n"
+              "B\n"
+              "  ~ name: 'A' is now 'B'\n"
+              "2 differences\n");
+    CapturedOutput json;
+    compareMifFiles(before, after, json.json());
+    EXPECT_EQ(json.document()["changes"][0].dump(),
+              R"({"table":null,"change":"changed","row":null,"attribute":null,)"
+              R"("old":"Machine","new":"Other"})");
+}
+
 TEST_F(MifCommandsTest, DifferencesInJson) {
     EXPECT_EQ(compareMifFiles(fans("old", "{ 1, \"a\", 3 }\n"), fans("new", "{ 1, \"a\", 9 }\n"),
                               output.json()),
