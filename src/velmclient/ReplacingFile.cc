@@ -221,6 +221,7 @@ bool ReplacingFile::succeeded(int error) {
         logFailure("write", path, error);
         failed = true;
         discard();
+        errno = error;
     }
     return error == 0;
 }

@@ -1,7 +1,8 @@
 // A file that takes the place of another one only when it is complete. Its bytes go into a
 // temporary file of the same directory, one without a name where the file system knows such, else
 // one with a hidden name; commit renames it. So no reader sees a half-written file, and a process
-// that is killed leaves the previous file whole. Failures are reported to the system log.
+// that is killed leaves the previous file whole. Failures are reported to the system log, and errno
+// has the cause of the first one when it is reported.
 #pragma once
 
 #include <optional>

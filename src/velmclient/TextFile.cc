@@ -46,6 +46,7 @@ int TextFile::mkdir(int parents) {
     }
     if (error) {
         logFailure("create directory", path, error.value());
+        errno = error.value();
         return -1;
     }
     return 0;

@@ -4,6 +4,7 @@
 #include <sys/stat.h>
 
 #include <algorithm>
+#include <cerrno>
 #include <filesystem>
 #include <map>
 #include <optional>
@@ -37,7 +38,7 @@ std::vector<std::string> shortNames(const std::vector<std::string>& files) {
 std::time_t modifiedAt(const std::string& file) {
     struct stat status = {};
     if (::stat(file.c_str(), &status) != 0) {
-        throw CannotRun(file, "cannot be read");
+        throw CannotRun(file, causeOf(errno));
     }
     return status.st_mtime;
 }
@@ -81,7 +82,7 @@ Composition composePage(const HtmlOptions& options, const Output& output) {
 
 void makeDirectory(const std::string& directory) {
     if (Velm::TextFile(directory.c_str()).mkdir(1) != 0) {
-        throw CannotRun(directory, "cannot be made");
+        throw CannotRun(directory, causeOf(errno));
     }
 }
 

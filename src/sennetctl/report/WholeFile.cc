@@ -9,6 +9,10 @@
 
 namespace sennetctl {
 
+std::string causeOf(int error) {
+    return error == 0 ? "input/output error" : std::generic_category().message(error);
+}
+
 std::string readWholeFile(const std::string& path, std::size_t limitOctets) {
     std::error_code error;
     const std::filesystem::file_status status = std::filesystem::status(path, error);
@@ -21,7 +25,7 @@ std::string readWholeFile(const std::string& path, std::size_t limitOctets) {
     }
     std::ifstream file(path, std::ios::binary);
     if (!file) {
-        throw CannotRun(path, std::generic_category().message(errno));
+        throw CannotRun(path, causeOf(errno));
     }
     std::string octets;
     char piece[64 * 1024];
@@ -32,7 +36,7 @@ std::string readWholeFile(const std::string& path, std::size_t limitOctets) {
         }
     }
     if (file.bad()) {
-        throw CannotRun(path, "cannot be read to its end");
+        throw CannotRun(path, causeOf(errno));
     }
     return octets;
 }
@@ -46,10 +50,9 @@ void refuseExisting(const std::string& path) {
 void writeWholeFile(const std::string& path, const std::string& octets) {
     constexpr int kOpenForWriting = 1;
     Velm::TextFile file(path.c_str());
-    const bool written = file.open(kOpenForWriting) == 0 &&
-                         file.writeLine(octets.data(), static_cast<int>(octets.size())) >= 0;
-    if (file.close() != 0 || !written) {
-        throw CannotRun(path, "cannot be written");
+    if (file.open(kOpenForWriting) != 0 ||
+        file.writeLine(octets.data(), static_cast<int>(octets.size())) < 0 || file.close() != 0) {
+        throw CannotRun(path, causeOf(errno));
     }
 }
 

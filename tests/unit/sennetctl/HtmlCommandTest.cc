@@ -126,11 +126,11 @@ TEST_F(HtmlCommandTest, ADirectoryThatCannotBeMade) {
     const std::string one = fans("one.mif");
     HtmlOptions wrong = options({one});
     wrong.directory = one;
-    EXPECT_EQ(refusal(wrong), one + ": cannot be made");
+    EXPECT_EQ(refusal(wrong), one + ": Not a directory");
     std::filesystem::create_directories(page());
     HtmlOptions blocked = options({one});
     blocked.replace = true;
-    EXPECT_EQ(refusal(blocked), page() + ": cannot be written");
+    EXPECT_EQ(refusal(blocked), page() + ": Is a directory");
 }
 
 }  // namespace

@@ -196,7 +196,8 @@ TEST_F(NewCommandTest, NothingIsLeftBehindByAFailure) {
               directory.path("fans.inv") + ": the name of a script ends in .script.inv");
     options.script = directory.path("none/fans.script.inv");
     options.classes = {"CIM_Fan"};
-    EXPECT_EQ(failureOf(options), directory.path("none/fans.properties") + ": cannot be written");
+    EXPECT_EQ(failureOf(options),
+              directory.path("none/fans.properties") + ": No such file or directory");
     EXPECT_THAT(directory.names(), IsEmpty());
 }
 

@@ -1,7 +1,10 @@
 #include "report/WholeFile.h"
 
 #include <gtest/gtest.h>
+#include <sys/resource.h>
 #include <sys/stat.h>
+
+#include <csignal>
 
 #include "support/TempDirectory.h"
 
@@ -11,6 +14,15 @@ namespace {
 std::string failureOf(const std::string& path, std::size_t limit = kLargestFileOctets) {
     try {
         readWholeFile(path, limit);
+    } catch (const CannotRun& failure) {
+        return failure.what();
+    }
+    return "none";
+}
+
+std::string writeFailureOf(const std::string& path, std::size_t octets = 1) {
+    try {
+        writeWholeFile(path, std::string(octets, 'x'));
     } catch (const CannotRun& failure) {
         return failure.what();
     }
@@ -36,6 +48,40 @@ TEST(WholeFileTest, TellsWhyAFileIsNotRead) {
     EXPECT_EQ(failureOf(pipe), pipe + ": is no regular file");
     const std::string large = directory.write("large", std::string((1 << 20) + 1, 'x'));
     EXPECT_EQ(failureOf(large, 1 << 20), large + ": is larger than 1 MiB");
+}
+
+TEST(WholeFileTest, WritesEveryOctet) {
+    const support::TempDirectory directory;
+    const std::string octets("a\0b\r\n\xFF", 6);
+    writeWholeFile(directory.path("file"), octets);
+    EXPECT_EQ(directory.read("file"), octets);
+}
+
+TEST(WholeFileTest, TellsWhyAFileIsNotWritten) {
+    const support::TempDirectory directory;
+    const std::string file = directory.write("file", "before");
+    EXPECT_EQ(writeFailureOf(directory.path("none/file")),
+              directory.path("none/file") + ": No such file or directory");
+    EXPECT_EQ(writeFailureOf(file + "/below"), file + "/below: Not a directory");
+    EXPECT_EQ(writeFailureOf(directory.path()), directory.path() + ": Is a directory");
+}
+
+// Only the end of a file or a full buffer of it shows that there is no room.
+TEST(WholeFileTest, TellsThatThereIsNoRoom) {
+    const support::TempDirectory directory;
+    const std::string file = directory.write("file", "before");
+    rlimit usual = {};
+    ASSERT_EQ(getrlimit(RLIMIT_FSIZE, &usual), 0);
+    const auto handler = std::signal(SIGXFSZ, SIG_IGN);
+    const rlimit small = {10, usual.rlim_max};
+    ASSERT_EQ(setrlimit(RLIMIT_FSIZE, &small), 0);
+    const std::string atTheEnd = writeFailureOf(file, 100);
+    const std::string onTheWay = writeFailureOf(file, 1 << 20);
+    setrlimit(RLIMIT_FSIZE, &usual);
+    std::signal(SIGXFSZ, handler);
+    EXPECT_EQ(atTheEnd, file + ": File too large");
+    EXPECT_EQ(onTheWay, file + ": File too large");
+    EXPECT_EQ(directory.read("file"), "before");
 }
 
 }  // namespace

@@ -1,5 +1,6 @@
 // A handle on a path: reads a text file line by line, or writes one that appears only when it is
-// complete. Failures are reported to the system log and by the results, never by an exception.
+// complete. Failures are reported to the system log and by the results, never by an exception;
+// errno has the cause of the first failed step of a file.
 // An object is used by one thread at a time.
 #pragma once
 
