@@ -15,8 +15,6 @@ namespace sennetctl {
 
 namespace {
 
-constexpr std::size_t kWidestCell = 48;
-
 Json jsonOf(const Mif::Value& value) {
     if (value.kind == Mif::Value::Kind::Integer) {
         constexpr std::uint64_t kLowest = std::uint64_t(1) << 63;
@@ -61,7 +59,7 @@ void printTable(const MifTable& table, const Output& output) {
     for (const MifColumn& column : table.columns) {
         titles.push_back(column.name);
     }
-    TextTable shown(titles, kWidestCell);
+    TextTable shown(titles, TextTable::Cells::Fitting);
     for (const std::vector<Mif::Value>& values : table.rows) {
         std::vector<std::string> cells;
         cells.reserve(values.size());

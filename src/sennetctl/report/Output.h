@@ -2,6 +2,7 @@
 
 // Where a command writes to and how, and what it tells by its exit status.
 
+#include <cstddef>
 #include <iosfwd>
 
 namespace sennetctl {
@@ -17,6 +18,7 @@ struct Output {
     bool json = false;      ///< one JSON document instead of text for people
     bool colour = false;    ///< `out` shows colours: it is a terminal
     bool progress = false;  ///< `err` may be written over: it is a terminal
+    std::size_t width = 0;  ///< characters of a line of `out`; 0 where it is no terminal
 };
 
 }  // namespace sennetctl

@@ -1,5 +1,6 @@
 #include "report/StandardStreams.h"
 
+#include <sys/ioctl.h>
 #include <unistd.h>
 
 #include <cstdlib>
@@ -23,12 +24,23 @@ bool wantsColour() {
     return takesEscapes(STDOUT_FILENO) && (refused == nullptr || *refused == '\0');
 }
 
+/// 0 for what is no terminal, and for one that does not tell.
+std::size_t lineWidthOf(int descriptor) {
+    winsize size = {};
+    return ::ioctl(descriptor, TIOCGWINSZ, &size) == 0 ? size.ws_col : 0;
+}
+
 }  // namespace
 
 StandardStreams::StandardStreams() : buffer(STDOUT_FILENO), out(&buffer) {}
 
 Output StandardStreams::output(bool json) {
-    return {out, std::cerr, json, wantsColour(), takesEscapes(STDERR_FILENO)};
+    return {out,
+            std::cerr,
+            json,
+            wantsColour(),
+            takesEscapes(STDERR_FILENO),
+            lineWidthOf(STDOUT_FILENO)};
 }
 
 std::string StandardStreams::flush() {

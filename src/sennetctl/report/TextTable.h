@@ -1,6 +1,6 @@
 #pragma once
 
-// A table for people: columns as wide as their widest cell, up to a limit.
+// A table for people: columns as wide as their widest cell, on a terminal as far as that has room.
 
 #include <cstddef>
 #include <string>
@@ -12,23 +12,28 @@ namespace sennetctl {
 
 class TextTable {
   public:
-    /// A cell that is longer than the limit is shortened; 0 is no limit.
-    explicit TextTable(std::vector<std::string> theTitles, std::size_t theCellLimit = 0);
+    /// Whether long cells may be shortened so that the lines fit a terminal.
+    enum class Cells { Whole, Fitting };
+
+    explicit TextTable(std::vector<std::string> theTitles, Cells theCells = Cells::Whole);
 
     /// Cells may hold anything; the missing ones of a short row are empty.
     void addRow(std::vector<std::string> cells);
 
-    /// Titles, in bold where there are colours, and rows; no line ends in blanks.
+    /// Titles, in bold where there are colours, and rows; no line ends in blanks. Titles are never
+    /// shortened, and cells not to less than 16 characters.
     void print(const Output& output) const;
 
   private:
-    std::string fitting(const std::string& cell) const;
-    std::string line(const std::vector<std::string>& cells) const;
+    using Widths = std::vector<std::size_t>;
 
-    std::size_t cellLimit;
+    std::size_t cellLimitFor(std::size_t lineWidth) const;
+    Widths widthsWithin(std::size_t cellLimit) const;
+
+    Cells cells;
     std::vector<std::string> titles;
     std::vector<std::vector<std::string>> rows;
-    std::vector<std::size_t> widths;
+    Widths widestCells;
 };
 
 }  // namespace sennetctl

@@ -18,8 +18,6 @@ namespace {
 
 using namespace Pegasus;
 
-constexpr std::size_t kWidestCell = 48;
-
 struct Column {
     CIMName name;
     std::optional<CIMProperty> declared;
@@ -115,7 +113,7 @@ void printTable(const ClassContent& content, const std::vector<Column>& columns,
     for (const Column& column : columns) {
         titles.push_back(textOf(column.name));
     }
-    TextTable table(titles, kWidestCell);
+    TextTable table(titles, TextTable::Cells::Fitting);
     ValueText values;
     for (const CIMInstance& instance : content.instances) {
         std::vector<std::string> cells;
