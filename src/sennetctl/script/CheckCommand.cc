@@ -90,7 +90,7 @@ class ScriptChecker {
     /// The scripts of the installation.
     std::vector<std::string> listScripts() {
         const std::string& directory = options.places.scriptDirectory;
-        const std::vector<std::string> scripts = scriptsIn(directory);
+        std::vector<std::string> scripts = scriptsIn(directory);
         std::error_code error;
         if (!std::filesystem::is_directory(directory, error)) {
             fail("there is no directory " + directory + " of inventory scripts");

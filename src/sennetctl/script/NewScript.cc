@@ -93,23 +93,30 @@ class Composer {
         std::string list = "A" + number;
         const std::size_t start = list.size();
         for (Uint32 i = 0; i < answered.definition.getPropertyCount(); ++i) {
-            const std::string name = textOf(CIMClass(answered.definition).getProperty(i).getName());
-            const std::string key = className + "." + name;
-            const bool tooLong = list.size() + 1 + name.size() > kLineLimit;
-            const std::string reason =
-                tooLong ? "the line would be too long" : reasonToLeaveOut(answered, key, name);
-            if (!reason.empty()) {
-                result.leftOut.push_back(key + ": " + reason);
-                continue;
-            }
-            list.append(list.size() == start ? "" : ",").append(name);
-            entries.push_back({&answered, key, name});
+            listProperty(answered, textOf(CIMClass(answered.definition).getProperty(i).getName()),
+                         list, list.size() == start);
         }
         if (list.size() == start) {
             throw CannotRun(className + " has no property that a script can list");
         }
-        result.script +=
-            "G" + number + className + "\nN" + number + plan.nameSpace + "\n" + list + "\n";
+        result.script.append("G").append(number).append(className).append("\nN");
+        result.script.append(number).append(plan.nameSpace).append("\n").append(list).append("\n");
+    }
+
+    /// Appends the property to the list, or tells why not.
+    void listProperty(const AnsweredClass& answered, const std::string& name, std::string& list,
+                      bool isFirst) {
+        std::string key = textOf(answered.definition.getClassName());
+        key.append(".").append(name);
+        const bool tooLong = list.size() + 1 + name.size() > kLineLimit;
+        const std::string reason =
+            tooLong ? "the line would be too long" : reasonToLeaveOut(answered, key, name);
+        if (!reason.empty()) {
+            result.leftOut.push_back(key.append(": ").append(reason));
+            return;
+        }
+        list.append(isFirst ? "" : ",").append(name);
+        entries.push_back({&answered, key, name});
     }
 
     std::string reasonToLeaveOut(const AnsweredClass& answered, const std::string& key,

@@ -182,12 +182,13 @@ void ScriptReader::readCim(const std::string& line) {
 }
 
 void ScriptReader::explainCim(const std::string& line, const std::vector<std::string>& tokens) {
-    const std::string letter = tokens.empty() ? "" : tokens[0];
-    std::string reason = "an entry is G[n]=class, N[n]=namespace or A[n]=properties";
     if (looksLikeDefaultEntry(line)) {
         addWithoutEffect("title and defaultnamespace belong below [DEFAULT]");
         return;
-    } else if (isLetter(letter) && tokens.size() < 3) {
+    }
+    const std::string letter = tokens.empty() ? "" : tokens[0];
+    std::string reason = "an entry is G[n]=class, N[n]=namespace or A[n]=properties";
+    if (isLetter(letter) && tokens.size() < 3) {
         reason = "it has no value";
     } else if (isLetter(letter)) {
         reason = "the slot number is negative; slots are 0 to 9";
