@@ -18,7 +18,7 @@ class TextTable {
     explicit TextTable(std::vector<std::string> theTitles, Cells theCells = Cells::Whole);
 
     /// Cells may hold anything; the missing ones of a short row are empty.
-    void addRow(std::vector<std::string> cells);
+    void addRow(std::vector<std::string> row);
 
     /// Titles, in bold where there are colours, and rows; no line ends in blanks. Titles are never
     /// shortened, and cells not to less than 16 characters.

@@ -5,6 +5,7 @@
 #include "SennetConverter/framework/NameRules.h"
 #include "SennetConverter/framework/SennetUtilities.h"
 #include "report/Text.h"
+#include "script/FixedColumns.h"
 #include "script/ScriptText.h"
 #include "utf8/Utf8.h"
 
@@ -16,6 +17,7 @@ using Pegasus::String;
 namespace {
 
 using Pegasus::kLongestLumoName;
+using Pegasus::kLongestName;
 
 bool isCapital(char c) {
     return c >= 'A' && c <= 'Z';
@@ -60,7 +62,9 @@ std::string joined(const std::vector<std::string>& words) {
 
 bool ColumnNames::isFree(const std::string& name) const {
     const String written = inLumo(name);
-    return !sameIgnoringCase(name, "Index") &&
+    const String inQve =
+        SennetUtilities::formatPropertyName4quvelle(String(name.c_str()), kLongestName);
+    return !sameIgnoringCase(name, "Index") && !isQveColumn(inQve) && !isLumoColumn(written) &&
            std::none_of(taken.begin(), taken.end(),
                         [&](const String& other) { return String::equalNoCase(other, written); });
 }

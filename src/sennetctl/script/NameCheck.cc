@@ -6,6 +6,7 @@
 #include "SennetConverter/framework/NameRules.h"
 #include "SennetConverter/framework/SennetUtilities.h"
 #include "cim/CimText.h"
+#include "script/FixedColumns.h"
 #include "script/ScriptText.h"
 
 namespace sennetctl {
@@ -71,10 +72,12 @@ class NameChecker {
                 add(column.place, "the name " + textOf(column.name) + kBreaksLiteral,
                     Severity::Error);
             }
-            if (String::equalNoCase(column.name, "Index")) {
-                add(column.place, "the name " + textOf(column.name) +
-                                      " is that of the numbers of rows, too: readers refuse two "
-                                      "attributes of one name");
+            if (isRowNumberName(column.name)) {
+                add(column.place,
+                    "the name " + textOf(column.name) +
+                        " is that of the numbers of rows, too: readers refuse two attributes of "
+                        "one name",
+                    Severity::Error);
             }
             tellRepeated(column, "all products", column.name, used);
         }
@@ -84,6 +87,7 @@ class NameChecker {
         Array<String> used;
         for (const NamedColumn& column : columns) {
             const String name = shortened(column, "QVE", kLongestName);
+            tellFixed(column, "QVE", name, isQveColumn(name));
             // What collides for all products has been told.
             if (!collidesPlainly(columns, column)) {
                 tellRepeated(column, "QVE", name, used);
@@ -99,6 +103,7 @@ class NameChecker {
         for (const NamedColumn& column : columns) {
             const String name = SennetUtilities::substituteValues(SennetUtilities::makeUnique(
                 shortened(column, "QVE with Lumo", kLongestLumoName), number(column), used));
+            tellFixed(column, "QVE with Lumo", name, isLumoColumn(name) && !isQveColumn(name));
             const bool taken =
                 std::any_of(written.begin(), written.end(),
                             [&](const String& other) { return String::equalNoCase(other, name); });
@@ -146,6 +151,16 @@ class NameChecker {
                                       " differ in case only: for QVE the table has one twice");
                 return;
             }
+        }
+    }
+
+    void tellFixed(const NamedColumn& column, const std::string& product, const String& name,
+                   bool isFixed) {
+        if (isFixed) {
+            add(column.place,
+                "each table of " + product + " has a column " + textOf(name) +
+                    " already: it refuses this one",
+                Severity::Error);
         }
     }
 

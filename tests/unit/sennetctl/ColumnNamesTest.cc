@@ -26,6 +26,8 @@ TEST(ColumnNamesTest, NamesDifferForEveryProduct) {
     EXPECT_EQ(names.choose("Device ID"), "Device ID");
     EXPECT_EQ(names.choose("Dev ID"), "Dev ID 2") << "QVE with Lumo calls both DEV_ID";
     EXPECT_EQ(names.choose("Index"), "Index 2") << "the numbers of rows are called so";
+    EXPECT_EQ(names.choose("Row Index"), "Row Index 2") << "for QVE they are called Row_Index";
+    EXPECT_EQ(names.choose("Cfg Chg Time"), "Cfg Chg Time 2") << "QVE with Lumo has CFG_CHG_TIME";
 }
 
 TEST(ColumnNamesTest, NumberedNamesAreNotLonger) {

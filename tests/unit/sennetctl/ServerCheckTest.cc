@@ -218,10 +218,22 @@ TEST_F(ServerCheckTest, NamesThatBreakTheFile) {
 
 TEST_F(ServerCheckTest, AColumnCalledAsTheNumbersOfRows) {
     texts.set("CIM_Fan.DeviceID", "Index");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),
+              "5:6: error: the name Index is that of the numbers of rows, too: readers refuse two "
+              "attributes of one name\n");
+    texts.set("CIM_Fan.DeviceID", "INDEX");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"), "");
+}
+
+TEST_F(ServerCheckTest, AColumnCalledAsOneThatQveHasAnyway) {
+    texts.set("CIM_Fan.DeviceID", "Row index");
     EXPECT_EQ(
         check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),
-        "5:6: warning: the name Index is that of the numbers of rows, too: readers refuse two "
-        "attributes of one name\n");
+        "5:6: error: each table of QVE has a column Row_index already: it refuses this one\n");
+    texts.set("CIM_Fan.DeviceID", "cfg chg type");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),
+              "5:6: error: each table of QVE with Lumo has a column cfg_chg_type already: it "
+              "refuses this one\n");
 }
 
 TEST_F(ServerCheckTest, NamesThatDifferInCaseOnly) {

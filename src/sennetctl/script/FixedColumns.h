@@ -1,0 +1,19 @@
+#pragma once
+
+// Columns that each table has besides those of its script. Databases take no two names that differ
+// in case only, MIF readers do.
+
+#include <Pegasus/Common/String.h>
+
+namespace sennetctl {
+
+/// Whether SMS, LANDesk and CA get the numbers of rows by this name.
+bool isRowNumberName(const Pegasus::String& name);
+
+/// Whether a table of QVE has a column of this name, which is as QVE writes it.
+bool isQveColumn(const Pegasus::String& name);
+
+/// The same for QVE with Lumo.
+bool isLumoColumn(const Pegasus::String& name);
+
+}  // namespace sennetctl

@@ -1,0 +1,169 @@
+"""Column names that collide: `sennetctl check` tells those, and only those, of which readers of MIF
+files or databases refuse what sennet writes."""
+
+import argparse
+import json
+import os
+import pathlib
+import re
+import sqlite3
+import subprocess
+import sys
+import tempfile
+import unittest
+
+HERE = pathlib.Path(__file__).resolve().parent
+sys.path.insert(0, str(HERE.parent / "inventory"))
+import installation
+
+ARGUMENTS = None
+SCRIPT = """[DEFAULT]
+title=Disks
+
+[CIM]
+G[0]=CIM_DiskDrive
+N[0]=root/cimv2
+A[0]=DeviceID,Name
+"""
+PROFILES = {"SMS": "sms", "CA": "ca", "LD": "landesk", "QVE": "dmi"}
+DIALECTS = ("oracle", "ms", "sybase", "lumo")
+
+
+class Outcome:
+    """What comes of the script with a name for each of its two columns."""
+
+    def __init__(self, server, place, first, second):
+        self.place = place
+        self.inventory = place / "inventory"
+        self.inventory.mkdir()
+        (self.inventory / "one.script.inv").write_text(SCRIPT)
+        (self.inventory / "sennet.properties").write_text(
+            f"title.Disks=Disks\nCIM_DiskDrive.DeviceID={first}\nCIM_DiskDrive.Name={second}\n")
+        self.socket = server.socket
+        self.sennetctl = ARGUMENTS.programs.resolve() / "sennetctl"
+        self.runs = {product: installation.Run(installation.programs_of(ARGUMENTS), product, place,
+                                               server.socket, self.inventory)
+                     for product in installation.PRODUCTS}
+
+    def told(self):
+        """The errors and warnings of check: line, column, severity and message."""
+        result = subprocess.run(
+            [self.sennetctl, "check", "--json"], capture_output=True, text=True, timeout=60,
+            check=False, env={"CIM_LOCAL_SOCKET": str(self.socket), "PATH": os.environ["PATH"],
+                              "VELM_CONFIG": str(self.place / "SMS" / "velm.properties")})
+        return [(each["line"], each["column"], each["severity"], each["message"])
+                for each in json.loads(result.stdout)["findings"] if each["severity"] != "note"]
+
+    def refused_files(self):
+        """The products of which the strict reader refuses a file for a repeated name."""
+        return {product for product, run in self.runs.items()
+                if any(self.is_refused(product, run, file) for file in run.files())}
+
+    def is_refused(self, product, run, file):
+        """Both the strict reader and the check of MIF files have to say so."""
+        reason = "second attribute of this name in the group"
+        try:
+            run.tables(file)
+            refused = False
+        except ValueError as error:
+            refused = reason in str(error)
+        checked = subprocess.run(
+            [self.sennetctl, "mif", "check", "--profile", PROFILES[product], file],
+            capture_output=True, text=True, timeout=60, check=False)
+        assert refused == (reason in checked.stdout), checked.stdout
+        return refused
+
+    def refused_schemas(self):
+        """The dialects whose table a database refuses for a repeated name."""
+        return {dialect for dialect in DIALECTS if not self.makes_a_table(dialect)}
+
+    def makes_a_table(self, dialect):
+        text = (self.runs["QVE"].sql / f"kwv_one_{dialect}_schema.sql").read_text("ascii")
+        create = re.search(r"^create table .*?\) *;?$", text, re.M | re.S)[0]
+        database = sqlite3.connect(":memory:")
+        try:
+            database.execute(create)
+        except sqlite3.OperationalError as error:
+            if "duplicate column name" not in str(error):
+                raise
+            return False
+        finally:
+            database.close()
+        return True
+
+
+class NamesTest(unittest.TestCase):
+    @classmethod
+    def setUpClass(cls):
+        place = pathlib.Path(cls.enterClassContext(
+            tempfile.TemporaryDirectory(prefix="sennet-names-")))
+        (place / "mof.d").mkdir()
+        cls.server = cls.enterClassContext(installation.Cimomd(
+            installation.programs_of(ARGUMENTS), place, ARGUMENTS.machines.resolve() / "server",
+            place / "mof.d"))
+
+    def outcome(self, first, second):
+        place = pathlib.Path(self.enterContext(
+            tempfile.TemporaryDirectory(prefix="sennet-names-")))
+        return Outcome(self.server, place, first, second)
+
+    def test_names_without_fault(self):
+        for names in (("ID", "Name"), ("ID", "INDEX")):
+            with self.subTest(names=names):
+                outcome = self.outcome(*names)
+                self.assertEqual(outcome.told(), [])
+                self.assertEqual(outcome.refused_files(), set())
+                self.assertEqual(outcome.refused_schemas(), set())
+
+    def test_the_name_of_the_numbers_of_rows(self):
+        outcome = self.outcome("ID", "Index")
+        (*place, message), = outcome.told()
+        self.assertEqual(place, [7, 15, "error"])
+        self.assertIn("the name Index is that of the numbers of rows", message)
+        self.assertEqual(outcome.refused_files(), {"SMS", "CA", "LD"})
+        self.assertEqual(outcome.refused_schemas(), set())
+
+    def test_the_name_of_the_numbers_of_rows_of_qve(self):
+        outcome = self.outcome("ID", "Row Index")
+        (*place, message), = outcome.told()
+        self.assertEqual(place, [7, 15, "error"])
+        self.assertIn("each table of QVE has a column Row_Index already", message)
+        self.assertEqual(outcome.refused_files(), {"QVE"})
+        self.assertEqual(outcome.refused_schemas(), set(DIALECTS))
+
+    def test_other_names_that_qve_has(self):
+        for name, products, dialects in (
+                ("config change time", ("QVE", "QVE with Lumo"), set(DIALECTS)),
+                ("CFG CHG TYPE", ("QVE with Lumo",), {"lumo"})):
+            with self.subTest(name=name):
+                outcome = self.outcome("ID", name)
+                told = outcome.told()
+                self.assertEqual(len(told), len(products), told)
+                for product, (*place, message) in zip(products, told):
+                    self.assertEqual(place, [7, 15, "error"])
+                    self.assertIn(f"each table of {product} has a column ", message)
+                self.assertEqual(outcome.refused_files(), set())
+                self.assertEqual(outcome.refused_schemas(), dialects)
+
+    def test_names_that_differ_in_case_only(self):
+        outcome = self.outcome("Disk", "DISK")
+        self.assertEqual({tuple(place) for *place, _ in outcome.told()}, {(7, 15, "warning")})
+        self.assertTrue(any("differ in case only: for QVE the table has one twice" in message
+                            for *_, message in outcome.told()))
+        self.assertEqual(outcome.refused_files(), set())
+        self.assertEqual(outcome.refused_schemas(), set(DIALECTS))
+
+    def test_one_name_twice_is_numbered(self):
+        outcome = self.outcome("Disk", "Disk")
+        (*_, message), = outcome.told()
+        self.assertIn("two columns are called Disk: for all products this one becomes Disk3",
+                      message)
+        self.assertEqual(outcome.refused_files(), set())
+        self.assertEqual(outcome.refused_schemas(), set())
+
+
+if __name__ == "__main__":
+    parser = argparse.ArgumentParser()
+    installation.add_arguments(parser)
+    ARGUMENTS, rest = parser.parse_known_args()
+    unittest.main(argv=[sys.argv[0], *rest])
