@@ -61,7 +61,8 @@ class Composer {
 
     NewScript compose() {
         result.script = "[DEFAULT]\ntitle=" + plan.title + "\n\n[CIM]\n";
-        result.properties = "# " + printable(plan.fileName) + "\n";
+        // What it is appended to may lack its last line end.
+        result.properties = "\n# " + printable(plan.fileName) + "\n";
         std::string key = "title." + plan.title;
         std::replace(key.begin(), key.end(), ' ', '_');
         addText(key, plan.shownTitle);

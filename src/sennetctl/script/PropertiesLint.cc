@@ -175,13 +175,22 @@ class PropertiesLint {
         add(Severity::Warning, entry.line, entry.keyColumn, message);
     }
 
+    // A file of another kind may have a fault in each of some million lines.
     void add(Severity severity, unsigned line, unsigned column, const std::string& message) {
-        findings.push_back({file, line, column, severity, message});
+        constexpr std::size_t kMostFindings = 1000;
+        if (count < kMostFindings) {
+            findings.push_back({file, line, column, severity, message});
+        } else if (count == kMostFindings) {
+            findings.push_back({file, line, column, Severity::Warning,
+                                "from here on the file has faults that are not told"});
+        }
+        ++count;
     }
 
     const std::string& file;
     std::vector<Finding>& findings;
     std::map<std::string, unsigned> lineOfKey;
+    std::size_t count = 0;  // of findings
     std::size_t wrongEntries = 0;
     Finding firstWrong;
 };

@@ -48,7 +48,7 @@ TEST_F(NewCommandTest, WritesScriptAndProperties) {
               "N[0]=root/cimv2\n"
               "A[0]=DeviceID,State,Bytes\n");
     EXPECT_EQ(directory.read("coolers.properties"),
-              "# coolers.script.inv\n"
+              "\n# coolers.script.inv\n"
               "title.Coolers_Inventory=Coolers\n"
               "CIM_Fan.DeviceID=Device ID\n"
               "CIM_Fan.State=State\n"
@@ -125,7 +125,7 @@ TEST_F(NewCommandTest, WhatIsNamedAlreadyIsNotNamedAgain) {
                     "CIM_Fan.State.Size=8\n");
     writeNewScript(options, output.plain());
     EXPECT_EQ(directory.read("coolers.properties"),
-              "# coolers.script.inv\nCIM_Fan.State=State 2\nCIM_Fan.Bytes=Bytes\n");
+              "\n# coolers.script.inv\nCIM_Fan.State=State 2\nCIM_Fan.Bytes=Bytes\n");
     const std::string in = "in " + options.resources + " already: ";
     EXPECT_THAT(output.text(), HasSubstr(in + "title.Coolers_Inventory\n" + in +
                                          "CIM_Fan.DeviceID\n" + in + "CIM_Fan.State.Size\n"));

@@ -94,6 +94,17 @@ TEST(PropertiesLintTest, Encodings) {
               "");
 }
 
+TEST(PropertiesLintTest, AFileOfAnotherKindIsNotToldLineByLine) {
+    std::string octets;
+    for (int i = 0; i < 2000; ++i) {
+        octets += "x\n";
+    }
+    std::vector<Finding> findings;
+    checkResourcesText("r", octets, findings);
+    ASSERT_EQ(findings.size(), 1001U);
+    EXPECT_EQ(findings.back().message, "from here on the file has faults that are not told");
+}
+
 TEST(PropertiesLintTest, Configurations) {
     EXPECT_EQ(inConfiguration("sennet.directory=/a\nsennet.resources = /b\nmif.directory.LD=/c\n"
                               "sql.directory=\n"),
