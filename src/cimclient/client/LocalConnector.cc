@@ -73,9 +73,10 @@ class SearchLog {
 
 // Connects to one socket. Without success the connection is not open and `reason` says why.
 ServerConnection connectTo(const std::string& path, FinalLink finalLink, const Deadline& deadline,
-                           std::string& reason) {
+                           const SearchLog& log, std::string& reason) {
     ConnectResult result = connectUnixSocket(path, finalLink, deadline);
     if (result.error == ETIMEDOUT) {
+        log.add(path, "does not take the connection within the time-out");
         throw ConnectionTimeoutException(
             printableText("Cannot connect to " + path + " within the time-out"));
     }
@@ -94,7 +95,7 @@ ServerConnection connectTo(const std::string& path, FinalLink finalLink, const D
 ServerConnection connectToNamedSocket(const std::string& path, const Deadline& deadline,
                                       const SearchLog& log) {
     std::string reason;
-    ServerConnection connection = connectTo(path, FinalLink::Follow, deadline, reason);
+    ServerConnection connection = connectTo(path, FinalLink::Follow, deadline, log, reason);
     const bool connected = connection.socket.isOpen();
     log.add(path, connected ? "connected" : reason, connected);
     if (!connected) {
@@ -151,7 +152,7 @@ ServerConnection connectToLocalServer(const ServerPlaces& places, const Deadline
             continue;
         }
         std::string reason;
-        ServerConnection connection = connectTo(path, FinalLink::Refuse, deadline, reason);
+        ServerConnection connection = connectTo(path, FinalLink::Refuse, deadline, log, reason);
         if (connection.socket.isOpen()) {
             log.add(path, "connected", true);
             return connection;

@@ -284,6 +284,12 @@ TEST_F(LocalConnectorTest, AServerThatTakesNoConnectionIsGivenUpAtTheDeadline) {
     EXPECT_THROW(connect(150), ConnectionTimeoutException);
     EXPECT_GE(watch.milliseconds(), 150);
     EXPECT_LT(watch.milliseconds(), 2000);
+    std::vector<TriedPlace> tried;
+    EXPECT_THROW(connectToLocalServer(places, Deadline(1), &tried), ConnectionTimeoutException);
+    ASSERT_EQ(tried.size(), 1U);
+    EXPECT_EQ(tried[0].path, directory.path("busy"));
+    EXPECT_EQ(tried[0].result, "does not take the connection within the time-out");
+    EXPECT_FALSE(tried[0].chosen);
 }
 
 }  // namespace
