@@ -92,8 +92,11 @@ class ScriptChecker {
         const std::string& directory = options.places.scriptDirectory;
         std::vector<std::string> scripts = scriptsIn(directory);
         std::error_code error;
-        if (!std::filesystem::is_directory(directory, error)) {
+        const std::filesystem::directory_iterator listed(directory, error);
+        if (error == std::errc::no_such_file_or_directory) {
             fail("there is no directory " + directory + " of inventory scripts");
+        } else if (error) {
+            fail("the directory " + directory + " of inventory scripts: " + error.message());
         } else if (scripts.empty()) {
             fail("there are no inventory scripts in " + directory);
         }

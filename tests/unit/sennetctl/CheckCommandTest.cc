@@ -214,6 +214,15 @@ TEST_F(CheckCommandTest, VerboselyThePlacesAreTold) {
     EXPECT_EQ(document.document()["resources"], places.resources);
 }
 
+TEST_F(CheckCommandTest, ADirectoryThatCannotBeListed) {
+    places.scriptDirectory = directory.write("file", "");
+    EXPECT_EQ(checkScripts(wanted({}, true), output.json()), 2);
+    const std::string reason =
+        "the directory " + places.scriptDirectory + " of inventory scripts: Not a directory";
+    EXPECT_EQ(output.errors(), "sennetctl: " + reason + "\n");
+    EXPECT_EQ(output.document()["error"]["message"], reason);
+}
+
 TEST_F(CheckCommandTest, ADirectoryWithoutScripts) {
     EXPECT_EQ(checkScripts(wanted({}, true), output.plain()), 2);
     EXPECT_EQ(output.errors(),
