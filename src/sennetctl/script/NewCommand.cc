@@ -31,7 +31,7 @@ std::string pathWithoutSuffix(const std::string& script) {
     const std::string name = std::filesystem::path(script).filename().string();
     if (name.size() <= kSuffix.size() ||
         name.compare(name.size() - kSuffix.size(), kSuffix.size(), kSuffix) != 0) {
-        throw CannotRun(script + ": the name of a script ends in .script.inv");
+        throw CannotRun(script, "the name of a script ends in .script.inv");
     }
     return script.substr(0, script.size() - kSuffix.size());
 }
