@@ -32,7 +32,12 @@ std::size_t lineWidthOf(int descriptor) {
 
 }  // namespace
 
-StandardStreams::StandardStreams() : buffer(STDOUT_FILENO), out(&buffer) {}
+StandardStreams::StandardStreams()
+    : buffer(STDOUT_FILENO), out(&buffer), usualTie(std::cerr.tie(&out)) {}
+
+StandardStreams::~StandardStreams() {
+    std::cerr.tie(usualTie);
+}
 
 Output StandardStreams::output(bool json) {
     return {out,

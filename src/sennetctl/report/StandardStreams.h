@@ -12,7 +12,11 @@ namespace sennetctl {
 
 class StandardStreams {
   public:
+    /// Until its end, what is written to standard error comes behind what was written before.
     StandardStreams();
+    ~StandardStreams();
+    StandardStreams(const StandardStreams&) = delete;
+    StandardStreams& operator=(const StandardStreams&) = delete;
 
     /// How commands write to them; valid as long as this object.
     Output output(bool json);
@@ -24,6 +28,7 @@ class StandardStreams {
   private:
     DescriptorBuffer buffer;
     std::ostream out;
+    std::ostream* usualTie;
 };
 
 }  // namespace sennetctl

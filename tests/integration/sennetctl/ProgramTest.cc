@@ -204,6 +204,17 @@ TEST_F(ProgramTest, GetShowsTheMachine) {
     EXPECT_EQ(result.out.find('\x1B'), std::string::npos) << "colour into a pipe";
 }
 
+TEST_F(ProgramTest, MessagesStandBehindTheTableThatTheyAreAbout) {
+    const ProgramResult result = support::runProgram(
+        "/bin/sh",
+        {"-c", TEST_BIN_DIR "/sennetctl get CIM_OperatingSystem -p OSType,Nickname 2>&1"},
+        {{"CIM_COMMAND", command}});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.out,
+                HasSubstr("1 instance\nsennetctl: CIM_OperatingSystem declares no property "
+                          "Nickname\n"));
+}
+
 TEST_F(ProgramTest, ServerTellsTheStartedOne) {
     const ProgramResult result = run({"server"});
     EXPECT_EQ(result.exitStatus, 0) << result.err;
