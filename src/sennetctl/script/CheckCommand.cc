@@ -5,7 +5,6 @@
 
 #include <algorithm>
 #include <filesystem>
-#include <map>
 #include <memory>
 #include <ostream>
 #include <system_error>
@@ -18,11 +17,11 @@
 #include "report/Text.h"
 #include "report/WholeFile.h"
 #include "script/MissingValues.h"
-#include "script/NameCheck.h"
 #include "script/PropertiesLint.h"
 #include "script/ScriptLint.h"
 #include "script/ScriptReader.h"
 #include "script/ServerCheck.h"
+#include "script/TitleCheck.h"
 
 namespace sennetctl {
 
@@ -141,7 +140,7 @@ class ScriptChecker {
         std::vector<Finding> found;
         ScriptModel model = ScriptReader(file, found).read(octets);
         checkScript(model, found);
-        compareTitle(model, found);
+        titles.check(model, texts.getProperties(), found);
         if (answers && !model.givenUp) {
             askServer(model, found);
         }
@@ -149,18 +148,6 @@ class ScriptChecker {
             checkTranslations(model, texts.getProperties(), found);
         }
         return found;
-    }
-
-    /// A reader takes two tables of one class for one.
-    void compareTitle(const ScriptModel& model, std::vector<Finding>& found) {
-        const std::string title = shownTitle(model, texts.getProperties());
-        checkTitleText(model, title, found);
-        const auto [first, isNew] = fileOfTitle.try_emplace(title, model.file);
-        if (!isNew && first->second != model.file && !model.givenUp) {
-            found.push_back({model.file, model.title.line, model.title.column, Severity::Warning,
-                             first->second + " has the title " + title +
-                                 ", too: both tables get the same MIF class"});
-        }
     }
 
     void askServer(ScriptModel& model, std::vector<Finding>& found) {
@@ -185,7 +172,7 @@ class ScriptChecker {
     Velm::PropertiesFile texts;
     bool hasTexts = false;             // without them each name would be told
     std::unique_ptr<Answers> answers;  // none when there is no server
-    std::map<std::string, std::string> fileOfTitle;
+    TitleCheck titles;
     CheckResult result;
     std::vector<Failure> troubles;  // with the server, which leave the scripts' own findings
 };

@@ -7,6 +7,7 @@
 #include "SennetConverter/framework/SennetUtilities.h"
 #include "cim/CimText.h"
 #include "script/FixedColumns.h"
+#include "script/NameFaults.h"
 #include "script/ScriptText.h"
 
 namespace sennetctl {
@@ -26,16 +27,6 @@ struct NamedColumn {
 String pegasusText(const std::string& text) {
     return String(text.c_str());
 }
-
-/// Whether a literal of a MIF file ends before the text does.
-bool breaksLiteral(const std::string& text) {
-    return std::any_of(text.begin(), text.end(), [](char c) {
-        return c == '"' || static_cast<unsigned char>(c) < 0x20 || c == 0x7F;
-    });
-}
-
-constexpr const char* kBreaksLiteral =
-    " has a double quote or a control character: the MIF file cannot be read";
 
 bool isRepeated(const ScriptSlot& slot, const ScriptText& property) {
     return std::any_of(
@@ -68,9 +59,9 @@ class NameChecker {
     void checkPlain(const std::vector<NamedColumn>& columns) {
         Array<String> used;
         for (const NamedColumn& column : columns) {
-            if (breaksLiteral(textOf(column.name))) {
-                add(column.place, "the name " + textOf(column.name) + kBreaksLiteral,
-                    Severity::Error);
+            for (const NameFault& fault : literalFaults(textOf(column.name))) {
+                add(column.place, "the name " + textOf(column.name) + fault.message,
+                    fault.severity);
             }
             if (isRowNumberName(column.name)) {
                 add(column.place,
@@ -204,19 +195,13 @@ void checkNames(const ScriptModel& model, const std::vector<AnsweredClass>& clas
     checker.checkTitle(model.title, pegasusText(shownTitle(model, texts)));
 }
 
-std::string shownTitle(const ScriptModel& model, const Velm::Properties& texts) {
-    CimScriptParser parser(pegasusText(model.file));
-    const String title =
-        model.title.value.empty() ? parser.getTitle() : pegasusText(model.title.value);
-    return textOf(SennetUtilities::trim(translatedTitle(texts, title)));
+std::string ownTitle(const ScriptModel& model) {
+    return model.title.value.empty() ? textOf(CimScriptParser(pegasusText(model.file)).getTitle())
+                                     : model.title.value;
 }
 
-void checkTitleText(const ScriptModel& model, const std::string& title,
-                    std::vector<Finding>& findings) {
-    if (breaksLiteral(title)) {
-        findings.push_back({model.file, model.title.line, model.title.column, Severity::Error,
-                            "the title " + title + kBreaksLiteral});
-    }
+std::string shownTitle(const ScriptModel& model, const Velm::Properties& texts) {
+    return textOf(SennetUtilities::trim(translatedTitle(texts, pegasusText(ownTitle(model)))));
 }
 
 }  // namespace sennetctl

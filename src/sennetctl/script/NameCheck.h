@@ -16,11 +16,10 @@ namespace sennetctl {
 void checkNames(const ScriptModel& model, const std::vector<AnsweredClass>& classes,
                 const Velm::Properties& texts, std::vector<Finding>& findings);
 
-/// The script's title as the files show it.
-std::string shownTitle(const ScriptModel& model, const Velm::Properties& texts);
+/// The script's title, which follows from the file's name where the script gives none.
+std::string ownTitle(const ScriptModel& model);
 
-/// Appends whether a title breaks the MIF file that it is written to.
-void checkTitleText(const ScriptModel& model, const std::string& title,
-                    std::vector<Finding>& findings);
+/// The title as the files show it.
+std::string shownTitle(const ScriptModel& model, const Velm::Properties& texts);
 
 }  // namespace sennetctl

@@ -14,10 +14,10 @@
 #include "report/Text.h"
 #include "report/WholeFile.h"
 #include "script/ColumnNames.h"
+#include "script/NameFaults.h"
 #include "script/NewScript.h"
 #include "script/ScriptModel.h"
 #include "script/ScriptText.h"
-#include "utf8/Utf8.h"
 
 namespace sennetctl {
 
@@ -36,17 +36,28 @@ std::string pathWithoutSuffix(const std::string& script) {
     return script.substr(0, script.size() - kSuffix.size());
 }
 
-/// A script has no way to write these.
+/// What no script can write, or breaks the files that are made of it.
 void refuseTitle(const std::string& title) {
     constexpr std::size_t kLongestTitle = 200;
     const bool any = std::any_of(title.begin(), title.end(), [](char c) {
-        return c == '"' || c == '=' || static_cast<unsigned char>(c) < 0x20 || c == 0x7F;
+        return std::string_view("\"\\$`=|").find(c) != std::string_view::npos ||
+               static_cast<unsigned char>(c) < 0x20 || c == 0x7F;
     });
     if (any) {
-        throw CannotRun("a title has no double quote, no '=' and no control character");
+        throw CannotRun(
+            "a title has none of the characters \" \\ $ ` = | and no control character");
     }
-    if (title.empty() || title.size() > kLongestTitle || utf8::clean(title) != title) {
-        throw CannotRun("a title is a text in UTF-8 of 1 to 200 octets");
+    const bool isAscii = std::all_of(title.begin(), title.end(),
+                                     [](char c) { return static_cast<unsigned char>(c) < 0x80; });
+    if (title.empty() || title.size() > kLongestTitle || !isAscii) {
+        throw CannotRun("a title is a text of 1 to 200 letters of ASCII");
+    }
+}
+
+void refuseReservedName(const std::string& name) {
+    const std::vector<NameFault> faults = groupNameFaults(name);
+    if (!faults.empty()) {
+        throw CannotRun("the title " + name + faults.front().message);
     }
 }
 
@@ -69,6 +80,8 @@ NewScriptPlan planFor(const NewOptions& options) {
     plan.title = options.title.empty() ? trimmed(stem) + " Inventory" : trimmed(options.title);
     refuseTitle(plan.title);
     plan.shownTitle = withShorterWords(options.title.empty() ? stem : plan.title, kLongestTitle);
+    refuseReservedName(plan.title);
+    refuseReservedName(plan.shownTitle);
     plan.nameSpace = options.nameSpace;
     Velm::PropertiesFile texts(options.resources.c_str());
     texts.load();

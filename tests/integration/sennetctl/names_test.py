@@ -1,5 +1,5 @@
-"""Column names that collide: `sennetctl check` tells those, and only those, of which readers of MIF
-files or databases refuse what sennet writes."""
+"""Column names that collide, and titles: `sennetctl check` tells those, and only those, of which
+readers of MIF files or databases refuse what sennet writes."""
 
 import argparse
 import json
@@ -30,13 +30,14 @@ DIALECTS = ("oracle", "ms", "sybase", "lumo")
 
 
 class Outcome:
-    """What comes of the script with a name for each of its two columns."""
+    """What comes of the script with a title and a name for each of its two columns."""
 
-    def __init__(self, server, place, first, second):
+    def __init__(self, server, place, first, second, title="Disks"):
         self.place = place
         self.inventory = place / "inventory"
         self.inventory.mkdir()
-        (self.inventory / "one.script.inv").write_text(SCRIPT)
+        (self.inventory / "one.script.inv").write_text(
+            SCRIPT.replace("Disks", title), encoding="utf-8")
         (self.inventory / "sennet.properties").write_text(
             f"title.Disks=Disks\nCIM_DiskDrive.DeviceID={first}\nCIM_DiskDrive.Name={second}\n")
         self.socket = server.socket
@@ -67,11 +68,21 @@ class Outcome:
             refused = False
         except ValueError as error:
             refused = reason in str(error)
-        checked = subprocess.run(
-            [self.sennetctl, "mif", "check", "--profile", PROFILES[product], file],
-            capture_output=True, text=True, timeout=60, check=False)
-        assert refused == (reason in checked.stdout), checked.stdout
+        checked = self.checked(product, file)
+        assert refused == (reason in checked), checked
         return refused
+
+    def refusing_profiles(self):
+        """The products for whose file the check of MIF files has an error."""
+        return {product for product, run in self.runs.items()
+                if any(": error: " in self.checked(product, file) for file in run.files())}
+
+    @staticmethod
+    def checked(product, file):
+        return subprocess.run(
+            [ARGUMENTS.programs.resolve() / "sennetctl", "mif", "check", "--profile",
+             PROFILES[product], file],
+            capture_output=True, text=True, timeout=60, check=False).stdout
 
     def refused_schemas(self):
         """The dialects whose table a database refuses for a repeated name."""
@@ -102,10 +113,10 @@ class NamesTest(unittest.TestCase):
             installation.programs_of(ARGUMENTS), place, ARGUMENTS.machines.resolve() / "server",
             place / "mof.d"))
 
-    def outcome(self, first, second):
+    def outcome(self, first, second, title="Disks"):
         place = pathlib.Path(self.enterContext(
             tempfile.TemporaryDirectory(prefix="sennet-names-")))
-        return Outcome(self.server, place, first, second)
+        return Outcome(self.server, place, first, second, title)
 
     def test_names_without_fault(self):
         for names in (("ID", "Name"), ("ID", "INDEX")):
@@ -160,6 +171,30 @@ class NamesTest(unittest.TestCase):
                       message)
         self.assertEqual(outcome.refused_files(), set())
         self.assertEqual(outcome.refused_schemas(), set())
+
+    def test_titles_that_readers_refuse(self):
+        for title, part, products in (
+                ("Plain (2)", None, set()),
+                ("Back\\slash", "cannot be read but by CA", {"SMS", "LD", "QVE"}),
+                ("End\\", "begins an escape: the MIF file cannot be read", set(PROFILES)),
+                ("L\u00fcfter", "letters beyond ASCII", {"SMS"}),
+                ("\u20ac", "letters beyond ASCII", {"SMS", "QVE"}),
+                ("architecture", "Configuration Manager's own", {"SMS"}),
+                ("a|Identification", "Configuration Manager's own", {"SMS"})):
+            with self.subTest(title=title):
+                outcome = self.outcome("ID", "Name", title)
+                errors = [message for *_, severity, message in outcome.told()
+                          if severity == "error"]
+                self.assertEqual(len(errors), 1 if part else 0, errors)
+                self.assertIn(part or "", "".join(errors))
+                self.assertEqual(outcome.refusing_profiles(), products)
+
+    def test_a_column_that_readers_refuse(self):
+        outcome = self.outcome("ID", "Sel\\\\x")
+        (*place, message), = outcome.told()
+        self.assertEqual(place, [7, 15, "error"])
+        self.assertIn("the name Sel\\x has a backslash", message)
+        self.assertEqual(outcome.refusing_profiles(), {"SMS", "LD", "QVE"})
 
 
 if __name__ == "__main__":

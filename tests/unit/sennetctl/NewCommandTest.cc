@@ -96,27 +96,40 @@ TEST_F(NewCommandTest, LeavesOutWhatNoFileShows) {
 }
 
 TEST_F(NewCommandTest, TitlesThatNoScriptCanHave) {
-    for (const char* title : {"Rack 17\" A", "A = B", "A\tB"}) {
+    for (const char* title : {"Rack 17\" A", "A = B", "A\tB", "C:\\temp", "A|B", "$(id)", "`id`"}) {
         options.title = title;
         EXPECT_EQ(failureOf(options),
-                  "a title has no double quote, no '=' and no control character");
+                  "a title has none of the characters \" \\ $ ` = | and no control character");
     }
-    for (const std::string& title :
-         {std::string("M\xFCller"), std::string(" "), std::string(201, 'x')}) {
+    for (const std::string& title : {std::string("M\xFCller"), std::string("M\xC3\xBCller"),
+                                     std::string(" "), std::string(201, 'x')}) {
         options.title = title;
-        EXPECT_EQ(failureOf(options), "a title is a text in UTF-8 of 1 to 200 octets");
+        EXPECT_EQ(failureOf(options), "a title is a text of 1 to 200 letters of ASCII");
     }
     options = {directory.path("a\"b.script.inv"), {"CIM_Fan"}, "root/cimv2", "", ""};
-    EXPECT_EQ(failureOf(options), "a title has no double quote, no '=' and no control character");
+    EXPECT_EQ(failureOf(options),
+              "a title has none of the characters \" \\ $ ` = | and no control character");
+    EXPECT_THAT(directory.names(), ElementsAre());
+}
+
+TEST_F(NewCommandTest, TitlesThatWouldAlterTheMachinesOwnRecord) {
+    for (const char* title : {"Identification", "ARCHITECTURE"}) {
+        options.title = title;
+        EXPECT_THAT(failureOf(options), HasSubstr(std::string("the title ") + title +
+                                                  " is one of Configuration Manager's own"));
+    }
+    options = {directory.path("architecture.script.inv"), {"CIM_Fan"}, "root/cimv2", "", ""};
+    EXPECT_THAT(failureOf(options), HasSubstr("the title Architecture is one of"))
+        << "shown for the title Architecture Inventory";
     EXPECT_THAT(directory.names(), ElementsAre());
 }
 
 TEST_F(NewCommandTest, TitlesAreTrimmedAndShownShort) {
-    options.title = " Coolers: all \\ of them ";
+    options.title = " Coolers: all of them ";
     writeNewScript(options, output.plain());
-    EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("title=Coolers: all \\ of them\n"));
+    EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("title=Coolers: all of them\n"));
     EXPECT_THAT(directory.read("coolers.properties"),
-                HasSubstr("\ntitle.Coolers\\:_all_\\\\_of_them=Co al \\\\ of th\n"));
+                HasSubstr("\ntitle.Coolers\\:_all_of_them=Coo all of th\n"));
 }
 
 TEST_F(NewCommandTest, WhatIsNamedAlreadyIsNotNamedAgain) {
