@@ -20,19 +20,24 @@ namespace sennetctl {
 
 namespace {
 
-/// Names of the files for people: without directories where that is enough to tell them apart.
-std::vector<std::string> shortNames(const std::vector<std::string>& files) {
-    std::map<std::string, int> uses;
+/// The name of a file's directory for people.
+std::string directoryOf(const std::string& file) {
+    const std::string directory = std::filesystem::path(file).parent_path().string();
+    return directory.empty() ? "." : directory;
+}
+
+/// The files of each directory; the directories in the order of their first files.
+std::vector<std::vector<std::string>> byDirectory(const std::vector<std::string>& files) {
+    std::map<std::string, std::size_t> places;
+    std::vector<std::vector<std::string>> groups;
     for (const std::string& file : files) {
-        ++uses[std::filesystem::path(file).filename().string()];
+        const auto [place, isNew] = places.try_emplace(directoryOf(file), groups.size());
+        if (isNew) {
+            groups.emplace_back();
+        }
+        groups[place->second].push_back(file);
     }
-    std::vector<std::string> names;
-    names.reserve(files.size());
-    for (const std::string& file : files) {
-        std::string name = std::filesystem::path(file).filename().string();
-        names.push_back(uses[name] == 1 ? name : file);
-    }
-    return names;
+    return groups;
 }
 
 std::time_t modifiedAt(const std::string& file) {
@@ -50,35 +55,61 @@ struct Composition {
     std::vector<Failure> failures;   // of those that are not
 };
 
-void addFile(const std::string& file, const std::string& name, Composition& composed) {
-    MifContent content;
-    std::time_t modified = 0;
-    try {
-        content = readMifFile(file);
-        modified = modifiedAt(file);
-    } catch (const CannotRun& cause) {
-        composed.failures.push_back(cause.failure());
-        Failure shown = cause.failure();
-        shown.file = name;
-        composed.page.addMissing(shown);
-        return;
-    }
-    composed.page.add(name, modified, content);
-    composed.files.push_back(file);
-}
+class PageComposer {
+  public:
+    PageComposer(const HtmlOptions& theOptions, const Output& output)
+        : options(theOptions),
+          progress(output),
+          composed{InventoryPage(theOptions.title), {}, {}} {}
 
-Composition composePage(const HtmlOptions& options, const Output& output) {
-    const std::vector<std::string> names = shortNames(options.files);
-    Composition composed{InventoryPage(options.title), {}, {}};
-    const Progress progress(output);
-    for (std::size_t i = 0; i < options.files.size(); ++i) {
-        const std::string& file = options.files[i];
-        progress.show("file " + std::to_string(i + 1) + " of " +
-                      std::to_string(options.files.size()) + ": " + file);
-        addFile(file, names[i], composed);
+    /// Where files of several directories are shown together, each directory is one machine's.
+    Composition compose() {
+        const std::vector<std::vector<std::string>> groups = byDirectory(options.files);
+        for (const std::vector<std::string>& files : groups) {
+            hasHeading = groups.size() == 1;
+            for (const std::string& file : files) {
+                showProgress(file);
+                add(file, groups.size() > 1);
+            }
+        }
+        return std::move(composed);
     }
-    return composed;
-}
+
+  private:
+    void showProgress(const std::string& file) {
+        ++filesSeen;
+        progress.show("file " + std::to_string(filesSeen) + " of " +
+                      std::to_string(options.files.size()) + ": " + file);
+    }
+
+    void add(const std::string& file, bool isOneOfSeveral) {
+        const std::string name = std::filesystem::path(file).filename().string();
+        MifContent content;
+        std::time_t modified = 0;
+        try {
+            content = readMifFile(file);
+            modified = modifiedAt(file);
+        } catch (const CannotRun& cause) {
+            composed.failures.push_back(cause.failure());
+            Failure shown = cause.failure();
+            shown.file = isOneOfSeveral ? file : name;
+            composed.page.addMissing(shown);
+            return;
+        }
+        if (!hasHeading) {
+            composed.page.beginGroup(directoryOf(file));
+            hasHeading = true;
+        }
+        composed.page.add(name, modified, content);
+        composed.files.push_back(file);
+    }
+
+    const HtmlOptions& options;
+    Progress progress;
+    Composition composed;
+    std::size_t filesSeen = 0;
+    bool hasHeading = false;
+};
 
 void makeDirectory(const std::string& directory) {
     if (Velm::TextFile(directory.c_str()).mkdir(1) != 0) {
@@ -112,7 +143,7 @@ int writeHtmlPage(const HtmlOptions& options, const Output& output) {
     if (!options.replace) {
         refuseExisting(path);
     }
-    const Composition composed = composePage(options, output);
+    const Composition composed = PageComposer(options, output).compose();
     if (composed.files.empty()) {
         report(std::nullopt, composed, output);
         return kCannotRun;

@@ -29,36 +29,53 @@ std::string timeMarkup(std::time_t moment) {
     return fmt::format(" of <time datetime=\"{0}Z\">{0} UTC</time>", text);
 }
 
+constexpr const char* kPartEnd = "</section>\n";
+constexpr const char* kPartLinksEnd = "</ul>\n</li>\n";
+
 std::string link(const std::string& target, const std::string& name, const std::string& count) {
-    return fmt::format("<a href=\"#{}\">{} <span class=\"count\">{}</span></a>", target, html(name),
-                       count);
+    const std::string shownCount =
+        count.empty() ? std::string() : fmt::format(" <span class=\"count\">{}</span>", count);
+    return fmt::format("<a href=\"#{}\">{}{}</a>", target, html(name), shownCount);
 }
 
 }  // namespace
+
+void InventoryPage::beginGroup(const std::string& name) {
+    if (groupCount > 0) {
+        links += kPartLinksEnd;
+        sections += kPartEnd;
+    }
+    ++groupCount;
+    beginPart(fmt::format("group-{}", groupCount), name, {}, 2);
+}
 
 void InventoryPage::add(const std::string& file, std::time_t modified, const MifContent& content) {
     ++fileCount;
     const std::string origin = fmt::format("<b>{}</b>{}, component {}", html(file),
                                            timeMarkup(modified), html(content.component));
+    const int level = groupCount > 0 ? 3 : 2;
     if (content.tables.size() == 1) {
-        addTable(content.tables.front(), origin, 2);
+        addTable(content.tables.front(), origin, level);
         return;
     }
-    const std::string id = fmt::format("file-{}", fileCount);
-    sections +=
-        fmt::format("<section aria-labelledby=\"{0}\">\n<h2 id=\"{0}\">{1}</h2>\n", id, html(file));
-    links += "<li>" + link(id, file, counted(content.tables.size(), "table"));
+    beginPart(fmt::format("file-{}", fileCount), file, counted(content.tables.size(), "table"),
+              level);
     if (content.tables.empty()) {
         sections += fmt::format("<p class=\"note\">No tables in {}.</p>\n", origin);
-    } else {
-        links += "\n<ul>\n";
-        for (const MifTable& table : content.tables) {
-            addTable(table, origin, 3);
-        }
-        links += "</ul>\n";
     }
-    links += "</li>\n";
-    sections += "</section>\n";
+    for (const MifTable& table : content.tables) {
+        addTable(table, origin, level + 1);
+    }
+    links += kPartLinksEnd;
+    sections += kPartEnd;
+}
+
+void InventoryPage::beginPart(const std::string& id, const std::string& name,
+                              const std::string& count, int level) {
+    links += "<li>" + link(id, name, count) + "\n<ul>\n";
+    sections += fmt::format(
+        "<section class=\"part\" aria-labelledby=\"{0}\">\n<h{1} id=\"{0}\">{2}</h{1}>\n", id,
+        level, html(name));
 }
 
 void InventoryPage::addMissing(const Failure& failure) {
@@ -69,11 +86,12 @@ void InventoryPage::addTable(const MifTable& table, const std::string& origin, i
     ++tableCount;
     rowCount += table.rows.size();
     const std::string id = fmt::format("table-{}", tableCount);
-    links += "<li>" + link(id, table.name, std::to_string(table.rows.size())) + "</li>\n";
+    const ShownTable shown = shownTable(table);
+    links += "<li>" + link(id, shown.name, std::to_string(table.rows.size())) + "</li>\n";
     sections += fmt::format(
         "<section class=\"table\" aria-labelledby=\"{0}\">\n<h{1} id=\"{0}\">{2}</h{1}>\n", id,
-        level, html(table.name));
-    appendTable(sections, shownTable(table), id, origin);
+        level, html(shown.name));
+    appendTable(sections, shown, id, origin);
     sections += "</section>\n";
 }
 
@@ -95,7 +113,8 @@ std::string InventoryPage::text() const {
         "<p role=\"status\" id=\"found\"></p>\n</div>\n</header>\n",
         html(title), counted(tableCount, "table"), counted(fileCount, "file"),
         counted(rowCount, "row"));
-    page.append("<nav aria-label=\"Tables\">\n<ul>\n").append(links).append("</ul>\n</nav>\n");
+    page.append("<nav aria-label=\"Tables\">\n<ul>\n").append(links);
+    page.append(groupCount > 0 ? kPartLinksEnd : "").append("</ul>\n</nav>\n");
     page.append("<main id=\"tables\">\n");
     if (!missing.empty()) {
         page.append(
@@ -103,7 +122,7 @@ std::string InventoryPage::text() const {
             .append(missing)
             .append("</ul>\n</section>\n");
     }
-    page.append(sections).append("</main>\n");
+    page.append(sections).append(groupCount > 0 ? kPartEnd : "").append("</main>\n");
     page.append(
         "<footer>\n<p>Made by sennetctl from MIF files. Columns without any value and "
         "row numbers are left out.</p>\n</footer>\n");

@@ -19,6 +19,9 @@ class InventoryPage {
     /// The title in UTF-8.
     explicit InventoryPage(std::string theTitle) : title(std::move(theTitle)) {}
 
+    /// What is added from now on stands below a heading of this name, a machine's for instance.
+    void beginGroup(const std::string& name);
+
     /// Appends a file's tables.
     /// @param file      its name for people
     /// @param modified  when it was written
@@ -36,12 +39,15 @@ class InventoryPage {
     std::size_t rows() const { return rowCount; }
 
   private:
+    void beginPart(const std::string& id, const std::string& name, const std::string& count,
+                   int level);
     void addTable(const MifTable& table, const std::string& origin, int level);
 
     std::string title;
     std::string links;     // items of the list of tables
     std::string sections;  // the tables
     std::string missing;   // items of the list of files that are not shown
+    std::size_t groupCount = 0;
     std::size_t fileCount = 0;
     std::size_t tableCount = 0;
     std::size_t rowCount = 0;

@@ -45,6 +45,11 @@ std::string textOf(const Mif::Value& value, const MifColumn& column) {
     return none ? std::string() : text;
 }
 
+/// A heading or a link without any text leads nobody anywhere.
+std::string nameOrWord(const std::string& name) {
+    return name.find_first_not_of(' ') == std::string::npos ? "(without a name)" : name;
+}
+
 /// Some products have all numbers in texts. What begins with a zero is a name made of digits.
 bool isNumber(const std::string& text) {
     constexpr std::size_t kMostDigits = 20;
@@ -58,7 +63,7 @@ bool isNumber(const std::string& text) {
 
 ShownTable shownTable(const MifTable& table) {
     const std::vector<const Values*> rows = orderedRows(table);
-    ShownTable shown{table.name, table.className, table.description, {}, {}, {}};
+    ShownTable shown{nameOrWord(table.name), table.className, table.description, {}, {}, {}};
     shown.rows.resize(rows.size());
     for (std::size_t i = 0; i < table.columns.size(); ++i) {
         const MifColumn& column = table.columns[i];
@@ -72,14 +77,14 @@ ShownTable shownTable(const MifTable& table) {
         }
         const auto isEmpty = [](const std::string& text) { return text.empty(); };
         if (!rows.empty() && std::all_of(texts.begin(), texts.end(), isEmpty)) {
-            shown.emptyColumns.push_back(column.name);
+            shown.emptyColumns.push_back(nameOrWord(column.name));
             continue;
         }
         const bool numbers =
             !rows.empty() && std::all_of(texts.begin(), texts.end(), [](const std::string& text) {
                 return text.empty() || isNumber(text);
             });
-        shown.columns.push_back({column.name, column.description, numbers});
+        shown.columns.push_back({nameOrWord(column.name), column.description, numbers});
         for (std::size_t k = 0; k < rows.size(); ++k) {
             shown.rows[k].push_back(std::move(texts[k]));
         }

@@ -25,7 +25,8 @@ struct ShownTable {
 };
 
 /// Rows come in the order of their row numbers, which are left out as columns without a value are.
-/// The date that the generator writes where there is none is no value. All texts are UTF-8.
+/// The date that the generator writes where there is none is no value. What has no name gets a
+/// word. All texts are UTF-8.
 ShownTable shownTable(const MifTable& table);
 
 }  // namespace sennetctl

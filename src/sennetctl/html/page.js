@@ -60,10 +60,12 @@
     const linkTo = (heading) =>
         document.querySelector(`nav a[href="#${heading.id}"]`).parentElement;
 
+    const headings = "h2, h3, h4";
+
     // What is searched: a single row stands or falls as a whole, and so do the rows below a heading
     // that has the words itself.
     const sections = [...document.querySelectorAll("section.table")].map((section) => {
-        const heading = section.querySelector("h2, h3");
+        const heading = section.querySelector(headings);
         const table = section.querySelector("table");
         const rows = [...(table ? table.tBodies[0].rows : [])].map((row) => ({
             row,
@@ -93,11 +95,11 @@
         return all ? section.count : count;
     };
 
-    const files = [...document.querySelectorAll("section:not(.table)")];
-    const showFiles = (everything) => {
-        for (const file of files) {
-            file.hidden = !everything && !file.querySelector("section.table:not([hidden])");
-            linkTo(file.querySelector("h2")).hidden = file.hidden;
+    const parts = [...document.querySelectorAll("section.part")];
+    const showParts = (everything) => {
+        for (const part of parts) {
+            part.hidden = !everything && !part.querySelector("section.table:not([hidden])");
+            linkTo(part.querySelector(headings)).hidden = part.hidden;
         }
     };
 
@@ -110,7 +112,7 @@
             rows += showMatches(section, words);
             tables += section.section.hidden ? 0 : 1;
         }
-        showFiles(words.length === 0);
+        showParts(words.length === 0);
         const result = `${plural(rows, "row")} in ${plural(tables, "table")}`;
         found.textContent = words.length === 0 ? "" : tables === 0 ? "Nothing found" : result;
     };

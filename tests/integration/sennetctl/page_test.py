@@ -55,19 +55,26 @@ class PageTest(unittest.TestCase):
         cls.place = pathlib.Path(cls.enterClassContext(
             tempfile.TemporaryDirectory(prefix="sennet-page-")))
         cls.fans = cls.page("fans", cls.file("fans.mif", fan_file()))
+        cls.fleet = cls.page("fleet", cls.file("anna/fans.mif", fan_file()),
+                             cls.file("bert/fans.mif", fan_file().replace("Tower", "Rack")),
+                             cls.place / "bert/none.mif", status=2)
         cls.hostile = cls.page("hostile", cls.file("hostile.mif", HOSTILE))
         cls.laptop = cls.page("laptop", *cls.inventory())
         cls.browser = cls.enterClassContext(chromium.Chromium())
 
     @classmethod
     def file(cls, name, text):
+        (cls.place / name).parent.mkdir(exist_ok=True)
         (cls.place / name).write_text(text)
         return cls.place / name
 
     @classmethod
-    def page(cls, name, *files):
-        subprocess.run([ARGUMENTS.programs / "sennetctl", "mif", "html", "-o", cls.place / name,
-                        *files], check=True, timeout=60, stdout=subprocess.DEVNULL)
+    def page(cls, name, *files, status=0):
+        run = subprocess.run(
+            [ARGUMENTS.programs / "sennetctl", "mif", "html", "-o", cls.place / name, *files],
+            timeout=60, capture_output=True, text=True)
+        if run.returncode != status:
+            raise AssertionError(f"status {run.returncode}: {run.stderr}")
         return cls.place / name / "inventory.html"
 
     @classmethod
@@ -162,6 +169,17 @@ class PageTest(unittest.TestCase):
         self.assertEqual(len(self.seen("nav a")), 3)
         self.assert_nothing_went_wrong(self.fans)
 
+    def test_searching_the_files_of_several_machines(self):
+        self.open(self.fleet)
+        anna, bert = (str(self.place / machine) for machine in ("anna", "bert"))
+        self.assertEqual(self.seen("main h2"), ["Not shown", anna, bert])
+        self.search("rack")
+        self.assertEqual(self.seen("main h2"), ["Not shown", bert])
+        self.assertEqual(self.seen("section.table h4"), ["System"])
+        self.assertEqual(self.seen("nav a"), [bert, "fans.mif 2 tables", "System 1"])
+        self.assertEqual(self.seen("#found"), ["1 row in 1 table"])
+        self.assert_nothing_went_wrong(self.fleet)
+
     def test_without_script_everything_is_there_to_be_read(self):
         self.browser.command("Emulation.setScriptExecutionDisabled", value=True)
         try:
@@ -204,14 +222,14 @@ class PageTest(unittest.TestCase):
     def test_no_page_is_wider_than_a_phone(self):
         self.browser.command("Emulation.setDeviceMetricsOverride", width=360, height=740,
                              deviceScaleFactor=2, mobile=True)
-        for page in (self.fans, self.hostile, self.laptop):
+        for page in (self.fans, self.fleet, self.hostile, self.laptop):
             self.open(page)
             self.assertEqual(self.browser.value("document.documentElement.scrollWidth"), 360)
 
     def test_nothing_bars_anybody(self):
         if not ARGUMENTS.axe.exists():
             self.skipTest(f"axe-core is not at {ARGUMENTS.axe}")
-        for page in (self.fans, self.hostile, self.laptop):
+        for page in (self.fans, self.fleet, self.hostile, self.laptop):
             for scheme in ("light", "dark"):
                 self.browser.command("Emulation.setEmulatedMedia", features=[
                     {"name": "prefers-color-scheme", "value": scheme}])

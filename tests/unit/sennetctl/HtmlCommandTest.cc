@@ -15,6 +15,7 @@ namespace sennetctl {
 namespace {
 
 using ::testing::HasSubstr;
+using ::testing::Not;
 
 class HtmlCommandTest : public testing::Test {
   protected:
@@ -58,15 +59,32 @@ TEST_F(HtmlCommandTest, TellsInJson) {
               "{\"page\":\"" + page() + "\",\"files\":[\"" + one + "\"],\"tables\":1,\"rows\":1}");
 }
 
-TEST_F(HtmlCommandTest, FilesOfOneNameAreToldApartByTheirPlaces) {
-    std::filesystem::create_directory(directory.path("a"));
-    std::filesystem::create_directory(directory.path("b"));
-    const std::string one = fans("a/fan.mif");
-    const std::string two = fans("b/fan.mif");
-    writeHtmlPage(options({one, two}), output.plain());
+// Several machines' files are collected into a directory for each.
+TEST_F(HtmlCommandTest, FilesOfSeveralDirectoriesStandBelowTheNamesOfThese) {
+    for (const char* machine : {"a", "b", "c"}) {
+        std::filesystem::create_directory(directory.path(machine));
+    }
+    const std::vector<std::string> files = {fans("a/fan.mif"), fans("b/fan.mif"),
+                                            directory.path("c/missing.mif"), fans("a/more.mif")};
+    EXPECT_EQ(writeHtmlPage(options(files), output.plain()), 2);
     const std::string text = readWholeFile(page());
-    EXPECT_THAT(text, HasSubstr("<b>" + one + "</b>"));
-    EXPECT_THAT(text, HasSubstr("<b>" + two + "</b>"));
+    EXPECT_THAT(text,
+                HasSubstr("<li><a href=\"#group-1\">" + directory.path("a") +
+                          "</a>\n<ul>\n<li><a href=\"#table-1\">Fan "
+                          "<span class=\"count\">1</span></a></li>\n"
+                          "<li><a href=\"#table-2\">Fan "
+                          "<span class=\"count\">1</span></a></li>\n</ul>\n</li>\n"
+                          "<li><a href=\"#group-2\">" +
+                          directory.path("b") +
+                          "</a>\n<ul>\n<li><a href=\"#table-3\">Fan "
+                          "<span class=\"count\">1</span></a></li>\n</ul>\n</li>\n</ul>\n</nav>"));
+    EXPECT_THAT(text, HasSubstr("<section class=\"part\" aria-labelledby=\"group-2\">\n"
+                                "<h2 id=\"group-2\">" +
+                                directory.path("b") + "</h2>\n<section class=\"table\""));
+    EXPECT_THAT(text, HasSubstr("<h3 id=\"table-3\">Fan</h3>"));
+    EXPECT_THAT(text, HasSubstr("</section>\n</section>\n</main>"));
+    EXPECT_THAT(text, Not(HasSubstr("group-3")));
+    EXPECT_THAT(text, HasSubstr("<li>" + directory.path("c/missing.mif") + ": "));
 }
 
 TEST_F(HtmlCommandTest, AnEarlierPageIsReplacedOnlyOnDemand) {

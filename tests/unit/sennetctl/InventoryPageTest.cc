@@ -115,8 +115,8 @@ TEST_F(InventoryPageTest, AFileWithSeveralTablesHasAHeadingOfItsOwn) {
         kMifStart + tableMif(2, "Fan", "{ 1, \"a\", 1 }\n") + tableMif(3, "Disk", "") + kMifEnd);
     EXPECT_THAT(page.text(), HasSubstr("<li><a href=\"#file-1\">kwvinv.mif <span class=\"count\">2 "
                                        "tables</span></a>\n<ul>\n<li><a href=\"#table-1\">Fan "));
-    EXPECT_THAT(page.text(), HasSubstr("<section aria-labelledby=\"file-1\">\n<h2 id=\"file-1\">"
-                                       "kwvinv.mif</h2>\n"));
+    EXPECT_THAT(page.text(), HasSubstr("<section class=\"part\" aria-labelledby=\"file-1\">\n"
+                                       "<h2 id=\"file-1\">kwvinv.mif</h2>\n"));
     EXPECT_THAT(page.text(), HasSubstr("<h3 id=\"table-1\">Fan</h3>\n"));
     EXPECT_THAT(page.text(), HasSubstr("<h3 id=\"table-2\">Disk</h3>\n<p class=\"note\">No rows "
                                        "from <b>kwvinv.mif</b>"));
@@ -126,6 +126,17 @@ TEST_F(InventoryPageTest, AFileWithoutTablesSaysSo) {
     add("none.mif", kMifStart + kMifEnd);
     EXPECT_THAT(page.text(), HasSubstr("<p class=\"note\">No tables in <b>none.mif</b> of "));
     EXPECT_THAT(page.text(), HasSubstr("<p>0 tables from 1 file with 0 rows</p>"));
+}
+
+TEST_F(InventoryPageTest, WhatHasNoNameGetsAWord) {
+    add("odd.mif", kMifStart +
+                       "Start Group Name = \"\" Class = \"Own|Odd|001\" Id = 2\n"
+                       "Start Attribute Name = \" \" Id = 1 Type = Integer Value = 2\n"
+                       "End Attribute\nEnd Group\n" +
+                       kMifEnd);
+    EXPECT_THAT(page.text(), HasSubstr("<a href=\"#table-1\">(without a name) <span"));
+    EXPECT_THAT(page.text(), HasSubstr("<h2 id=\"table-1\">(without a name)</h2>"));
+    EXPECT_THAT(page.text(), HasSubstr("<th scope=\"row\">(without a name)</th>"));
 }
 
 TEST_F(InventoryPageTest, DescriptionsAndNamesOfValues) {
