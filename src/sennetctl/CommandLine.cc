@@ -44,7 +44,8 @@ CLI::App* addCommand(CLI::App& parent, Choice& choice, const std::string& name,
     return command;
 }
 
-void addTimeout(CLI::App& command, unsigned& seconds, const std::string& whatFor) {
+void addTimeout(CLI::App& command, unsigned& seconds,
+                const std::string& whatFor = "how long the server's first answer may take") {
     command.add_option("--timeout", seconds, whatFor + ", by default 10 s")
         ->option_text("SECONDS")
         ->check(CLI::Range(1, 3600));
@@ -82,6 +83,7 @@ void addGet(CLI::App& app, Choice& choice) {
                      "these properties, in this order; by default all that have a value")
         ->option_text("PROPERTY,...")
         ->delimiter(',');
+    addTimeout(*command, options->timeoutSeconds);
     command->callback([&choice, options] {
         choice.command = [options](const Output& output) {
             return showInstances(*options, output);
@@ -102,7 +104,7 @@ void addCheck(CLI::App& app, Choice& choice) {
                      "inventory scripts; by default all that sennet reads")
         ->option_text("SCRIPT...");
     command->add_flag("--offline", options->offline, "ask no CIM server");
-    addTimeout(*command, options->timeoutSeconds, "how long the server's first answer may take");
+    addTimeout(*command, options->timeoutSeconds);
     command->add_flag("--translations", options->translations,
                       "tell names and sizes that the resource properties lack, too");
     command->add_flag("-v,--verbose", options->verbose,
@@ -131,6 +133,7 @@ void addNew(CLI::App& app, Choice& choice) {
         ->option_text("NAMESPACE");
     command->add_option("--title", options->title, "by default made of the file's name")
         ->option_text("TITLE");
+    addTimeout(*command, options->timeoutSeconds);
     command->callback([&choice, options] {
         choice.command = [options](const Output& output) {
             return writeNewScript(*options, output);

@@ -22,6 +22,7 @@
 #include "script/ScriptReader.h"
 #include "script/ServerCheck.h"
 #include "script/TitleCheck.h"
+#include "utf8/Utf8.h"
 
 namespace sennetctl {
 
@@ -137,6 +138,10 @@ class ScriptChecker {
     }
 
     std::vector<Finding> findingsIn(const std::string& file, std::string_view octets) {
+        if (utf8::clean(file) != file) {
+            return {{file, 0, 0, Severity::Error,
+                     "a file whose name is not UTF-8 is passed over by sennet: rename it"}};
+        }
         std::vector<Finding> found;
         ScriptModel model = ScriptReader(file, found).read(octets);
         checkScript(model, found);

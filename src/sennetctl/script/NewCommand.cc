@@ -91,13 +91,14 @@ NewScriptPlan planFor(const NewOptions& options) {
 
 std::vector<AnsweredClass> askFor(const NewOptions& options, const Output& output) {
     const Progress progress(output);
-    LocalServer server;
+    LocalServer server(options.timeoutSeconds * 1000);
     std::vector<AnsweredClass> classes;
     for (const std::string& name : options.classes) {
         progress.show("asking for " + name);
         try {
-            classes.push_back({nullptr, server.getClass(options.nameSpace, name),
-                               server.instances(options.nameSpace, name)});
+            const Pegasus::CIMClass definition = server.getClass(options.nameSpace, name);
+            server.setTimeout(LocalServer::kTimeoutMilliseconds);
+            classes.push_back({nullptr, definition, server.instances(options.nameSpace, name)});
         } catch (const Pegasus::CIMException& failure) {
             throw CannotRun(options.nameSpace + ":" + name + ": " + reasonOf(failure));
         }

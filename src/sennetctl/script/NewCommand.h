@@ -17,6 +17,7 @@ struct NewOptions {
     std::string title;  ///< empty for one made of the file's name
     /// The resource properties in use; what stands there is not written again.
     std::string resources = placesInUse().resources;
+    unsigned timeoutSeconds = 10;  ///< for the server's first answer
 };
 
 /// Writes the script, and beside it a file of resource properties with readable names and sizes:

@@ -32,9 +32,10 @@ struct ClassContent {
 ClassContent readClass(const GetOptions& options, const Output& output) {
     const Progress progress(output);
     progress.show("asking for " + options.className);
-    LocalServer server;
+    LocalServer server(options.timeoutSeconds * 1000);
     try {
         ClassContent content{server.getClass(options.nameSpace, options.className), {}};
+        server.setTimeout(LocalServer::kTimeoutMilliseconds);
         content.instances = server.instances(options.nameSpace, options.className);
         return content;
     } catch (const CIMException& failure) {

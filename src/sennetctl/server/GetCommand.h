@@ -14,6 +14,7 @@ struct GetOptions {
     std::string nameSpace = "root/cimv2";
     /// In this order; none for all that have a value in some instance.
     std::vector<std::string> properties;
+    unsigned timeoutSeconds = 10;  // for the server's first answer
 };
 
 /// Prints a table of the instances, numbers with names as these. The status is kFindings when there

@@ -46,6 +46,21 @@ TEST_F(CheckCommandTest, OfflineAsksNoServer) {
     EXPECT_EQ(fans.server.connectionCount(), 0U);
 }
 
+// Such a name must not hide what is wrong with the others.
+TEST_F(CheckCommandTest, AFileWhoseNameIsNotUtf8IsToldBesideTheOthers) {
+    const std::string latin = directory.write(
+        "l\xFC"
+        "fter.script.inv",
+        kGood);
+    const std::string other = directory.write("x.script.inv", std::string(kGood) + "nonsense\n");
+    EXPECT_EQ(checkScripts(wanted({latin, other}, true, false), output.plain()), 1);
+    EXPECT_THAT(output.text(),
+                HasSubstr("fter.script.inv: error: a file whose name is not UTF-8 is "
+                          "passed over by sennet: rename it\n"));
+    EXPECT_THAT(output.text(), HasSubstr(other + ":6:1: warning: "));
+    EXPECT_THAT(output.text(), HasSubstr("2 files: 1 error, 1 warning"));
+}
+
 TEST_F(CheckCommandTest, WithoutAServerTheScriptsAreChecked) {
     fans.server.stop();
     const std::string file = directory.write("x.script.inv", kGood);

@@ -27,6 +27,12 @@ class GetCommandTest : public testing::Test {
     GetOptions options{"CIM_Fan", "root/cimv2", {}};
 };
 
+TEST_F(GetCommandTest, AServerThatDoesNotAnswerIsToldAsSuch) {
+    fans.server.onNext(Reply::silence());
+    options.timeoutSeconds = 1;
+    EXPECT_EQ(failureOf(options), "the CIM server is connected, but does not answer within 1 s");
+}
+
 TEST_F(GetCommandTest, ShowsWhatHasAValue) {
     EXPECT_EQ(showInstances(options, output.plain()), 0);
     EXPECT_EQ(output.text(),

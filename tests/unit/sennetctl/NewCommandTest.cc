@@ -37,6 +37,13 @@ class NewCommandTest : public testing::Test {
                        directory.path("texts")};
 };
 
+TEST_F(NewCommandTest, AServerThatDoesNotAnswerIsToldAsSuch) {
+    fans.server.onNext(support::Reply::silence());
+    options.timeoutSeconds = 1;
+    EXPECT_EQ(failureOf(options), "the CIM server is connected, but does not answer within 1 s");
+    EXPECT_THAT(directory.names(), IsEmpty());
+}
+
 TEST_F(NewCommandTest, WritesScriptAndProperties) {
     EXPECT_EQ(writeNewScript(options, output.plain()), 0);
     EXPECT_EQ(directory.read("coolers.script.inv"),
