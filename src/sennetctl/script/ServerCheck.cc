@@ -1,5 +1,7 @@
 #include "script/ServerCheck.h"
 
+#include <algorithm>
+
 #include "cim/CimText.h"
 #include "report/Text.h"
 #include "script/ColumnCheck.h"
@@ -22,6 +24,23 @@ std::string insteadOf(const Column& column, const AnsweredClass& answered) {
     return stand.empty() ? "" : "; " + stand + " is written";
 }
 
+// The generator keeps no list for a class without instances.
+std::vector<const AnsweredClass*> listsOf(const std::vector<AnsweredClass>& classes) {
+    std::vector<const AnsweredClass*> lists;
+    for (const AnsweredClass& answered : classes) {
+        if (!answered.instances.empty()) {
+            lists.push_back(&answered);
+        }
+    }
+    return lists;
+}
+
+/// "row 2", "rows 2 to 3".
+std::string rowsBetween(std::size_t first, std::size_t last) {
+    return first == last ? "row " + std::to_string(first)
+                         : "rows " + std::to_string(first) + " to " + std::to_string(last);
+}
+
 }  // namespace
 
 void ServerCheck::check(ScriptModel& model) {
@@ -35,6 +54,7 @@ void ServerCheck::check(ScriptModel& model) {
         }
     }
     checkPairing(model, classes);
+    checkCounts(model, classes);
     for (const AnsweredClass& answered : classes) {
         checkColumns(model, answered);
     }
@@ -75,15 +95,10 @@ std::optional<AnsweredClass> ServerCheck::ask(const ScriptModel& model, ScriptSl
     return answered;
 }
 
-// The generator keeps no list for a class without instances, so that those behind it move up.
+// Lists behind that of a class without instances move up.
 void ServerCheck::checkPairing(const ScriptModel& model,
                                const std::vector<AnsweredClass>& classes) {
-    std::vector<const AnsweredClass*> lists;
-    for (const AnsweredClass& answered : classes) {
-        if (!answered.instances.empty()) {
-            lists.push_back(&answered);
-        }
-    }
+    const std::vector<const AnsweredClass*> lists = listsOf(classes);
     for (std::size_t k = 0; k < classes.size() && !lists.empty(); ++k) {
         const AnsweredClass* shown = k < lists.size() ? lists[k] : nullptr;
         if (shown == &classes[k] || (shown == nullptr && classes[k].instances.empty())) {
@@ -92,6 +107,27 @@ void ServerCheck::checkPairing(const ScriptModel& model,
         add(model, classes[k].slot->className, Severity::Error,
             "a class without instances stands before others: the columns of " + nameOf(classes[k]) +
                 (shown == nullptr ? " stay empty" : " show the instances of " + nameOf(*shown)));
+    }
+}
+
+// The cells behind the end of a list are empty, and a reader puts the attribute's default there,
+// which the generator takes from the first row.
+void ServerCheck::checkCounts(const ScriptModel& model, const std::vector<AnsweredClass>& classes) {
+    const std::vector<const AnsweredClass*> lists = listsOf(classes);
+    const auto longest = std::max_element(lists.begin(), lists.end(),
+                                          [](const AnsweredClass* one, const AnsweredClass* two) {
+                                              return one->instances.size() < two->instances.size();
+                                          });
+    for (std::size_t k = 0; k < lists.size(); ++k) {
+        const std::size_t count = lists[k]->instances.size();
+        const std::size_t rows = (*longest)->instances.size();
+        if (count < rows) {
+            add(model, classes[k].slot->className, Severity::Warning,
+                counted(count, "instance") + " of " + nameOf(*lists[k]) + " beside " +
+                    std::to_string(rows) + " of " + nameOf(**longest) + ": in " +
+                    rowsBetween(count + 1, rows) + " readers show the values of row 1 under the " +
+                    "columns of " + nameOf(classes[k]) + " (for CA 0 or nothing)");
+        }
     }
 }
 

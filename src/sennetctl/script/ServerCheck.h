@@ -36,6 +36,7 @@ class ServerCheck {
   private:
     std::optional<AnsweredClass> ask(const ScriptModel& model, ScriptSlot& slot);
     void checkPairing(const ScriptModel& model, const std::vector<AnsweredClass>& classes);
+    void checkCounts(const ScriptModel& model, const std::vector<AnsweredClass>& classes);
     void checkColumns(const ScriptModel& model, const AnsweredClass& answered);
     void add(const ScriptModel& model, const ScriptText& place, Severity severity,
              const std::string& message);

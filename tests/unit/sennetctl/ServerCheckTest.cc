@@ -83,7 +83,7 @@ TEST_F(ServerCheckTest, PropertiesThatTheClassLacks) {
 
 TEST_F(ServerCheckTest, AnEmptyClassLetsTheNextOnesMoveUp) {
     addClass("CIM_None", "");
-    addClass("CIM_Card", instanceXml("CIM_Card", "c", ""));
+    addClass("CIM_Card", instanceXml("CIM_Card", "c", "") + instanceXml("CIM_Card", "d", ""));
     texts.set("CIM_None.DeviceID", "None");
     texts.set("CIM_Card.DeviceID", "Card");
     EXPECT_EQ(check("G[0]=CIM_None\nA[0]=DeviceID\nG[1]=CIM_Card\nA[1]=DeviceID\n"
@@ -100,6 +100,40 @@ TEST_F(ServerCheckTest, AnEmptyClassBehindTheOthersDoesNoHarm) {
     addClass("CIM_None", "");
     texts.set("CIM_None.DeviceID", "Other");
     EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\nG[1]=CIM_None\nA[1]=DeviceID\n"), "");
+}
+
+TEST_F(ServerCheckTest, ClassesOfWhichOneHasFewerInstances) {
+    addClass("CIM_Card", instanceXml("CIM_Card", "c", ""));
+    texts.set("CIM_Card.DeviceID", "Card");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\nG[1]=CIM_Card\nA[1]=DeviceID\n"),
+              "6:6: warning: 1 instance of CIM_Card beside 2 of CIM_Fan: in row 2 readers show the "
+              "values of row 1 under the columns of CIM_Card (for CA 0 or nothing)\n");
+    fans.setFans(fanXml("a", "2", "1") + fanXml("b", "2", "1") + fanXml("c", "2", "1"));
+    EXPECT_EQ(check("G[0]=CIM_Card\nA[0]=DeviceID\nG[1]=CIM_Fan\nA[1]=DeviceID\n"),
+              "4:6: warning: 1 instance of CIM_Card beside 3 of CIM_Fan: in rows 2 to 3 readers "
+              "show the values of row 1 under the columns of CIM_Card (for CA 0 or nothing)\n");
+}
+
+// The columns are those of the class that the list is taken for.
+TEST_F(ServerCheckTest, AListThatMovesUpAndIsShorter) {
+    addClass("CIM_None", "");
+    addClass("CIM_Card", instanceXml("CIM_Card", "c", ""));
+    texts.set("CIM_None.DeviceID", "None");
+    texts.set("CIM_Card.DeviceID", "Card");
+    const std::string told = check(
+        "G[0]=CIM_None\nA[0]=DeviceID\nG[1]=CIM_Card\nA[1]=DeviceID\n"
+        "G[2]=CIM_Fan\nA[2]=DeviceID\n");
+    EXPECT_NE(
+        told.find("4:6: warning: 1 instance of CIM_Card beside 2 of CIM_Fan: in row 2 readers "
+                  "show the values of row 1 under the columns of CIM_None (for CA 0 or nothing)\n"),
+        std::string::npos)
+        << told;
+}
+
+TEST_F(ServerCheckTest, ClassesWithEquallyManyInstances) {
+    addClass("CIM_Card", instanceXml("CIM_Card", "c", "") + instanceXml("CIM_Card", "d", ""));
+    texts.set("CIM_Card.DeviceID", "Card");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\nG[1]=CIM_Card\nA[1]=DeviceID\n"), "");
 }
 
 TEST_F(ServerCheckTest, IntegersBeyond32Bits) {
