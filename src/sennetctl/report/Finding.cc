@@ -60,6 +60,8 @@ const char* remarkOn(ServerPart server) {
     switch (server) {
         case ServerPart::NotAsked:
             return " (no server was asked)";
+        case ServerPart::NotReached:
+            return " (no server was reached)";
         case ServerPart::BrokeDown:
             return " (the server was not asked about all)";
         case ServerPart::NotConcerned:
@@ -73,6 +75,8 @@ const char* nameOf(ServerPart server) {
     switch (server) {
         case ServerPart::NotAsked:
             return "not asked";
+        case ServerPart::NotReached:
+            return "not reached";
         case ServerPart::BrokeDown:
             return "broke down";
         case ServerPart::NotConcerned:
@@ -80,6 +84,11 @@ const char* nameOf(ServerPart server) {
             break;
     }
     return "asked";
+}
+
+/// Whether the findings are half the truth against the will of the caller.
+bool isLost(ServerPart server) {
+    return server == ServerPart::NotReached || server == ServerPart::BrokeDown;
 }
 
 }  // namespace
@@ -115,6 +124,9 @@ int printResult(const CheckResult& result, const Output& output) {
         if (result.server != ServerPart::NotConcerned) {
             document["server"] = nameOf(result.server);
         }
+        if (isLost(result.server)) {
+            document["serverReason"] = result.serverReason;
+        }
         addFailures(result.failures, document);
         printJson(document, output);
     } else if (!result.files.empty() || !result.findings.empty() || result.failures.empty()) {
@@ -127,7 +139,7 @@ int printResult(const CheckResult& result, const Output& output) {
     if (!result.failures.empty()) {
         return kCannotRun;
     }
-    return errors + warnings > 0 ? kFindings : kFine;
+    return errors + warnings > 0 || isLost(result.server) ? kFindings : kFine;
 }
 
 }  // namespace sennetctl

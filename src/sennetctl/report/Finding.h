@@ -26,14 +26,16 @@ struct Finding {
     std::string message;
 };
 
-/// What a CIM server had to do with the findings: NotConcerned where there is nothing to ask it.
-enum class ServerPart { NotConcerned, Asked, NotAsked, BrokeDown };
+/// What a CIM server had to do with the findings: NotConcerned where there is nothing to ask it,
+/// NotAsked where nobody wanted it to be asked.
+enum class ServerPart { NotConcerned, Asked, NotAsked, NotReached, BrokeDown };
 
 /// What a check of several files comes to.
 struct CheckResult {
     std::vector<Finding> findings;
     std::vector<std::string> files;  ///< that were looked at
     ServerPart server = ServerPart::NotConcerned;
+    std::string serverReason;       ///< why it is NotReached or BrokeDown
     std::vector<Failure> failures;  ///< of the files that could not be looked at
     /// Members that only the JSON document has, name and value.
     std::vector<std::pair<std::string, std::string>> basis;
@@ -41,7 +43,8 @@ struct CheckResult {
 
 /// Tells the failures, and prints each finding as "file:line:column: severity: message" and then
 /// how many there are, or all as JSON, and whether a server was asked. Returns the exit status,
-/// which is kCannotRun where something failed.
+/// which is kCannotRun where something failed, and kFindings also where a server should have been
+/// asked and was not asked about all.
 int printResult(const CheckResult& result, const Output& output);
 
 }  // namespace sennetctl

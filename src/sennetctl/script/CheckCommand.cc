@@ -72,6 +72,8 @@ class ScriptChecker {
         result.basis = {{"configuration", options.places.configuration},
                         {"directory", options.places.scriptDirectory},
                         {"resources", options.places.resources}};
+        result.basis.insert(result.basis.end(), options.places.outputs.begin(),
+                            options.places.outputs.end());
     }
 
     /// Unless the options forbid it.
@@ -83,7 +85,7 @@ class ScriptChecker {
             answers = std::make_unique<Answers>(options.timeoutSeconds * 1000);
             result.server = ServerPart::Asked;
         } catch (const CannotRun& failure) {
-            loseServer(failure, "only the scripts themselves are checked");
+            loseServer(ServerPart::NotReached, failure, "only the scripts themselves are checked");
         }
     }
 
@@ -161,14 +163,15 @@ class ScriptChecker {
                         {hasTexts && options.translations, hasTexts}, found)
                 .check(model);
         } catch (const CannotRun& failure) {
-            loseServer(failure,
+            loseServer(ServerPart::BrokeDown, failure,
                        "from " + model.file + " on only the scripts themselves are checked");
-            result.server = ServerPart::BrokeDown;
             answers.reset();
         }
     }
 
-    void loseServer(const CannotRun& failure, const std::string& consequence) {
+    void loseServer(ServerPart how, const CannotRun& failure, const std::string& consequence) {
+        result.server = how;
+        result.serverReason = failure.what();
         troubles.push_back(failure.failure());
         troubles.push_back({{}, 0, 0, consequence});
     }

@@ -22,7 +22,7 @@ struct CheckOptions {
 /// Prints the findings, those about the configuration and the resource properties first. A server
 /// that cannot be reached or does not answer is told on standard error, and then only the scripts
 /// themselves are checked. Returns the exit status, which is kCannotRun where some script was not
-/// read.
+/// read, and kFindings also where the server should have been asked and was lost.
 int checkScripts(const CheckOptions& options, const Output& output);
 
 }  // namespace sennetctl

@@ -11,6 +11,7 @@
 #include "properties/PropertiesEntries.h"
 #include "report/Text.h"
 #include "report/WholeFile.h"
+#include "script/OutputCheck.h"
 #include "script/ScriptText.h"
 #include "utf8/Utf8.h"
 
@@ -217,6 +218,7 @@ void checkConfiguration(const Places& places, std::vector<Finding>& findings) {
     if (const std::optional<std::string> octets =
             octetsOf(places.configuration, "sennet takes its default places", findings)) {
         checkConfigurationText(places.configuration, *octets, findings);
+        checkOutputDirectories(places.configuration, *octets, findings);
     }
 }
 

@@ -96,7 +96,8 @@ class SurroundingsTest(unittest.TestCase):
         self.assertEqual(result.returncode, 1)
         self.assertIn("is connected, but does not answer within 1 s\n", result.stderr)
         document = json.loads(result.stdout)
-        self.assertEqual(document["server"], "not asked")
+        self.assertEqual(document["server"], "not reached")
+        self.assertIn("does not answer within 1 s", document["serverReason"])
         self.assertIn((str(script), 4), [(each["file"], each["line"])
                                          for each in document["findings"]])
 

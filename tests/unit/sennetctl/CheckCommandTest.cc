@@ -64,9 +64,9 @@ TEST_F(CheckCommandTest, AFileWhoseNameIsNotUtf8IsToldBesideTheOthers) {
 TEST_F(CheckCommandTest, WithoutAServerTheScriptsAreChecked) {
     fans.server.stop();
     const std::string file = directory.write("x.script.inv", kGood);
-    EXPECT_EQ(checkScripts(wanted({file}, false, false), output.plain()), 0);
+    EXPECT_EQ(checkScripts(wanted({file}, false, false), output.plain()), 1);
     EXPECT_THAT(output.errors(), HasSubstr("only the scripts themselves are checked\n"));
-    EXPECT_EQ(output.text(), "1 file: 0 errors, 0 warnings (no server was asked)\n");
+    EXPECT_EQ(output.text(), "1 file: 0 errors, 0 warnings (no server was reached)\n");
 }
 
 TEST_F(CheckCommandTest, AServerThatDoesNotAnswerLeavesTheFindingsOfTheScripts) {
@@ -79,7 +79,7 @@ TEST_F(CheckCommandTest, AServerThatDoesNotAnswerLeavesTheFindingsOfTheScripts) 
               "sennetctl: the CIM server is connected, but does not answer within 1 s\n"
               "sennetctl: only the scripts themselves are checked\n");
     EXPECT_THAT(output.text(), HasSubstr(file + ":6:1: warning: "));
-    EXPECT_THAT(output.text(), HasSubstr("1 file: 0 errors, 1 warning (no server was asked)\n"));
+    EXPECT_THAT(output.text(), HasSubstr("1 file: 0 errors, 1 warning (no server was reached)\n"));
 }
 
 // Whoever reads only the status or the JSON has to learn that "no errors" is half the truth.
@@ -87,10 +87,39 @@ TEST_F(CheckCommandTest, JsonSaysWhetherAServerWasAsked) {
     const std::string file = directory.write("x.script.inv", kGood);
     EXPECT_EQ(checkScripts(wanted({file}, false, false), output.json()), 0);
     EXPECT_EQ(output.document()["server"], "asked");
+    CapturedOutput offline;
+    EXPECT_EQ(checkScripts(wanted({file}, true, false), offline.json()), 0);
+    EXPECT_EQ(offline.document()["server"], "not asked");
+    EXPECT_EQ(offline.document().count("serverReason"), 0U);
     fans.server.stop();
     CapturedOutput later;
-    EXPECT_EQ(checkScripts(wanted({file}, false, false), later.json()), 0);
-    EXPECT_EQ(later.document()["server"], "not asked");
+    EXPECT_EQ(checkScripts(wanted({file}, false, false), later.json()), 1);
+    EXPECT_EQ(later.document()["server"], "not reached");
+    EXPECT_THAT(later.errors(),
+                HasSubstr(later.document()["serverReason"].get<std::string>() + "\n"));
+}
+
+TEST_F(CheckCommandTest, AServerThatAnswersNonsenseIsNone) {
+    const std::string file = directory.write("x.script.inv", kGood);
+    const std::string page = "<html>no</html>";
+    for (const std::string& answer :
+         {"HTTP/1.1 200 OK\r\nContent-Type: text/html\r\nContent-Length: 15\r\n\r\n" + page,
+          std::string("HTTP/1.1 401 Unauthorized\r\nContent-Length: 0\r\n\r\n")}) {
+        fans.server.onNext(support::Reply::raw(answer));
+        CapturedOutput told;
+        EXPECT_EQ(checkScripts(wanted({file}), told.json()), 1) << answer;
+        EXPECT_EQ(told.document()["server"], "not reached") << answer;
+        EXPECT_EQ(told.document()["findings"].size(), 0U) << answer;
+    }
+}
+
+TEST_F(CheckCommandTest, AChildThatDiesIsNoServer) {
+    const support::ScopedEnvironment noPlace("CIM_LOCAL_SOCKET");
+    const support::ScopedEnvironment embedded("CIM_EMBEDDED");
+    const support::ScopedEnvironment child("CIM_COMMAND", "/bin/false");
+    const std::string file = directory.write("x.script.inv", kGood);
+    EXPECT_EQ(checkScripts(wanted({file}), output.plain()), 1);
+    EXPECT_EQ(output.text(), "1 file: 0 errors, 0 warnings (no server was reached)\n");
 }
 
 TEST_F(CheckCommandTest, AServerThatBreaksDownLeavesTheFindingsOfTheScripts) {
@@ -102,6 +131,14 @@ TEST_F(CheckCommandTest, AServerThatBreaksDownLeavesTheFindingsOfTheScripts) {
     EXPECT_THAT(output.text(), HasSubstr(two + ":6:1: warning"));
     EXPECT_THAT(output.text(), HasSubstr("3 warnings (the server was not asked about all)\n"));
     EXPECT_THAT(output.errors(), HasSubstr("from " + one + " on only the scripts"));
+}
+
+TEST_F(CheckCommandTest, AServerThatBreaksDownIsReasonEnough) {
+    fans.server.onGetClass("CIM_Fan", support::Reply::closeAtOnce());
+    const std::string file = directory.write("x.script.inv", kGood);
+    EXPECT_EQ(checkScripts(wanted({file}), output.json()), 1);
+    EXPECT_EQ(output.document()["server"], "broke down");
+    EXPECT_EQ(output.document()["warnings"], 0);
 }
 
 // The generator looks names up under the class as the server writes it.
@@ -216,17 +253,20 @@ TEST_F(CheckCommandTest, AConfigurationThatIsNamedAndNotThere) {
 }
 
 TEST_F(CheckCommandTest, VerboselyThePlacesAreTold) {
+    places.outputs = {{"mif.directory.SMS", "/srv/sms"}, {"sql.directory.QVE", "/srv/sql"}};
     CheckOptions options = wanted({directory.write("x.script.inv", kGood)}, true);
     options.verbose = true;
     EXPECT_EQ(checkScripts(options, output.plain()), 0);
     EXPECT_EQ(output.text(), "configuration: " + places.configuration + "\ndirectory: " +
                                  places.scriptDirectory + "\nresources: " + places.resources +
-                                 "\n1 file: 0 errors, 0 warnings (no server was asked)\n");
+                                 "\nmif.directory.SMS: /srv/sms\nsql.directory.QVE: /srv/sql\n"
+                                 "1 file: 0 errors, 0 warnings (no server was asked)\n");
     CapturedOutput document;
     EXPECT_EQ(checkScripts(options, document.json()), 0);
     EXPECT_EQ(document.document()["configuration"], places.configuration);
     EXPECT_EQ(document.document()["directory"], places.scriptDirectory);
     EXPECT_EQ(document.document()["resources"], places.resources);
+    EXPECT_EQ(document.document()["mif.directory.SMS"], "/srv/sms");
 }
 
 TEST_F(CheckCommandTest, ADirectoryThatCannotBeListed) {
