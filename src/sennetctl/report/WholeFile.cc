@@ -32,7 +32,8 @@ std::string readWholeFile(const std::string& path, std::size_t limitOctets) {
     while (file.read(piece, sizeof piece) || file.gcount() > 0) {
         octets.append(piece, static_cast<std::size_t>(file.gcount()));
         if (octets.size() > limitOctets) {
-            throw CannotRun(path, "is larger than " + std::to_string(limitOctets >> 20) + " MiB");
+            throw CannotRun(path, "is larger than " + std::to_string(limitOctets >> 20) +
+                                      " MiB, which is the most that sennetctl reads of it");
         }
     }
     if (file.bad()) {

@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <filesystem>
 #include <memory>
+#include <optional>
 #include <ostream>
 #include <system_error>
 #include <tuple>
@@ -16,7 +17,9 @@
 #include "report/Progress.h"
 #include "report/Text.h"
 #include "report/WholeFile.h"
+#include "script/KeySpelling.h"
 #include "script/MissingValues.h"
+#include "script/PassedOver.h"
 #include "script/PropertiesLint.h"
 #include "script/ScriptLint.h"
 #include "script/ScriptReader.h"
@@ -65,7 +68,9 @@ class ScriptChecker {
         std::vector<Finding> found;
         checkConfiguration(options.places, found);
         takeOver(found);
-        hasTexts = checkResources(options.places, found);
+        if (const std::optional<std::string> octets = checkResources(options.places, found)) {
+            keys.emplace(options.places.resources, *octets);
+        }
         takeOver(found);
         texts.load();
         result.server = ServerPart::NotAsked;
@@ -93,6 +98,7 @@ class ScriptChecker {
     std::vector<std::string> listScripts() {
         const std::string& directory = options.places.scriptDirectory;
         std::vector<std::string> scripts = scriptsIn(directory);
+        checkPassedOver(directory, result.findings);
         std::error_code error;
         const std::filesystem::directory_iterator listed(directory, error);
         if (error == std::errc::no_such_file_or_directory) {
@@ -116,6 +122,7 @@ class ScriptChecker {
         result.files.push_back(file);
         std::vector<Finding> found = findingsIn(file, octets);
         takeOver(found);
+        takeOver(foundInKeys);
     }
 
     /// Returns the exit status, which is kCannotRun where some script was not read.
@@ -151,7 +158,7 @@ class ScriptChecker {
         if (answers && !model.givenUp) {
             askServer(model, found);
         }
-        if (options.translations && hasTexts) {
+        if (options.translations && keys) {
             checkTranslations(model, texts.getProperties(), found);
         }
         return found;
@@ -160,8 +167,11 @@ class ScriptChecker {
     void askServer(ScriptModel& model, std::vector<Finding>& found) {
         try {
             ServerCheck(answers->server, answers->missing, texts.getProperties(),
-                        {hasTexts && options.translations, hasTexts}, found)
+                        {keys && options.translations, keys.has_value()}, found)
                 .check(model);
+            if (keys) {
+                keys->check(model, foundInKeys);
+            }
         } catch (const CannotRun& failure) {
             loseServer(ServerPart::BrokeDown, failure,
                        "from " + model.file + " on only the scripts themselves are checked");
@@ -178,7 +188,8 @@ class ScriptChecker {
 
     const CheckOptions& options;
     Velm::PropertiesFile texts;
-    bool hasTexts = false;             // without them each name would be told
+    std::optional<KeySpelling> keys;  // of the texts; without them each name would be told
+    std::vector<Finding> foundInKeys;
     std::unique_ptr<Answers> answers;  // none when there is no server
     TitleCheck titles;
     CheckResult result;

@@ -222,13 +222,13 @@ void checkConfiguration(const Places& places, std::vector<Finding>& findings) {
     }
 }
 
-bool checkResources(const Places& places, std::vector<Finding>& findings) {
-    const std::optional<std::string> octets = octetsOf(
+std::optional<std::string> checkResources(const Places& places, std::vector<Finding>& findings) {
+    std::optional<std::string> octets = octetsOf(
         places.resources, "sennet shows titles and properties as the scripts have them", findings);
     if (octets) {
         checkResourcesText(places.resources, *octets, findings);
     }
-    return octets.has_value();
+    return octets;
 }
 
 void checkConfigurationText(const std::string& file, std::string_view octets,

@@ -2,6 +2,7 @@
 
 // Checks the key/value files of sennet: velm.properties and sennet.properties.
 
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -16,8 +17,8 @@ namespace sennetctl {
 void checkConfiguration(const Places& places, std::vector<Finding>& findings);
 
 /// Appends what is wrong with the resource properties, first of all that they cannot be read;
-/// returns whether they can.
-bool checkResources(const Places& places, std::vector<Finding>& findings);
+/// returns their octets where they can.
+std::optional<std::string> checkResources(const Places& places, std::vector<Finding>& findings);
 
 /// The same for a file's octets.
 void checkConfigurationText(const std::string& file, std::string_view octets,

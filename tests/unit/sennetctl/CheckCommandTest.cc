@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <filesystem>
+
 #include "CapturedOutput.h"
 #include "FanServer.h"
 #include "report/WholeFile.h"
@@ -147,6 +149,32 @@ TEST_F(CheckCommandTest, TranslationsAreThoseOfTheServersSpelling) {
         "x.script.inv", "[DEFAULT]\ntitle=Fans\n[CIM]\nG[0]=cim_fan\nA[0]=DeviceID,State\n");
     EXPECT_EQ(checkScripts(wanted({file}, false, true), output.plain()), 1);
     EXPECT_THAT(output.text(), HasSubstr("the resource properties have no CIM_Fan.State\n"));
+}
+
+TEST_F(CheckCommandTest, AKeyInOtherLettersIsToldOnceForAllScripts) {
+    directory.write("texts", "#\ncim_fan.DeviceID=Fan\n");
+    const std::string one = directory.write("one.script.inv", kGood);
+    const std::string two = directory.write("two.script.inv",
+                                            "[DEFAULT]\ntitle=Two\n[CIM]\nG[0]=CIM_Fan\n"
+                                            "A[0]=DeviceID\n");
+    EXPECT_EQ(checkScripts(wanted({one, two}), output.plain()), 1);
+    EXPECT_EQ(output.text(), one + ":4:6: note: CIM_Fan: 2 instances\n" + places.resources +
+                                 ":2:1: warning: line without effect: sennet looks for "
+                                 "CIM_Fan.DeviceID\n" +
+                                 two +
+                                 ":4:6: note: CIM_Fan: 2 instances\n2 files: 0 errors, 1 "
+                                 "warning\n");
+}
+
+TEST_F(CheckCommandTest, WhatIsCalledAsAScriptAndIsNone) {
+    directory.write("x.script.inv", kGood);
+    std::filesystem::create_symlink("gone", directory.path("gone.script.inv"));
+    EXPECT_EQ(checkScripts(wanted({}, true), output.plain()), 1);
+    EXPECT_EQ(output.text(), directory.path("") +
+                                 "/gone.script.inv: warning: a link that leads "
+                                 "nowhere, which sennet passes over: files of an "
+                                 "earlier run stay\n1 file: 0 errors, 1 warning "
+                                 "(no server was asked)\n");
 }
 
 TEST_F(CheckCommandTest, AServerIsNotAskedForAScriptThatIsGivenUp) {

@@ -123,7 +123,7 @@ TEST(PropertiesLintTest, FilesThatCannotBeRead) {
     EXPECT_EQ(told(findings), "") << "no configuration need be";
     places.isConfigured = true;
     checkConfiguration(places, findings);
-    EXPECT_FALSE(checkResources(places, findings));
+    EXPECT_EQ(checkResources(places, findings), std::nullopt);
     EXPECT_EQ(told(findings),
               "0:0: error: there is no such file: sennet takes its default places\n"
               "0:0: error: is no regular file: sennet shows titles and properties as the scripts "
@@ -136,7 +136,7 @@ TEST(PropertiesLintTest, AFileThatIsRead) {
     const support::TempDirectory directory;
     const std::string file = directory.write("r", "A.B.Size=x\n");
     std::vector<Finding> findings;
-    EXPECT_TRUE(checkResources({"", false, "", file}, findings));
+    EXPECT_EQ(checkResources({"", false, "", file}, findings), "A.B.Size=x\n");
     ASSERT_EQ(findings.size(), 1U);
     EXPECT_EQ(findings[0].file, file);
 }

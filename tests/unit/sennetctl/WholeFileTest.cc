@@ -47,7 +47,8 @@ TEST(WholeFileTest, TellsWhyAFileIsNotRead) {
     ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
     EXPECT_EQ(failureOf(pipe), pipe + ": is no regular file");
     const std::string large = directory.write("large", std::string((1 << 20) + 1, 'x'));
-    EXPECT_EQ(failureOf(large, 1 << 20), large + ": is larger than 1 MiB");
+    EXPECT_EQ(failureOf(large, 1 << 20),
+              large + ": is larger than 1 MiB, which is the most that sennetctl reads of it");
 }
 
 TEST(WholeFileTest, WritesEveryOctet) {
