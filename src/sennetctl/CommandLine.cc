@@ -73,7 +73,9 @@ void addGet(CLI::App& app, Choice& choice) {
                                    "  sennetctl get CIM_DiskDrive -p DeviceID,MaxMediaSize\n"
                                    "  sennetctl get CIM_Fan -n root/cimv2 --json");
     const auto options = std::make_shared<GetOptions>();
-    command->add_option("CLASS", options->className, "name of the class")->required();
+    command->add_option("CLASS", options->className, "name of the class")
+        ->option_text(" ")
+        ->required();
     command
         ->add_option("-n,--namespace", options->nameSpace,
                      "namespace of the class, by default root/cimv2")
@@ -102,7 +104,7 @@ void addCheck(CLI::App& app, Choice& choice) {
     command
         ->add_option("SCRIPT", options->scripts,
                      "inventory scripts; by default all that sennet reads")
-        ->option_text("SCRIPT...");
+        ->option_text("...");
     command->add_flag("--offline", options->offline, "ask no CIM server");
     addTimeout(*command, options->timeoutSeconds);
     command->add_flag("--translations", options->translations,
@@ -122,7 +124,7 @@ void addNew(CLI::App& app, Choice& choice) {
         "--title Orders");
     const auto options = std::make_shared<NewOptions>();
     command->add_option("SCRIPT", options->script, "the file, whose name ends in .script.inv")
-        ->option_text("SCRIPT")
+        ->option_text(" ")
         ->required();
     command->add_option("--class", options->classes, "a class; at most ten of them")
         ->option_text("CLASS")
@@ -167,7 +169,7 @@ void addMifCheck(CLI::App& mif, Choice& choice) {
         ->add_option("FILE", options->files,
                      "the files in the order in which they are imported; a later one is compared "
                      "with the classes of the earlier ones")
-        ->option_text("FILE...")
+        ->option_text("...")
         ->required();
     command->callback([&choice, options, command] {
         options->lint.profile = parseMifProfile(options->profile).value_or(MifProfile::Dmi);
@@ -184,13 +186,13 @@ void addMifShow(CLI::App& mif, Choice& choice) {
     const auto file = std::make_shared<std::string>();
     CLI::App* show = addCommand(mif, choice, "show", "Show the tables of a MIF file.",
                                 "  sennetctl mif show out/processor.mif");
-    show->add_option("FILE", *file, "the file")->option_text("FILE")->required();
+    show->add_option("FILE", *file, "the file")->option_text(" ")->required();
     show->callback([&choice, file] {
         choice.command = [file](const Output& output) { return showMifFile(*file, output); };
     });
     CLI::App* json = addCommand(mif, choice, "json", "Print the tables of a MIF file as JSON.",
                                 "  sennetctl mif json out/processor.mif | jq '.tables[].rows'");
-    json->add_option("FILE", *file, "the file")->option_text("FILE")->required();
+    json->add_option("FILE", *file, "the file")->option_text(" ")->required();
     json->callback([&choice, file] {
         choice.json = true;
         choice.command = [file](const Output& output) { return showMifFile(*file, output); };
@@ -202,8 +204,8 @@ void addMifDiff(CLI::App& mif, Choice& choice) {
     CLI::App* command =
         addCommand(mif, choice, "diff", "Tell what changed in the inventory.",
                    "  sennetctl mif diff yesterday/diskdrive.mif out/diskdrive.mif");
-    command->add_option("OLD", files->first, "the earlier file")->option_text("OLD")->required();
-    command->add_option("NEW", files->second, "the later file")->option_text("NEW")->required();
+    command->add_option("OLD", files->first, "the earlier file")->option_text(" ")->required();
+    command->add_option("NEW", files->second, "the later file")->option_text(" ")->required();
     command->callback([&choice, files] {
         choice.command = [files](const Output& output) {
             return compareMifFiles(files->first, files->second, output);
@@ -218,7 +220,7 @@ void addMifHtml(CLI::App& mif, Choice& choice) {
                                    "--force");
     const auto options = std::make_shared<HtmlOptions>();
     command->add_option("FILE", options->files, "the files, in the order of the page")
-        ->option_text("FILE...")
+        ->option_text("...")
         ->required();
     command
         ->add_option("-o,--output", options->directory,
@@ -268,11 +270,15 @@ std::string parsingFailure(const CLI::ParseError& error, const CLI::App& app) {
         return error.what();
     }
     const std::vector<std::string> words = app.remaining(true);
-    const auto wrong = std::find_if(words.begin(), words.end(), [](const std::string& word) {
+    const std::string expected = ": expected " + expectedCommands(app);
+    if (words.empty()) {
+        return "a command is missing" + expected;
+    }
+    const auto command = std::find_if(words.begin(), words.end(), [](const std::string& word) {
         return word.rfind('-', 0) != 0;
     });
-    return (wrong == words.end() ? "a command is missing" : "'" + *wrong + "' is no command") +
-           ": expected " + expectedCommands(app);
+    return command == words.end() ? "'" + words.front() + "' is no option here" + expected
+                                  : "'" + *command + "' is no command" + expected;
 }
 
 /// What the command line asks for, wrong as it may be.

@@ -4,7 +4,10 @@
 #include <fmt/format.h>
 #include <pwd.h>
 
+#include <cstdlib>
+#include <filesystem>
 #include <ostream>
+#include <system_error>
 
 #include "cim/LocalServer.h"
 #include "report/Json.h"
@@ -22,8 +25,15 @@ std::string userName(unsigned user) {
     return entry == nullptr ? std::to_string(user) : entry->pw_name;
 }
 
+bool isPlaceNamed() {
+    const char* named = ::secure_getenv("CIM_LOCAL_SOCKET");
+    return named != nullptr && *named != '\0';
+}
+
 void printPlaces(const Pegasus::LocalServerSearch& search, const Output& output) {
-    output.out << "Places in the order in which they are tried:\n\n";
+    output.out << (isPlaceNamed()
+                       ? "The only place that is tried, which CIM_LOCAL_SOCKET names:\n\n"
+                       : "Places in the order in which they are tried:\n\n");
     TextTable table({"", "PLACE", "OWNER", "RESULT"});
     for (const Pegasus::LocalServerPlace& place : search.places) {
         table.addRow({place.chosen ? "*" : "", place.path,
@@ -88,12 +98,27 @@ void printAnswers(const ServerAnswers& answers, bool listClasses, const Output& 
     }
 }
 
+/// What to do about a server that was started and did not serve; nobody has seen its messages.
+/// Empty for other servers.
+std::string adviceOn(const Pegasus::LocalServerSearch& search) {
+    std::error_code error;
+    const bool isStarted = !search.places.empty() && search.places.back().chosen &&
+                           std::filesystem::is_regular_file(search.places.back().path, error);
+    return isStarted ? "see what it says when you start it: " + search.places.back().path +
+                           " --socket ./trial.socket"
+                     : std::string();
+}
+
 void printFailure(const Pegasus::LocalServerSearch& search, const ServerAnswers& answers,
                   const Output& output) {
     if (!search.failure.empty()) {
         output.out << "No server is reached: " << printable(search.failure) << '\n';
     } else if (!answers.failure.empty()) {
         output.out << "No useful answer: " << printable(answers.failure) << '\n';
+        const std::string advice = adviceOn(search);
+        if (!advice.empty()) {
+            output.out << "The server was started for this command; " << printable(advice) << '\n';
+        }
     }
 }
 

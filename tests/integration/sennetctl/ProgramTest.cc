@@ -80,6 +80,27 @@ TEST_F(ProgramTest, AWrongCommandIsNamed) {
                 HasSubstr("'shwo' is no command: expected check, show, json, diff or html\n"));
     EXPECT_THAT(runWithoutServer({"--json", "chek"}).err, HasSubstr("'chek' is no command"));
     EXPECT_THAT(runWithoutServer({}).err, HasSubstr("a command is missing: expected check, "));
+    EXPECT_THAT(runWithoutServer({"--wrong"}).err, HasSubstr("'--wrong' is no option here: "));
+}
+
+TEST_F(ProgramTest, HelpNamesEachArgumentOnce) {
+    EXPECT_THAT(runWithoutServer({"check", "--help"}).out, HasSubstr("\n  SCRIPT ...  "));
+    EXPECT_THAT(runWithoutServer({"get", "--help"}).out, HasSubstr("\n  CLASS  "));
+    EXPECT_THAT(runWithoutServer({"mif", "diff", "--help"}).out, HasSubstr("\n  OLD  "));
+}
+
+TEST_F(ProgramTest, AServerThatEndsAtItsStartIsToldWithWhatToDo) {
+    const ProgramResult result =
+        support::runProgram(TEST_BIN_DIR "/sennetctl", {"server"}, {{"CIM_COMMAND", "/bin/false"}});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.out, HasSubstr("\nNo useful answer: the CIM server: "));
+    EXPECT_THAT(result.out, HasSubstr("\nThe server was started for this command; see what it says "
+                                      "when you start it: /bin/false --socket ./trial.socket\n"));
+}
+
+TEST_F(ProgramTest, APlaceThatIsNamedIsToldToBeTheOnlyOne) {
+    EXPECT_THAT(runWithoutServer({"server"}).out,
+                HasSubstr("The only place that is tried, which CIM_LOCAL_SOCKET names:\n"));
 }
 
 TEST_F(ProgramTest, ASizeThatTheProfileHasNotIsRefused) {
