@@ -14,8 +14,8 @@ using namespace Pegasus;
 namespace {
 
 /// What the resource properties give; null for nothing.
-const char* givenSize(const Column& column, const AnsweredClass& answered,
-                      const Velm::Properties& texts) {
+const char* sizeText(const Column& column, const AnsweredClass& answered,
+                     const Velm::Properties& texts) {
     const std::string key =
         textOf(answered.definition.getClassName()) + "." + textOf(column.name) + ".Size";
     return texts.getPropertyValue(key.c_str());
@@ -53,10 +53,17 @@ bool isEmpty(const Column& column, const AnsweredClass& answered) {
     return true;
 }
 
+std::size_t givenSize(const Column& column, const AnsweredClass& answered,
+                      const Velm::Properties& texts) {
+    const char* size = sizeText(column, answered, texts);
+    return size == nullptr ? 0
+                           : static_cast<std::size_t>(std::max(std::strtol(size, nullptr, 10), 0L));
+}
+
 std::size_t declaredSize(const Column& column, const AnsweredClass& answered,
                          const Velm::Properties& texts) {
-    if (const char* size = givenSize(column, answered, texts)) {
-        return static_cast<std::size_t>(std::max(std::strtol(size, nullptr, 10), 0L));
+    if (sizeText(column, answered, texts) != nullptr) {
+        return givenSize(column, answered, texts);
     }
     // For a number the class means the number, not its name.
     if (!hasQualifier(column, "MaxLen") || CimConverter::isInteger(column.declared->getType())) {
@@ -69,7 +76,7 @@ std::size_t declaredSize(const Column& column, const AnsweredClass& answered,
 }
 
 bool lacksSize(const Column& column, const AnsweredClass& answered, const Velm::Properties& texts) {
-    if (!column.declared || column.declared->isArray() || givenSize(column, answered, texts)) {
+    if (!column.declared || column.declared->isArray() || sizeText(column, answered, texts)) {
         return false;
     }
     const CIMType type = column.declared->getType();

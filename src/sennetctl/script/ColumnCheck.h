@@ -26,6 +26,10 @@ bool hasQualifier(const Column& column, const char* name);
 
 bool isEmpty(const Column& column, const AnsweredClass& answered);
 
+/// The width that the resource properties give; 0 for none and for what is no number.
+std::size_t givenSize(const Column& column, const AnsweredClass& answered,
+                      const Velm::Properties& texts);
+
 /// The width that the resource properties give, else the class, in characters; 0 for none and for
 /// what is no number.
 std::size_t declaredSize(const Column& column, const AnsweredClass& answered,

@@ -84,6 +84,7 @@ class NameChecker {
                 tellRepeated(column, "QVE", name, used);
             }
             tellOtherCase(columns, column);
+            tellNoSqlName(column, textOf(name));
         }
     }
 
@@ -142,6 +143,16 @@ class NameChecker {
                                       " differ in case only: for QVE the table has one twice");
                 return;
             }
+        }
+    }
+
+    void tellNoSqlName(const NamedColumn& column, const std::string& name) {
+        for (const NameFault& fault : sqlNameFaults(name)) {
+            add(column.place, "the name " + textOf(column.name) + fault.message, fault.severity);
+        }
+        if (!name.empty() && name[0] >= '0' && name[0] <= '9') {
+            add(column.place, "the name " + textOf(column.name) +
+                                  " begins with a digit: for QVE databases refuse the table");
         }
     }
 

@@ -47,6 +47,14 @@ void addEscapes(const std::string& text, std::vector<NameFault>& faults) {
     }
 }
 
+/// Besides those that all databases take in a name, and those of which something else is told.
+bool isOddInSql(char c) {
+    const bool isNamed = (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') ||
+                         (c >= '0' && c <= '9') || c == '_' || c == ' ';
+    return c > 0x20 && c < 0x7F && !isNamed &&
+           std::string_view("\"\\$`").find(c) == std::string_view::npos;
+}
+
 bool isReserved(std::string_view name) {
     return sameIgnoringCase(name, "Identification") || sameIgnoringCase(name, "Architecture");
 }
@@ -99,6 +107,24 @@ std::vector<NameFault> classFaults(const std::string& title) {
             break;
         }
         bar = next;
+    }
+    return faults;
+}
+
+std::vector<NameFault> shellTextFaults(const std::string& text) {
+    if (text.find_first_of("$`") == std::string::npos) {
+        return {};
+    }
+    return {{Severity::Error,
+             " has a '$' or a backquote: the shell replaces it in QVE's query script, or runs it"}};
+}
+
+std::vector<NameFault> sqlNameFaults(const std::string& name) {
+    std::vector<NameFault> faults = shellTextFaults(name);
+    if (std::any_of(name.begin(), name.end(), isOddInSql)) {
+        faults.push_back({Severity::Warning,
+                          " has characters besides letters, digits and blanks: databases or shells "
+                          "refuse it in QVE's scripts, where it has no quotes"});
     }
     return faults;
 }

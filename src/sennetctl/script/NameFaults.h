@@ -25,4 +25,10 @@ std::vector<NameFault> groupNameFaults(const std::string& name);
 /// Of a script's own title, as a part of a MIF class. Its literal is not looked at.
 std::vector<NameFault> classFaults(const std::string& title);
 
+/// Of a text between double quotes in QVE's query script.
+std::vector<NameFault> shellTextFaults(const std::string& text);
+
+/// Of a part of a name in QVE's scripts, which has no quotes there.
+std::vector<NameFault> sqlNameFaults(const std::string& name);
+
 }  // namespace sennetctl

@@ -1,6 +1,8 @@
 #include "script/ValueCheck.h"
 
 #include <algorithm>
+#include <optional>
+#include <utility>
 
 #include "SennetConverter/framework/PropertyLookup.h"
 #include "SennetConverter/mif/SennetConverter.h"
@@ -16,6 +18,7 @@ namespace {
 
 constexpr std::size_t kLongestText = 255;
 constexpr std::size_t kLongestOther = 32;
+constexpr std::size_t kLongestDate = 8;  // for QVE
 
 /// What the generator keeps to itself.
 struct Rules : SennetConverter {
@@ -144,31 +147,63 @@ class WrittenColumn {
 struct Losses {
     std::size_t cut = 0;
     std::size_t longerThanColumn = 0;
+    std::size_t longerThanSqlColumn = 0;
     std::size_t blanked = 0;
+    std::size_t quoted = 0;
+    std::size_t lineEnds = 0;
     std::size_t wide = 0;
     std::size_t noDates = 0;
     std::size_t missing = 0;
     std::size_t present = 0;
 };
 
-void countDate(const ResolvedProperty& shown, Losses& losses) {
-    const String text = read<CIMDateTime>(shown.value).toString();
-    losses.noDates += Rules::isCalendarDateTime(text) ? 0 : 1;
+/// How wide a column is that shows the values; 0 for no limit.
+struct Widths {
+    std::size_t everywhere = 0;
+    std::size_t inSql = 0;  // where only QVE's schema scripts take the size
+};
+
+Widths widthsOf(const Column& column, const AnsweredClass& answered, CIMType type,
+                const Velm::Properties& texts) {
+    const bool isArray = column.declared && column.declared->isArray();
+    if (isArray || type == CIMTYPE_DATETIME) {
+        return {0, givenSize(column, answered, texts)};
+    }
+    return {declaredSize(column, answered, texts), 0};
 }
 
-void countText(const String& text, std::size_t limit, std::size_t width, Losses& losses) {
-    const std::size_t written = std::min<std::size_t>(text.size(), limit);
-    losses.cut += text.size() > limit ? 1 : 0;
-    losses.longerThanColumn += width > 0 && written > width ? 1 : 0;
-    for (std::size_t i = 0; i < written; ++i) {
-        if (becomesBlank(text[static_cast<Uint32>(i)])) {
-            ++losses.blanked;
-            return;
-        }
+/// Month/day/year, in which months and days have no leading zero.
+std::size_t lengthForQve(const String& date) {
+    return kLongestDate - (Uint16(date[4]) == '0' ? 1 : 0) - (Uint16(date[6]) == '0' ? 1 : 0);
+}
+
+void countDate(const ResolvedProperty& shown, std::size_t width, Losses& losses) {
+    const String text = read<CIMDateTime>(shown.value).toString();
+    if (!Rules::isCalendarDateTime(text)) {
+        ++losses.noDates;
+    } else if (width > 0 && lengthForQve(text) > width) {
+        ++losses.longerThanSqlColumn;
     }
 }
 
-Losses countLosses(WrittenColumn& values, std::size_t width) {
+template <typename Is>
+bool hasAny(const String& text, std::size_t written, Is is) {
+    const Char16* begin = text.getChar16Data();
+    return std::any_of(begin, begin + written, [&](Char16 c) { return is(Uint16(c)); });
+}
+
+void countText(const String& text, std::size_t limit, const Widths& widths, Losses& losses) {
+    const std::size_t written = std::min<std::size_t>(text.size(), limit);
+    losses.cut += text.size() > limit ? 1 : 0;
+    losses.longerThanColumn += widths.everywhere > 0 && written > widths.everywhere ? 1 : 0;
+    losses.longerThanSqlColumn += widths.inSql > 0 && written > widths.inSql ? 1 : 0;
+    losses.blanked += hasAny(text, written, becomesBlank) ? 1 : 0;
+    losses.quoted += hasAny(text, written, [](Uint16 c) { return c == '"'; }) ? 1 : 0;
+    losses.lineEnds +=
+        hasAny(text, written, [](Uint16 c) { return c == '\r' || c == '\n'; }) ? 1 : 0;
+}
+
+Losses countLosses(WrittenColumn& values, const Widths& widths) {
     Losses losses;
     values.forEach([&](const ResolvedProperty& shown) {
         if (shown.value.isNull()) {
@@ -177,14 +212,49 @@ Losses countLosses(WrittenColumn& values, std::size_t width) {
         }
         ++losses.present;
         if (shown.type == CIMTYPE_DATETIME && !shown.value.isArray()) {
-            countDate(shown, losses);
+            countDate(shown, widths.inSql, losses);
             return;
         }
         losses.wide += values.survivesWriting(shown) ? 0 : 1;
-        countText(values.textOf(shown), WrittenColumn::limitOf(shown),
-                  shown.value.isArray() ? 0 : width, losses);
+        countText(values.textOf(shown), WrittenColumn::limitOf(shown), widths, losses);
     });
     return losses;
+}
+
+/// Characters that any value of the type has room in; 0 where the type does not tell.
+std::size_t roomFor(CIMType type) {
+    switch (type) {
+        case CIMTYPE_UINT8:
+            return 3;
+        case CIMTYPE_SINT8:
+            return 4;
+        case CIMTYPE_UINT16:
+            return 5;
+        case CIMTYPE_SINT16:
+            return 6;
+        case CIMTYPE_UINT32:
+        case CIMTYPE_UINT64:
+            return 10;
+        case CIMTYPE_SINT32:
+        case CIMTYPE_SINT64:
+            return 11;
+        case CIMTYPE_DATETIME:
+            return kLongestDate;
+        default:
+            return 0;
+    }
+}
+
+/// What is told of a size that is enough for the values, but not for others of the type.
+std::optional<ValueRemark> remarkOnSize(const Column& column, CIMType type, std::size_t size) {
+    if (size == 0 || size >= roomFor(type) || hasQualifier(column, "Values") ||
+        (column.declared && column.declared->isArray())) {
+        return std::nullopt;
+    }
+    return ValueRemark{Severity::Note, "the size " + std::to_string(size) + " of the column " +
+                                           textOf(column.name) + " is less than the " +
+                                           std::to_string(roomFor(type)) +
+                                           " characters that its type may need"};
 }
 
 std::string standInFor(CIMType type, bool isArray) {
@@ -202,8 +272,8 @@ std::string standInFor(CIMType type, bool isArray) {
 std::vector<ValueRemark> remarksOn(const Column& column, const AnsweredClass& answered,
                                    const Velm::Properties& texts) {
     WrittenColumn values(column, answered);
-    const std::size_t width = declaredSize(column, answered, texts);
-    const Losses losses = countLosses(values, width);
+    const Widths widths = widthsOf(column, answered, values.type(), texts);
+    const Losses losses = countLosses(values, widths);
     const std::string standIn = standInFor(column, answered);
     std::vector<ValueRemark> remarks;
     const auto add = [&](std::size_t count, const std::string& what,
@@ -214,12 +284,24 @@ std::vector<ValueRemark> remarksOn(const Column& column, const AnsweredClass& an
         }
     };
     add(losses.cut, " cut, for texts end at 255 characters, and other values at 32");
-    add(losses.longerThanColumn, " longer than the column of " + std::to_string(width));
+    add(losses.longerThanColumn, " longer than the column of " + std::to_string(widths.everywhere));
+    add(losses.longerThanSqlColumn,
+        " longer than the column of " + std::to_string(widths.inSql) + " in QVE's schema scripts");
     add(losses.blanked, " with letters beyond ASCII or control characters: each becomes a blank");
+    add(losses.quoted,
+        " with a double quote: old versions of SMS refuse the file, and for QVE it becomes '");
+    add(losses.lineEnds,
+        " with a line end, which is written as it is: readers that keep to the standard refuse it",
+        Severity::Note);
     add(losses.wide, " beyond 32 bits with sign: another number is written");
     add(losses.noDates, " no date from 1900 to 2099: " + standIn + " is written");
     if (losses.present > 0 && !standIn.empty()) {
         add(losses.missing, " missing: " + standIn + " is written", Severity::Note);
+    }
+    if (losses.longerThanColumn + losses.longerThanSqlColumn == 0) {
+        if (auto remark = remarkOnSize(column, values.type(), givenSize(column, answered, texts))) {
+            remarks.push_back(*std::move(remark));
+        }
     }
     return remarks;
 }

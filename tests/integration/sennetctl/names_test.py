@@ -86,21 +86,39 @@ class Outcome:
 
     def refused_schemas(self):
         """The dialects whose table a database refuses for a repeated name."""
-        return {dialect for dialect in DIALECTS if not self.makes_a_table(dialect)}
+        return {dialect for dialect in DIALECTS
+                if "duplicate column name" in self.refusal_of(dialect)}
 
-    def makes_a_table(self, dialect):
+    def broken_schemas(self):
+        """The dialects whose table a database refuses for another reason."""
+        return {dialect for dialect in DIALECTS
+                if self.refusal_of(dialect)} - self.refused_schemas()
+
+    def refusal_of(self, dialect):
         text = (self.runs["QVE"].sql / f"kwv_one_{dialect}_schema.sql").read_text("ascii")
         create = re.search(r"^create table .*?\) *;?$", text, re.M | re.S)[0]
         database = sqlite3.connect(":memory:")
         try:
             database.execute(create)
-        except sqlite3.OperationalError as error:
-            if "duplicate column name" not in str(error):
-                raise
-            return False
+        except sqlite3.Error as error:
+            return str(error)
         finally:
             database.close()
-        return True
+        return ""
+
+    def run_query_script(self):
+        """Runs the query script. Returns its status and what it has to complain of."""
+        (self.place / "tmp").mkdir()
+        command = self.place / "qvmkquery"
+        command.write_text("#!/bin/sh\n")
+        command.chmod(0o755)
+        script = (self.runs["QVE"].sql / "kwv_one_queries.sh").read_text("ascii")
+        result = subprocess.run(
+            ["bash", "-c", script.replace("\r", "")], capture_output=True, text=True, timeout=60,
+            check=False, cwd=self.place,
+            env={"PATH": f"{self.place}:{os.environ['PATH']}", "QUERY_LIB": "library",
+                 "DBDIR": str(self.place)})
+        return result.returncode, result.stderr
 
 
 class NamesTest(unittest.TestCase):
@@ -114,9 +132,11 @@ class NamesTest(unittest.TestCase):
             place / "mof.d"))
 
     def outcome(self, first, second, title="Disks"):
-        place = pathlib.Path(self.enterContext(
+        return Outcome(self.server, self.fresh_place(), first, second, title)
+
+    def fresh_place(self):
+        return pathlib.Path(self.enterContext(
             tempfile.TemporaryDirectory(prefix="sennet-names-")))
-        return Outcome(self.server, place, first, second, title)
 
     def test_names_without_fault(self):
         for names in (("ID", "Name"), ("ID", "INDEX")):
@@ -195,6 +215,49 @@ class NamesTest(unittest.TestCase):
         self.assertEqual(place, [7, 15, "error"])
         self.assertIn("the name Sel\\x has a backslash", message)
         self.assertEqual(outcome.refusing_profiles(), {"SMS", "LD", "QVE"})
+
+    def test_names_that_databases_refuse(self):
+        for title, name, part in (("Disk_Drives 2", "Free (MB)", None),
+                                  ("Wi-Fi", "Name", "the title Wi-Fi has characters besides"),
+                                  ("a;b", "Name", "the title a;b has characters besides"),
+                                  ("a.b", "Name", "the title a.b has characters besides"),
+                                  ("Disks", "Free %", "the name Free % has characters besides"),
+                                  ("Disks", "1st", "the name 1st begins with a digit")):
+            with self.subTest(title=title, name=name):
+                outcome = self.outcome("ID", name, title)
+                told = outcome.told()
+                self.assertEqual([severity for *_, severity, _ in told],
+                                 ["warning"] if part else [])
+                self.assertIn(part or "", "".join(message for *_, message in told))
+                self.assertEqual(outcome.broken_schemas(), set(DIALECTS) if part else set())
+
+    def test_a_title_that_the_shell_runs(self):
+        outcome = self.outcome("ID", "Name", "x$(touch run)")
+        self.assertTrue(any(severity == "error" and "the shell replaces it" in message
+                            for *_, severity, message in outcome.told()))
+        outcome.run_query_script()
+        self.assertTrue((outcome.place / "run").exists())
+
+    def test_titles_that_the_shell_leaves_alone(self):
+        for title in ("Disk Drives", "Drives_2"):
+            with self.subTest(title=title):
+                outcome = self.outcome("ID", "Name", title)
+                self.assertEqual(outcome.told(), [])
+                self.assertEqual(outcome.run_query_script(), (0, ""))
+
+    def test_two_titles_that_are_one_table(self):
+        outcome = self.outcome("ID", "Name", "A B")
+        (outcome.inventory / "two.script.inv").write_text(SCRIPT.replace("Disks", "A_B"))
+        (*_, message), = outcome.told()
+        self.assertIn("has the title A_B, too: for QVE both are one SQL table and view", message)
+        run = installation.Run(installation.programs_of(ARGUMENTS), "QVE", self.fresh_place(),
+                               self.server.socket, outcome.inventory)
+        self.assertEqual({installation.Schema(file).table
+                          for file in run.sql.glob("*_ms_schema.sql")}, {"KWX_A_B"})
+        self.assertEqual(len(list(run.sql.glob("*_ms_schema.sql"))), 2)
+        text = (run.mif / "kwvinv.mif").read_text("ascii")
+        self.assertEqual(set(re.findall(r'Class = "(.*)"', text)),
+                         {"Corvane-Velt|KWX MIF A B|001", "Corvane-Velt|KWX MIF A_B|001"})
 
 
 if __name__ == "__main__":

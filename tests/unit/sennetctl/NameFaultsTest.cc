@@ -81,5 +81,29 @@ TEST(NameFaultsTest, TitlesThatPartTheirClass) {
     EXPECT_THAT(told(classFaults("Identification|a")), ElementsAre(kBar));
 }
 
+TEST(NameFaultsTest, WhatTheShellReplaces) {
+    constexpr const char* kShell =
+        "error has a '$' or a backquote: the shell replaces it in QVE's query script, or runs it";
+    for (const char* text : {"x$(id)", "5 $", "`id`"}) {
+        EXPECT_THAT(told(shellTextFaults(text)), ElementsAre(kShell)) << text;
+    }
+    EXPECT_THAT(told(shellTextFaults("Disks; id & (all) 'of' <them>")), ElementsAre());
+    EXPECT_THAT(told(sqlNameFaults("5 $")), ElementsAre(kShell));
+}
+
+TEST(NameFaultsTest, NamesThatDatabasesRefuse) {
+    for (const char* name : {"Wi-Fi", "a;b", "a'b", "<", "a.b", "a|b", "Disks (2)", "50 %", "a#"}) {
+        EXPECT_THAT(told(sqlNameFaults(name)),
+                    ElementsAre("warning has characters besides letters, digits and blanks: "
+                                "databases or shells refuse it in QVE's scripts, where it has no "
+                                "quotes"))
+            << name;
+    }
+    for (const char* name : {"Disk_Drives 2", "a\\b", "L\xC3\xBC"}) {
+        EXPECT_THAT(told(sqlNameFaults(name)), ElementsAre())
+            << "no more than the literal's faults: " << name;
+    }
+}
+
 }  // namespace
 }  // namespace sennetctl

@@ -175,6 +175,51 @@ TEST_F(ServerCheckTest, LettersThatBecomeBlanks) {
               "each becomes a blank\n");
 }
 
+TEST_F(ServerCheckTest, DoubleQuotesAndLineEndsInValues) {
+    wantNotes = true;
+    fans.setFans(fanXml("3&quot; fan", "2", "1") + fanXml("&quot;a&quot;&#10;b", "2", "1"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),
+              "4:6: note: CIM_Fan: 2 instances\n"
+              "5:6: warning: 2 values of DeviceID with a double quote: old versions of SMS refuse "
+              "the file, and for QVE it becomes '\n"
+              "5:6: note: 1 value of DeviceID with a line end, which is written as it is: readers "
+              "that keep to the standard refuse it\n");
+}
+
+TEST_F(ServerCheckTest, SizesThatAreLessThanTheTypeNeeds) {
+    wantNotes = true;
+    const std::string counted = "4:6: note: CIM_Fan: 2 instances\n";
+    texts.set("CIM_Fan.Bytes.Size", "9");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Bytes\n"),
+              counted +
+                  "5:6: note: the size 9 of the column Bytes is less than the 10 characters "
+                  "that its type may need\n");
+    texts.set("CIM_Fan.Bytes.Size", "10");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Bytes\n"), counted);
+}
+
+TEST_F(ServerCheckTest, SizesThatCutArraysAndDatesInSql) {
+    fans.server.onGetClass(
+        "CIM_Fan", Reply::ok(R"(<CLASS NAME="CIM_Fan"><PROPERTY.ARRAY NAME="Roles" TYPE="string"/>)"
+                             R"(<PROPERTY NAME="Since" TYPE="datetime"/></CLASS>)"));
+    fans.setFans(instanceXml(
+        "CIM_Fan", "a",
+        R"(<PROPERTY.ARRAY NAME="Roles" TYPE="string"><VALUE.ARRAY><VALUE>ab</VALUE>)"
+        R"(<VALUE>c</VALUE></VALUE.ARRAY></PROPERTY.ARRAY>)"
+        R"(<PROPERTY NAME="Since" TYPE="datetime"><VALUE>20260102030405.000000+060</VALUE>)"
+        R"(</PROPERTY>)"));
+    texts.set("CIM_Fan.Roles.Size", "3");
+    texts.set("CIM_Fan.Since.Size", "5");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Roles,Since\n"),
+              "5:6: warning: 1 value of Roles longer than the column of 3 in QVE's schema scripts\n"
+              "5:12: warning: 1 value of Since longer than the column of 5 in QVE's schema "
+              "scripts\n")
+        << "ab,c and 1/2/26";
+    texts.set("CIM_Fan.Roles.Size", "4");
+    texts.set("CIM_Fan.Since.Size", "6");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Roles,Since\n"), "");
+}
+
 TEST_F(ServerCheckTest, ValuesThatAreMissingInSomeRows) {
     wantNotes = true;
     fans.setFans(fanXml("a", "2", "1") + instanceXml("CIM_Fan", "b", ""));
@@ -240,14 +285,26 @@ TEST_F(ServerCheckTest, ARepeatedPropertyIsNotToldAgain) {
 }
 
 TEST_F(ServerCheckTest, NamesThatBreakTheFile) {
-    texts.set("CIM_Fan.DeviceID", "17\" Fan");
+    texts.set("CIM_Fan.DeviceID", "Fan 17\"");
     texts.set("CIM_Fan.State", "a\tb");
     const std::string told = check("G[0]=CIM_Fan\nA[0]=DeviceID,State,Bytes\n");
     EXPECT_EQ(told,
-              "5:6: error: the name 17\" Fan has a double quote or a control character: the MIF "
+              "5:6: error: the name Fan 17\" has a double quote or a control character: the MIF "
               "file cannot be read\n"
               "5:15: error: the name a\tb has a double quote or a control character: the MIF file "
               "cannot be read\n");
+}
+
+TEST_F(ServerCheckTest, NamesThatTheScriptsOfQveCannotHave) {
+    texts.set("CIM_Fan.DeviceID", "1st Fan");
+    texts.set("CIM_Fan.State", "Free %");
+    texts.set("CIM_Fan.Bytes", "Size (B)");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State,Bytes\n"),
+              "5:6: warning: the name 1st Fan begins with a digit: for QVE databases refuse the "
+              "table\n"
+              "5:15: warning: the name Free % has characters besides letters, digits and blanks: "
+              "databases or shells refuse it in QVE's scripts, where it has no quotes\n")
+        << "blanks and parentheses are written as underscores";
 }
 
 TEST_F(ServerCheckTest, AColumnCalledAsTheNumbersOfRows) {

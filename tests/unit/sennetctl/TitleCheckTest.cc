@@ -40,6 +40,42 @@ TEST_F(TitleCheckTest, TwoTablesOfOneClass) {
               "warning: a has the title Fans, too: both tables get the same MIF class\n");
 }
 
+TEST_F(TitleCheckTest, TwoTablesOfOneName) {
+    EXPECT_EQ(check("a", "A B"), "");
+    EXPECT_EQ(check("b", "A_B"),
+              "warning: a has the title A_B, too: for QVE both are one SQL table and view\n");
+    texts.set("title.First", "Same");
+    texts.set("title.Second", "Same");
+    EXPECT_EQ(check("c", "First"), "");
+    EXPECT_EQ(check("d", "Second"),
+              "warning: c has the title Same, too: for QVE both are one SQL table and view\n");
+}
+
+TEST_F(TitleCheckTest, TwoTablesWhoseNamesDifferInCase) {
+    EXPECT_EQ(check("a", "Up"), "");
+    EXPECT_EQ(check("b", "uP"),
+              "warning: a has the title Up: for QVE both are one SQL table in databases that "
+              "ignore case\n");
+    EXPECT_EQ(check("c", "Down"), "");
+    EXPECT_EQ(check("d", "Up"),
+              "warning: a has the title Up, too: both tables get the same MIF class\n");
+}
+
+// Its name is the shown one, and the query has the script's own as a text.
+TEST_F(TitleCheckTest, TitlesInTheScriptsOfQve) {
+    texts.set("title.x$(id);y", "Good");
+    EXPECT_EQ(check("a", "x$(id);y"),
+              "error: the title x$(id);y has a '$' or a backquote: the shell replaces it in QVE's "
+              "query script, or runs it\n");
+    EXPECT_EQ(check("b", "Wi-Fi"),
+              "warning: the title Wi-Fi has characters besides letters, digits and blanks: "
+              "databases or shells refuse it in QVE's scripts, where it has no quotes\n");
+    texts.set("title.Wi-Fi", "Wireless");
+    EXPECT_EQ(check("c", "Wi-Fi"),
+              "warning: b has the title Wi-Fi, too: both tables get the same "
+              "MIF class\n");
+}
+
 TEST_F(TitleCheckTest, AFaultIsToldOnceOfATitleWithoutAnother) {
     EXPECT_EQ(check("a", "Back\\slash of it"),
               "error: the title Back\\slash_of_it has a backslash, which begins an escape: the MIF "
