@@ -25,6 +25,7 @@ Severities severitiesOf(LintRule rule) {
         case LintRule::InvalidDate:
             return {kError, kWarning, kWarning, kWarning};
         case LintRule::NoKey:
+        case LintRule::RepeatedKey:
             return {kError, kError, kWarning, kWarning};
         case LintRule::ReservedName:
         case LintRule::FragileName:

@@ -22,6 +22,7 @@ enum class LintRule {
     WideInteger,    ///< beyond 32 bits with sign where the type is Integer
     LongLiteral,    ///< longer than its type says
     NoKey,          ///< a class of several instances without a key
+    RepeatedKey,    ///< two rows with one key
     ReservedName,   ///< a class that would alter the machine's own record
     FragileName,    ///< a trailing blank or a double quote, which old readers stumble over
     Unsupported,    ///< the word in place of a value

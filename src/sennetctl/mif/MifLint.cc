@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cctype>
+#include <map>
 #include <set>
 
 #include "mif/LintReport.h"
@@ -157,6 +158,38 @@ void checkKeys(const Component& component, LintReport& report) {
     }
 }
 
+std::string keyText(const Mif::Value& value) {
+    return value.kind == Mif::Value::Kind::Integer
+               ? (value.negative ? "-" : "") + std::to_string(value.magnitude)
+               : value.text;
+}
+
+/// What tells a row from the others of its class.
+std::vector<std::string> keyOf(const Mif::Row& row, const Group& group) {
+    std::vector<std::string> key;
+    for (std::size_t place = 0; place < group.attributes.size(); ++place) {
+        const auto& ids = group.key;
+        if (std::find(ids.begin(), ids.end(), group.attributes[place].id) != ids.end()) {
+            key.push_back(keyText(row.at(group, place)));
+        }
+    }
+    return key;
+}
+
+void checkRowKeys(const Component& component, LintReport& report) {
+    std::map<std::size_t, std::set<std::vector<std::string>>> keysOfGroup;
+    for (const Table& table : component.tables) {
+        const Group& group = component.groups[table.group];
+        for (const Mif::Row& row : table.rows) {
+            if (!keysOfGroup[table.group].insert(keyOf(row, group)).second) {
+                report.add(LintRule::RepeatedKey,
+                           row.values.empty() ? table.namePosition : row.values[0].position,
+                           "one more row with the key of an earlier one: it overwrites that");
+            }
+        }
+    }
+}
+
 void checkTemplates(const Component& component, LintReport& report) {
     for (std::size_t i = 0; i < component.groups.size(); ++i) {
         const bool used = std::any_of(component.tables.begin(), component.tables.end(),
@@ -181,6 +214,7 @@ void checkComponent(const Component& component, LintReport& report) {
     for (const Table& table : component.tables) {
         checkTable(table, component.groups[table.group], report);
     }
+    checkRowKeys(component, report);
     checkKeys(component, report);
     checkTemplates(component, report);
     const bool hasId = std::any_of(

@@ -94,6 +94,13 @@ TEST(MifLintTest, SeveralInstancesWithoutAKey) {
               "----");
 }
 
+TEST(MifLintTest, RowsWithOneKey) {
+    EXPECT_EQ(severities(mifOf(tableMif(2, "Fan", "{ 1, \"a\", 3 }\n{ 2, \"a\", 3 }\n"))), "----");
+    EXPECT_EQ(severities(mifOf(tableMif(2, "Fan", "{ 1, \"a\", 3 }\n{ 1, \"b\", 4 }\n"))), "EEWW");
+    // The number of the second row is the default of the group, 1.
+    EXPECT_EQ(severities(mifOf(tableMif(2, "Fan", "{ 1, \"a\", 3 }\n{ , \"b\", 4 }\n"))), "EEWW");
+}
+
 TEST(MifLintTest, ClassesOfTheMachinesOwnRecord) {
     const std::string attribute = attributeMif(1, "Speed", "Integer", "7");
     EXPECT_EQ(severities(mifOf(groupMif(2, "ARCHITECTURE", "Own|Fan|001", attribute))), "-E--");
