@@ -106,8 +106,25 @@ std::vector<AnsweredClass> askFor(const NewOptions& options, const Output& outpu
     return classes;
 }
 
+/// Rows of classes stand side by side, whatever they belong to; empty for one class.
+std::string remarkOnCounts(const std::vector<AnsweredClass>& classes) {
+    const bool differ = std::any_of(classes.begin(), classes.end(), [&](const AnsweredClass& one) {
+        return one.instances.size() != classes.front().instances.size();
+    });
+    if (!differ) {
+        return {};
+    }
+    std::string counts;
+    for (const AnsweredClass& one : classes) {
+        counts += (counts.empty() ? "" : ", ") + textOf(one.definition.getClassName()) + " " +
+                  std::to_string(one.instances.size());
+    }
+    return "the classes have different numbers of instances (" + counts +
+           "), whose rows stand side by side: better write a script for each";
+}
+
 void report(const NewOptions& options, const std::string& properties, const NewScript& texts,
-            const Output& output) {
+            const std::string& remark, const Output& output) {
     const std::string& script = options.script;
     if (output.json) {
         Json document = Json::object();
@@ -115,6 +132,7 @@ void report(const NewOptions& options, const std::string& properties, const NewS
         document["properties"] = properties;
         document["leftOut"] = texts.leftOut;
         document["present"] = texts.present;
+        document["remark"] = remark.empty() ? Json(nullptr) : Json(remark);
         printJson(document, output);
         return;
     }
@@ -124,6 +142,9 @@ void report(const NewOptions& options, const std::string& properties, const NewS
     for (const std::string& present : texts.present) {
         output.out << "in " << printable(options.resources) << " already: " << printable(present)
                    << '\n';
+    }
+    if (!remark.empty()) {
+        output.out << "warning: " << printable(remark) << '\n';
     }
     output.out
         << "Written: " << printable(script) << " and " << printable(properties)
@@ -153,7 +174,7 @@ int writeNewScript(const NewOptions& options, const Output& output) {
         Velm::TextFile(properties.c_str()).remove();
         throw;
     }
-    report(options, properties, texts, output);
+    report(options, properties, texts, remarkOnCounts(plan.classes), output);
     return kFine;
 }
 

@@ -181,6 +181,8 @@ TEST_F(NewCommandTest, ClassesWithoutInstancesComeLast) {
     fans.server.onEnumerateInstances("CIM_None", support::Reply::ok(""));
     options.classes = {"CIM_None", "CIM_Fan"};
     writeNewScript(options, output.plain());
+    EXPECT_THAT(output.text(), HasSubstr("warning: the classes have different numbers of instances "
+                                         "(CIM_None 0, CIM_Fan 2), whose rows stand side by side"));
     EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("G[0]=CIM_Fan\n"));
     EXPECT_THAT(directory.read("coolers.script.inv"), HasSubstr("G[1]=CIM_None\n"));
 }
