@@ -51,15 +51,16 @@ String cut(const String& text, Uint32 limit) {
     return text.size() > limit ? text.subString(0, limit) : text;
 }
 
-// Joins size texts with commas; element(i) gives the i-th.
+// The first kMaxText characters of size texts joined with commas; element(i) gives the i-th. What
+// is cut off anyway is not made first: a small answer can stand for gigabytes of it.
 template <typename Element>
 String join(Uint32 size, Element element) {
     String joined;
-    for (Uint32 i = 0; i < size; ++i) {
+    for (Uint32 i = 0; i < size && joined.size() < kMaxText; ++i) {
         if (i > 0) {
             joined.append(Char16(','));
         }
-        joined.append(element(i));
+        joined.append(cut(element(i), kMaxText - joined.size()));
     }
     return joined;
 }
@@ -158,7 +159,7 @@ String SennetConverter::formatArray(CIMValue value, CIMType type, CIMProperty pr
     if (isInteger(type)) {
         return formatEnumArray(value, type, property);
     }
-    return quote(formatString(cut(joinNonIntegers(value, type), kMaxText)));
+    return quote(formatString(joinNonIntegers(value, type)));
 }
 
 String SennetConverter::formatEnumArray(CIMValue value, CIMType type, CIMProperty property) {

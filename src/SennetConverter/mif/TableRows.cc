@@ -14,6 +14,7 @@ constexpr std::size_t kTextSize = std::size_t{64} * 1024;
 
 void TableRows::start(const CimInstanceLists& instanceLists, const SennetConverter& theAuthor) {
     author = &theAuthor;
+    octets = 0;
     texts.clear();
     shown.clear();
     for (int i = 0; i < instanceLists.getNumberOfInstanceLists(); ++i) {
@@ -22,6 +23,12 @@ void TableRows::start(const CimInstanceLists& instanceLists, const SennetConvert
 }
 
 void TableRows::add(std::string_view row) {
+    octets += row.size();
+    if (octets > kMostOctets) {
+        shown.clear();
+        texts.clear();
+        return;
+    }
     if (texts.empty() || texts.back().size() + row.size() > kTextSize) {
         texts.emplace_back().reserve(kTextSize);
     }

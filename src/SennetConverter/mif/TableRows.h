@@ -4,6 +4,7 @@
 
 #include <Pegasus/Client/CIMClient.h>
 
+#include <cstddef>
 #include <deque>
 #include <string>
 #include <string_view>
@@ -19,9 +20,12 @@ class SennetConverter;
 /// another script.
 class TableRows {
   public:
+    static constexpr std::size_t kMostOctets = std::size_t{16} << 20;
+
     /// Forgets earlier rows; those added from now on are written by `author` and show
     /// `instanceLists`.
     void start(const CimInstanceLists& instanceLists, const SennetConverter& author);
+    /// Beyond kMostOctets none of the table's rows are kept.
     void add(std::string_view row);
 
     /// Whether rows are kept that another than `reader` wrote, and that show these very instances,
@@ -36,6 +40,7 @@ class TableRows {
     const SennetConverter* author = nullptr;
     std::vector<Array<CIMInstance>> shown;
     std::deque<std::string> texts;
+    std::size_t octets = 0;
 };
 
 }  // namespace Pegasus

@@ -187,6 +187,26 @@ TEST_F(SennetConverterValuesTest, WritesIntegerArraysJoinedAndQuoted) {
     EXPECT_EQ(array(CIMValue(arrayOf<Uint32>({4294967295U, 1}))), "\"-1,1\"");
 }
 
+TEST_F(SennetConverterValuesTest, CutsArraysWithinAnElementAndBehindAComma) {
+    const auto cut = [&](int length, const char* second) {
+        const std::string first(static_cast<std::size_t>(length), 'a');
+        return array(CIMValue(strings({first.c_str(), second, "z"})));
+    };
+    EXPECT_EQ(cut(250, "b"), quoted(std::string(250, 'a') + ",b,z"));
+    EXPECT_EQ(cut(252, "bcd"), quoted(std::string(252, 'a') + ",bc"));
+    EXPECT_EQ(cut(254, "bcd"), quoted(std::string(254, 'a') + ","));
+    EXPECT_EQ(cut(255, "bcd"), quoted(std::string(255, 'a')));
+    EXPECT_EQ(cut(256, "bcd"), quoted(std::string(255, 'a')));
+}
+
+// All of it would be 2 GiB of text.
+TEST_F(SennetConverterValuesTest, MakesNoMoreOfAnArrayThanItWrites) {
+    const std::string name(std::size_t{1} << 20, 'x');
+    const Array<Uint16> numbers(2000, Uint16(0));
+    EXPECT_EQ(array(property("P", CIMValue(numbers), {textsQualifier("Values", {name.c_str()})})),
+              quoted(std::string(255, 'x')));
+}
+
 TEST_F(SennetConverterValuesTest, Writes64BitArrayElementsWhole) {
     EXPECT_EQ(array(CIMValue(arrayOf<Uint64>({5000000000U, 18446744073709551615U}))),
               "\"5000000000,18446744073709551615\"");

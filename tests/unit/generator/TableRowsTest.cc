@@ -75,6 +75,24 @@ TEST_F(TableRowsTest, AreForgottenWhenOthersAreWritten) {
     EXPECT_EQ(joined(rows.take()), "other");
 }
 
+TEST_F(TableRowsTest, AreNotKeptBeyondALimit) {
+    const Inventory one = fans({"a"});
+    const std::string mebibyte(std::size_t{1} << 20, 'x');
+    TableRows rows;
+    rows.start(one.lists, writer);
+    for (std::size_t octets = 0; octets < TableRows::kMostOctets; octets += mebibyte.size()) {
+        rows.add(mebibyte);
+    }
+    EXPECT_TRUE(rows.show(one.lists, reader));
+    rows.add("x");
+    EXPECT_FALSE(rows.show(one.lists, reader));
+    EXPECT_TRUE(rows.take().empty());
+
+    rows.start(one.lists, writer);
+    rows.add("row 1\r\n");
+    EXPECT_TRUE(rows.show(one.lists, reader)) << "the next table begins anew";
+}
+
 TEST_F(TableRowsTest, AreNotThoseOfMoreOrFewerClasses) {
     Array<CIMInstance> first(1, fan("a"));
     Array<CIMInstance> second(1, fan("b"));
