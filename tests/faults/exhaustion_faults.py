@@ -6,9 +6,10 @@ import sys
 
 import rows
 import wire
-from generator import MEMORY_LIMIT
+from generator import MEMORY_LIMIT, Generator
 from hostile_run import (ABANDONED, BOTH, CLASS, DROPPED, EMPTY, INSTANCES, WHOLE, HostileRun, right,
                          sends, sends_document)
+from hostile_server import HostileServer
 from rows import MIB
 
 SUITE = rows.Suite(__doc__)
@@ -299,6 +300,42 @@ for _name, _octets in INSTANCE_PARTS.items():
             run.expect(EMPTY, INSTANCES, stream(start, again(part, 4 * GIB), GIB), name,
                        memory=MEMORY * 3 // 4, patience_s=240, limits=[f"--as={MEMORY}"])
         return f"{EMPTY}; next script right; less than {MEMORY * 3 // 4 // MIB} MiB of memory"
+
+
+# An array that makes much more text than a file takes of it: the declaration, the elements, the text.
+LONG_ARRAYS = {
+    "numbers with names of 1 MiB": (
+        '<PROPERTY.ARRAY NAME="P" TYPE="uint16"><QUALIFIER NAME="Values" TYPE="string"><VALUE.ARRAY>'
+        f'<VALUE>{"x" * MIB}</VALUE></VALUE.ARRAY></QUALIFIER></PROPERTY.ARRAY>',
+        '<PROPERTY.ARRAY NAME="P" TYPE="uint16"><VALUE.ARRAY>' + "<VALUE>0</VALUE>" * 2000 +
+        "</VALUE.ARRAY></PROPERTY.ARRAY>", b'"' + b"x" * 255 + b'"'),
+    "numbers of 309 digits": (
+        '<PROPERTY.ARRAY NAME="P" TYPE="real64"/>',
+        '<PROPERTY.ARRAY NAME="P" TYPE="real64"><VALUE.ARRAY>' + "<VALUE>1e308</VALUE>" * 200000 +
+        "</VALUE.ARRAY></PROPERTY.ARRAY>", b'"%s"' % (b"%d" % int(1e308))[:255]),
+}
+for _name, _parts in LONG_ARRAYS.items():
+    @SUITE.case(f"an array of {_name}")
+    def _(trial, name=_name, parts=_parts):
+        declaration, elements, text = parts
+
+        def answer(peer, request):
+            xml = wire.cim_class("CIM_Faulty", declaration) if request.method == "GetClass" else (
+                wire.named("CIM_Faulty", elements))
+            peer.send(wire.with_length(wire.result(request, xml)))
+            return True
+        with rows.place() as place:
+            generator = Generator(trial.bin, place)
+            generator.add_script("a", "[CIM]\nG[0]=CIM_Faulty\nA[0]=P\n")
+            with HostileServer(generator.socket, answer) as server:
+                trial.count()
+                generator.empty_outputs()
+                finished = generator.run("SMS")
+                rows.expect_equal((finished.status, server.failures), (0, []), name)
+                if b"{ 1, " + text + b"}" not in generator.outputs()["mif/a.mif"]:
+                    raise rows.Failure(f"{name}: the row is not as expected")
+                rows.expect_memory_below(finished, 2 * MEMORY_LIMIT, generator.program)
+        return f"255 characters written; less than {2 * MEMORY_LIMIT // MIB} MiB of memory"
 
 
 # ---- headers and trailers
