@@ -7,7 +7,8 @@
 
 #include <algorithm>
 #include <fstream>
-#include <string>
+
+#include "client/ControlGroupMemory.h"
 
 namespace Pegasus {
 
@@ -24,31 +25,6 @@ Uint64 residentOctets() {
     Uint64 residentPages = 0;
     file >> virtualPages >> residentPages;
     return residentPages * pageSize();
-}
-
-// The path of this process below the root of the control groups (version 2), as "/a/b".
-std::string controlGroup() {
-    std::ifstream file("/proc/self/cgroup");
-    std::string line;
-    while (std::getline(file, line)) {
-        if (line.starts_with("0::/")) {
-            return line.substr(3);
-        }
-    }
-    return {};
-}
-
-// The least of the limits of the group and those around it.
-Uint64 controlGroupLimit() {
-    Uint64 least = ~Uint64(0);
-    for (std::string group = controlGroup(); !group.empty(); group.erase(group.find_last_of('/'))) {
-        std::ifstream file("/sys/fs/cgroup" + group + "/memory.max");
-        Uint64 limit = 0;
-        if (file >> limit) {
-            least = std::min(least, limit);
-        }
-    }
-    return least;
 }
 
 }  // namespace
@@ -84,13 +60,13 @@ bool MemoryBudget::isExceeded() const {
     return use > firstUse && use - firstUse > *limit;
 }
 
-Uint64 memoryForAnswers() {
+Uint64 memoryForAnswers(const std::string& root) {
     Uint64 most = static_cast<Uint64>(::sysconf(_SC_PHYS_PAGES)) * pageSize();
     rlimit allowed{};
     if (::getrlimit(RLIMIT_AS, &allowed) == 0) {
         most = std::min<Uint64>(most, allowed.rlim_cur);
     }
-    return std::min(most, controlGroupLimit()) / 4;
+    return std::min(most, controlGroupMemoryLimit(root)) / 4;
 }
 
 }  // namespace Pegasus

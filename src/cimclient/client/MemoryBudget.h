@@ -6,6 +6,7 @@
 
 #include <cstddef>
 #include <optional>
+#include <string>
 
 #include "xml/ByteSource.h"
 
@@ -55,7 +56,7 @@ class MemoryBoundedSource : public ByteSource {
 
 /// A quarter of what the machine has, or of what this process or its control groups may have where
 /// that is less, in octets. Not more, for an array that grows needs up to three times its memory
-/// for a moment.
-Uint64 memoryForAnswers();
+/// for a moment. `root` stands before the paths of the files that tell of the control groups.
+Uint64 memoryForAnswers(const std::string& root = {});
 
 }  // namespace Pegasus
