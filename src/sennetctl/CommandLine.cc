@@ -8,6 +8,7 @@
 #include <functional>
 #include <iostream>
 #include <memory>
+#include <new>
 #include <string>
 #include <utility>
 #include <vector>
@@ -304,6 +305,8 @@ int runCommand(const Choice& choice, const Output& output) {
         printFailure(cause.failure(), output);
     } catch (const Pegasus::Exception& error) {
         printFailure({{}, 0, 0, reasonOf(error)}, output);
+    } catch (const std::bad_alloc&) {
+        printFailure({{}, 0, 0, "not enough memory"}, output);
     } catch (const std::exception& error) {
         printFailure({{}, 0, 0, error.what()}, output);
     }

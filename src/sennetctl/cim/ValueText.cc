@@ -5,10 +5,13 @@
 #include <Pegasus/Common/CIMObject.h>
 #include <Pegasus/Common/CIMObjectPath.h>
 
+#include <algorithm>
+#include <utility>
 #include <variant>
 
 #include "SennetConverter/framework/CimConverter.h"
 #include "cim/CimText.h"
+#include "utf8/Utf8.h"
 
 namespace sennetctl {
 
@@ -72,66 +75,103 @@ std::string elementText(const Json& element) {
     return element.is_null() ? std::string() : element.dump();
 }
 
+/// No more than the front of a name, of at least `longest` octets if it has so many.
+std::string nameOf(const Json& number, const ValueNames& known, std::size_t longest) {
+    // A negative number has no name here, as in the MIF files.
+    const bool isNegative = !number.is_number_unsigned() && number.get<Sint64>() < 0;
+    if (isNegative) {
+        return number.dump();
+    }
+    const auto most = static_cast<Uint32>(std::min<std::size_t>(longest, PEG_NOT_FOUND));
+    return textOf(known.nameOf(number.get<Uint64>()).subString(0, most));
+}
+
+/// The text itself, or no more than `longest` octets of it, in whole characters, and "...".
+std::string cut(std::string text, std::size_t longest) {
+    if (text.size() <= longest) {
+        return text;
+    }
+    std::size_t end = longest;
+    while (end > 0 && utf8::isContinuation(text[end])) {
+        --end;
+    }
+    text.resize(end);
+    return text + "...";
+}
+
 }  // namespace
 
-std::string ValueText::shown(const CIMValue& value, const CIMProperty* declared) {
+std::string ValueText::shown(const CIMValue& value, const CIMProperty* declared,
+                             std::size_t longest) {
     if (value.isNull()) {
         return {};
     }
-    Json content = names(value, declared);
-    if (content.is_null()) {
-        content = withoutNames(value);
-    }
-    if (!content.is_array()) {
-        return elementText(content);
-    }
+    const ValueNames* known = namesFor(value, declared);
+    const auto textFor = [&](const Json& element) {
+        // One more than is shown, so that it is seen that there is more.
+        return known == nullptr ? elementText(element) : nameOf(element, *known, longest + 1);
+    };
+    const Json content = withoutNames(value);
     std::string text;
-    for (const Json& element : content) {
-        text += (text.empty() ? "" : ", ") + elementText(element);
+    if (!content.is_array()) {
+        text = textFor(content);
+    } else {
+        for (std::size_t i = 0; i < content.size() && text.size() <= longest; ++i) {
+            text += (text.empty() ? "" : ", ") + textFor(content[i]);
+        }
     }
+    text = cut(std::move(text), longest);
+    room.take(sizeof(std::string) + text.size());
     return text;
 }
 
 Json ValueText::json(const CIMValue& value, const CIMProperty* declared) {
-    if (value.isNull()) {
-        return nullptr;
-    }
-    Json number = withoutNames(value);
-    Json name = names(value, declared);
-    if (name.is_null()) {
+    Json number = value.isNull() ? Json(nullptr) : withoutNames(value);
+    takeRoomFor(number);
+    const ValueNames* known = namesFor(value, declared);
+    if (known == nullptr) {
         return number;
     }
     Json both = Json::object();
+    Json name = names(number, *known);
     both["value"] = std::move(number);
     both["text"] = std::move(name);
     return both;
 }
 
-/// The names of an integer or of those of an array; null when the property has none.
-Json ValueText::names(const CIMValue& value, const CIMProperty* declared) {
-    if (declared == nullptr || !CimConverter::isInteger(value.getType())) {
+/// The names of the numbers of this value; null when it has none.
+const ValueNames* ValueText::namesFor(const CIMValue& value, const CIMProperty* declared) {
+    if (value.isNull() || declared == nullptr || !CimConverter::isInteger(value.getType())) {
         return nullptr;
     }
     const Uint32 position = declared->findQualifier(CIMName("Values"));
-    if (position == PEG_NOT_FOUND) {
-        return nullptr;
-    }
-    const ValueNames& known = cache.of(*declared, position);
-    const auto name = [&known](const Json& number) -> Json {
-        // A negative number has no name here, as in the MIF files.
-        return number.is_number_unsigned() || number.get<Sint64>() >= 0
-                   ? Json(textOf(known.nameOf(number.get<Uint64>())))
-                   : Json(number.dump());
-    };
-    const Json numbers = withoutNames(value);
+    return position == PEG_NOT_FOUND ? nullptr : &cache.of(*declared, position);
+}
+
+/// The name of a number, or those of an array of them.
+Json ValueText::names(const Json& numbers, const ValueNames& known) {
     if (!numbers.is_array()) {
-        return name(numbers);
+        Json name = nameOf(numbers, known, PEG_NOT_FOUND);
+        takeRoomFor(name);
+        return name;
     }
     Json list = Json::array();
     for (const Json& number : numbers) {
-        list.push_back(name(number));
+        list.push_back(names(number, known));
     }
     return list;
+}
+
+void ValueText::takeRoomFor(const Json& content) {
+    constexpr std::size_t kOctetsOfText = sizeof(std::string);
+    room.take(sizeof(Json));
+    if (content.is_string()) {
+        room.take(kOctetsOfText + content.get_ref<const std::string&>().size());
+    } else if (content.is_array()) {
+        for (const Json& element : content) {
+            takeRoomFor(element);
+        }
+    }
 }
 
 }  // namespace sennetctl

@@ -36,8 +36,10 @@ std::string reasonIn(const CIMInstance& missing, const CIMClass& definition) {
         return {};
     }
     const CIMProperty declared = CIMClass(definition).getProperty(inClass);
-    const std::string name =
-        ValueText().shown(missing.getProperty(inInstance).getValue(), &declared);
+    constexpr std::size_t kLongestReason = 100;
+    AnswerRoom room;
+    const std::string name = ValueText(room).shown(missing.getProperty(inInstance).getValue(),
+                                                   &declared, kLongestReason);
     return name + meaningOf(name);
 }
 

@@ -6,6 +6,7 @@
 #include "cim/CimText.h"
 #include "cim/LocalServer.h"
 #include "cim/ValueText.h"
+#include "report/AnswerRoom.h"
 #include "report/Json.h"
 #include "report/Progress.h"
 #include "report/Text.h"
@@ -90,13 +91,15 @@ const CIMProperty* pointerTo(const Column& column) {
 
 void printInstancesJson(const GetOptions& options, const ClassContent& content,
                         const std::vector<Column>& columns, const Output& output) {
-    ValueText values;
+    AnswerRoom room;
+    ValueText values(room);
     Json rows = Json::array();
     for (const CIMInstance& instance : content.instances) {
         Json row = Json::object();
         for (const Column& column : columns) {
-            row[textOf(column.name)] =
-                values.json(valueIn(instance, column.name), pointerTo(column));
+            const std::string name = textOf(column.name);
+            room.take(sizeof(std::string) + name.size());
+            row[name] = values.json(valueIn(instance, column.name), pointerTo(column));
         }
         rows.push_back(std::move(row));
     }
@@ -115,7 +118,8 @@ void printTable(const ClassContent& content, const std::vector<Column>& columns,
         titles.push_back(textOf(column.name));
     }
     TextTable table(titles, TextTable::Cells::Fitting);
-    ValueText values;
+    AnswerRoom room;
+    ValueText values(room);
     for (const CIMInstance& instance : content.instances) {
         std::vector<std::string> cells;
         cells.reserve(columns.size());

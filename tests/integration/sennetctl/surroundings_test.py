@@ -6,6 +6,7 @@ import json
 import os
 import pathlib
 import pty
+import resource
 import socket
 import struct
 import subprocess
@@ -19,6 +20,7 @@ sys.path.insert(0, str(HERE.parent / "inventory"))
 import installation
 
 ARGUMENTS = None
+LITTLE_MEMORY = 64 << 20
 TEXT = "a text of more characters than a narrow terminal has in one of its lines"
 MIF = f"""Start Component Name = "Machine"
 Start Group Name = "Fan" Class = "Own|Fan|001" Id = 1
@@ -70,6 +72,24 @@ class SurroundingsTest(unittest.TestCase):
         shown = subprocess.run(self.command("mif", "show", self.mif), capture_output=True,
                                text=True, timeout=60, check=True, env=self.environment())
         self.assertIn("\n" + TEXT + "\n", shown.stdout)
+
+    def with_little_memory(self, *words):
+        return subprocess.run(
+            self.command(*words), capture_output=True, text=True, timeout=60, check=False,
+            env=self.environment(), preexec_fn=lambda: resource.setrlimit(
+                resource.RLIMIT_AS, (LITTLE_MEMORY, LITTLE_MEMORY)))
+
+    def test_lack_of_memory_is_told_as_such(self):
+        if self.with_little_memory("mif", "show", self.mif).returncode != 0:
+            self.skipTest("the sanitizers need more address space to begin with")
+        self.mif.write_text(MIF.replace(
+            "End Group\n", "".join(f'Start Attribute Name = "A{number}" Id = {number} Type = '
+                                   f'String(99) Value = "{TEXT}" End Attribute\n'
+                                   for number in range(2, 60000)) + "End Group\n"))
+        result = self.with_little_memory("mif", "json", self.mif)
+        self.assertEqual(result.returncode, 2)
+        self.assertEqual(result.stderr, "sennetctl: not enough memory\n")
+        self.assertEqual(json.loads(result.stdout), {"error": {"message": "not enough memory"}})
 
     def test_the_places_are_told_before_the_server_answers(self):
         self.silent_server()
