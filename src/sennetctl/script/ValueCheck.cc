@@ -58,11 +58,14 @@ bool allSurvive(const CIMValue& value) {
                        [](Uint32 number) { return number <= 0x7FFFFFFF; });
 }
 
-String joined(const Array<String>& texts) {
+/// No more of the texts than shows whether they are cut: names may be long and in each element.
+template <typename TextAt>
+String joined(Uint32 count, TextAt textAt) {
+    constexpr Uint32 kEnough = kLongestText + 1;
     String all;
-    for (Uint32 i = 0; i < texts.size(); ++i) {
+    for (Uint32 i = 0; i < count && all.size() < kEnough; ++i) {
         all.append(i > 0 ? "," : "");
-        all.append(texts[i]);
+        all.append(textAt(i).subString(0, kEnough));
     }
     return all;
 }
@@ -71,7 +74,7 @@ bool becomesBlank(Uint16 character) {
     return (character < ' ' && character != '\r' && character != '\n') || character > '~';
 }
 
-/// The values of a column, as texts that nothing has cut yet.
+/// The values of a column, as texts that nothing has cut yet to the length they are written in.
 class WrittenColumn {
   public:
     WrittenColumn(const Column& theColumn, const AnsweredClass& theAnswered)
@@ -103,7 +106,11 @@ class WrittenColumn {
         if (shown.type != CIMTYPE_STRING) {
             return value.toString();
         }
-        return value.isArray() ? joined(read<Array<String>>(value)) : read<String>(value);
+        if (!value.isArray()) {
+            return read<String>(value);
+        }
+        const auto texts = read<Array<String>>(value);
+        return joined(texts.size(), [&](Uint32 i) { return texts[i]; });
     }
 
     bool survivesWriting(const ResolvedProperty& shown) const {
@@ -128,11 +135,7 @@ class WrittenColumn {
             return known.nameOf(CimConverter::getUint64(value, type));
         }
         const Array<Uint64> numbers = CimConverter::getUint64Array(value, type);
-        Array<String> texts;
-        for (Uint32 i = 0; i < numbers.size(); ++i) {
-            texts.append(known.nameOf(numbers[i]));
-        }
-        return joined(texts);
+        return joined(numbers.size(), [&](Uint32 i) { return known.nameOf(numbers[i]); });
     }
 
     const Column& column;

@@ -32,6 +32,7 @@ std::string standInFor(const Column& column, const AnsweredClass& answered);
 std::size_t countWideValues(const Column& column, const AnsweredClass& answered);
 
 /// Characters of the longest text that is written, before any column limits it; 0 for none.
+/// Of an array that is longer than what is written, only that it is.
 std::size_t longestText(const Column& column, const AnsweredClass& answered);
 
 }  // namespace sennetctl

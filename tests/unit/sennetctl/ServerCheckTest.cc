@@ -158,6 +158,29 @@ TEST_F(ServerCheckTest, TextsThatAreCutOrLongerThanTheirColumn) {
               "values at 32\n");
 }
 
+TEST_F(ServerCheckTest, ArraysThatAreCut) {
+    fans.server.onGetClass("CIM_Fan",
+                           Reply::ok("<CLASS NAME=\"CIM_Fan\"><PROPERTY.ARRAY NAME=\"Roles\" "
+                                     "TYPE=\"string\"/></CLASS>"));
+    const auto setRoles = [this](std::size_t first, std::size_t second) {
+        fans.setFans(instanceXml("CIM_Fan", "a",
+                                 "<PROPERTY.ARRAY NAME=\"Roles\" TYPE=\"string\"><VALUE.ARRAY>"
+                                 "<VALUE>" +
+                                     std::string(first, 'x') + "</VALUE><VALUE>" +
+                                     std::string(second, 'x') +
+                                     "</VALUE></VALUE.ARRAY></PROPERTY.ARRAY>"));
+    };
+    const std::string cut =
+        "5:6: warning: 1 value of Roles cut, for texts end at 255 characters, and other values at "
+        "32\n";
+    setRoles(127, 127);
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Roles\n"), "") << "with the comma they have 255 characters";
+    setRoles(127, 128);
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Roles\n"), cut);
+    setRoles(5000, 1);
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Roles\n"), cut);
+}
+
 TEST_F(ServerCheckTest, NamesOfNumbersThatAreLongerThanTheirColumn) {
     texts.set("CIM_Fan.State.Size", "7");
     EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=State\n"),
