@@ -18,10 +18,11 @@ Uint64 limitIn(const std::string& path) {
 }
 
 // In a container the limit is at the top, and the group may have a path that is not seen there.
-Uint64 leastLimit(const std::string& top, std::string group, const std::string& fileName) {
+Uint64 leastLimit(const std::string& top, const std::string& group, const std::string& fileName) {
     Uint64 least = limitIn(top + fileName);
-    for (; !group.empty(); group.erase(group.find_last_of('/'))) {
-        least = std::min(least, limitIn(top + group + fileName));
+    std::string place = top + group;
+    for (; place.size() > top.size(); place.erase(place.find_last_of('/'))) {
+        least = std::min(least, limitIn(place + fileName));
     }
     return least;
 }
