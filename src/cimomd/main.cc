@@ -97,6 +97,13 @@ class Listeners {
     std::optional<LoopbackListener> http;
 };
 
+/// The allocator would keep what the classes that are gone, or the wrong ones, once needed.
+void giveFreedMemoryBack() {
+#ifdef __GLIBC__
+    ::malloc_trim(0);
+#endif
+}
+
 /// Old classes stay when the new ones are wrong.
 void reload(const SchemaLoader& loader, CurrentRepository& repository) {
     ServiceManager::notifyReloading();
@@ -106,6 +113,7 @@ void reload(const SchemaLoader& loader, CurrentRepository& repository) {
     } catch (const std::exception& error) {
         logText(LogLevel::Error, fmt::format("the old classes stay: {}", error.what()));
     }
+    giveFreedMemoryBack();
     ServiceManager::notify("READY=1");
 }
 
