@@ -10,6 +10,7 @@
 #include <cstdint>
 #include <cstring>
 #include <stdexcept>
+#include <string>
 
 #include "service/EndDeadline.h"
 #include "service/Log.h"
@@ -27,15 +28,14 @@ constexpr auto kPauseAfterFailure = std::chrono::milliseconds(200);
 // Who connects again and again must not keep the loop from its other work.
 constexpr int kConnectionsInARow = 64;
 
-void logPeer(int connection, const sockaddr_storage& address) {
+std::string describePeer(int connection, const sockaddr_storage& address) {
     ucred peer{};
     socklen_t length = sizeof peer;
-    if (address.ss_family != AF_UNIX) {
-        logText(LogLevel::Info, "connection over HTTP from the loopback");
-    } else if (::getsockopt(connection, SOL_SOCKET, SO_PEERCRED, &peer, &length) == 0) {
-        logText(LogLevel::Info,
-                fmt::format("connection from pid {} uid {} gid {}", peer.pid, peer.uid, peer.gid));
-    }
+    if (address.ss_family != AF_UNIX)
+        return "connection over HTTP from the loopback";
+    if (::getsockopt(connection, SOL_SOCKET, SO_PEERCRED, &peer, &length) != 0)
+        return "connection from a process that is not told";
+    return fmt::format("connection from pid {} uid {} gid {}", peer.pid, peer.uid, peer.gid);
 }
 
 }  // namespace
@@ -68,6 +68,7 @@ void MainLoop::run(const std::function<void()>& reload) {
         if (onlyOne && server.connections() == 0)
             return;
         server.closeOverdue();
+        connectionLog.tellLeftOut(Clock::now());
         if (Clock::now() < acceptAgain)
             continue;
         for (const int listener : listeners)
@@ -101,8 +102,10 @@ void MainLoop::acceptFrom(int listeningSocket) {
             }
             return;
         }
-        logPeer(connection, address);
-        server.serve(connection);
+        // The connection may have ended when it is known to be served.
+        const std::string peer = describePeer(connection, address);
+        if (server.serve(connection))
+            connectionLog.add(peer, Clock::now());
     }
 }
 

@@ -5,9 +5,12 @@
 
 #include <chrono>
 #include <functional>
+#include <string_view>
 #include <vector>
 
 #include "protocol/HttpServer.h"
+#include "service/ConnectionLog.h"
+#include "service/Log.h"
 #include "service/Signals.h"
 
 namespace cimomd {
@@ -40,6 +43,7 @@ class MainLoop {
     HttpServer& server;
     Signals& signals;
     std::vector<int> listeners;
+    ConnectionLog connectionLog{[](std::string_view line) { logText(LogLevel::Info, line); }};
     /// Written to by the server's threads when a connection has ended.
     int ended = -1;
     bool onlyOne = false;

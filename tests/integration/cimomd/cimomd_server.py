@@ -1,6 +1,7 @@
 """cimomd as a child process, and the octets that go to it and come from it."""
 
 import os
+import pathlib
 import re
 import signal
 import subprocess
@@ -39,6 +40,10 @@ class Server:
 
     def descriptors(self):
         return len(os.listdir(f"/proc/{self.process.pid}/fd"))
+
+    def resident_kib(self):
+        status = pathlib.Path(f"/proc/{self.process.pid}/status").read_text()
+        return int(re.search(r"VmRSS:\s+(\d+) kB", status).group(1))
 
     def end(self):
         self.process.send_signal(signal.SIGTERM)
