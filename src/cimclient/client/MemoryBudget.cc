@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <fstream>
+#include <limits>
 
 #include "client/ControlGroupMemory.h"
 
@@ -60,13 +61,15 @@ bool MemoryBudget::isExceeded() const {
     return use > firstUse && use - firstUse > *limit;
 }
 
-Uint64 memoryForAnswers(const std::string& root) {
-    Uint64 most = static_cast<Uint64>(::sysconf(_SC_PHYS_PAGES)) * pageSize();
+Uint64 addressSpaceLimit() {
+    static_assert(RLIM_INFINITY == std::numeric_limits<Uint64>::max());
     rlimit allowed{};
-    if (::getrlimit(RLIMIT_AS, &allowed) == 0) {
-        most = std::min<Uint64>(most, allowed.rlim_cur);
-    }
-    return std::min(most, controlGroupMemoryLimit(root)) / 4;
+    return ::getrlimit(RLIMIT_AS, &allowed) == 0 ? allowed.rlim_cur : RLIM_INFINITY;
+}
+
+Uint64 memoryForAnswers(const std::string& root, Uint64 addressSpace) {
+    const Uint64 installed = static_cast<Uint64>(::sysconf(_SC_PHYS_PAGES)) * pageSize();
+    return std::min({installed, addressSpace, controlGroupMemoryLimit(root)}) / 4;
 }
 
 }  // namespace Pegasus

@@ -54,9 +54,14 @@ class MemoryBoundedSource : public ByteSource {
     MemoryBudget& budget;
 };
 
-/// A quarter of what the machine has, or of what this process or its control groups may have where
-/// that is less, in octets. Not more, for an array that grows needs up to three times its memory
-/// for a moment. `root` stands before the paths of the files that tell of the control groups.
-Uint64 memoryForAnswers(const std::string& root = {});
+/// The octets of address space that this process may have: RLIMIT_AS, the greatest Uint64 where
+/// there is no limit.
+Uint64 addressSpaceLimit();
+
+/// A quarter of what the machine has, or of what the control groups of this process or its
+/// `addressSpace` allow where that is less, in octets. Not more, for an array that grows needs up
+/// to three times its memory for a moment. `root` stands before the paths of the files that tell of
+/// the control groups.
+Uint64 memoryForAnswers(const std::string& root = {}, Uint64 addressSpace = addressSpaceLimit());
 
 }  // namespace Pegasus

@@ -32,6 +32,13 @@ std::string timeMarkup(std::time_t moment) {
 constexpr const char* kPartEnd = "</section>\n";
 constexpr const char* kPartLinksEnd = "</ul>\n</li>\n";
 
+// Without a name of its own: each would be a landmark, and those of two machines alike.
+std::string beginSection(const char* kind, const std::string& id, const std::string& name,
+                         int level) {
+    return fmt::format("<section class=\"{0}\">\n<h{1} id=\"{2}\">{3}</h{1}>\n", kind, level, id,
+                       html(name));
+}
+
 std::string link(const std::string& target, const std::string& name, const std::string& count) {
     const std::string shownCount =
         count.empty() ? std::string() : fmt::format(" <span class=\"count\">{}</span>", count);
@@ -73,9 +80,7 @@ void InventoryPage::add(const std::string& file, std::time_t modified, const Mif
 void InventoryPage::beginPart(const std::string& id, const std::string& name,
                               const std::string& count, int level) {
     links += "<li>" + link(id, name, count) + "\n<ul>\n";
-    sections += fmt::format(
-        "<section class=\"part\" aria-labelledby=\"{0}\">\n<h{1} id=\"{0}\">{2}</h{1}>\n", id,
-        level, html(name));
+    sections += beginSection("part", id, name, level);
 }
 
 void InventoryPage::addMissing(const Failure& failure) {
@@ -88,9 +93,7 @@ void InventoryPage::addTable(const MifTable& table, const std::string& origin, i
     const std::string id = fmt::format("table-{}", tableCount);
     const ShownTable shown = shownTable(table);
     links += "<li>" + link(id, shown.name, std::to_string(table.rows.size())) + "</li>\n";
-    sections += fmt::format(
-        "<section class=\"table\" aria-labelledby=\"{0}\">\n<h{1} id=\"{0}\">{2}</h{1}>\n", id,
-        level, html(shown.name));
+    sections += beginSection("table", id, shown.name, level);
     appendTable(sections, shown, id, origin);
     sections += "</section>\n";
 }
