@@ -261,12 +261,17 @@ def _(trial):
 # Parts of instances, of which many take much more memory than octets.
 ELEMENTS = ('<PROPERTY.ARRAY NAME="P" TYPE="string"><VALUE.ARRAY>@</VALUE.ARRAY>'
             "</PROPERTY.ARRAY>")
+IN_INSTANCE = (b'<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME="CIM_Faulty"/>'
+               b'<INSTANCE CLASSNAME="CIM_Faulty">')
 INSTANCE_PARTS = {
-    "instances": (b"", b'<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME="CIM_Faulty"/>'
-                       b'<INSTANCE CLASSNAME="CIM_Faulty"/></VALUE.NAMEDINSTANCE>'),
-    "elements of an array": (b'<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME="CIM_Faulty"/><INSTANCE '
-                             b'CLASSNAME="CIM_Faulty"><PROPERTY.ARRAY NAME="P" TYPE="string">'
-                             b'<VALUE.ARRAY>', b"<VALUE/>"),
+    "instances": (b"", IN_INSTANCE + b"</INSTANCE></VALUE.NAMEDINSTANCE>"),
+    "elements of an array": (IN_INSTANCE + b'<PROPERTY.ARRAY NAME="P" TYPE="string"><VALUE.ARRAY>',
+                             b"<VALUE/>"),
+    "properties of an instance": (IN_INSTANCE, b'<PROPERTY NAME="P%d" TYPE="uint8"/>'),
+    "qualifiers of a property": (IN_INSTANCE + b'<PROPERTY NAME="P" TYPE="uint8">',
+                                 b'<QUALIFIER NAME="Q%d" TYPE="boolean"/>'),
+    "keys of an instance": (b'<VALUE.NAMEDINSTANCE><INSTANCENAME CLASSNAME="CIM_Faulty">',
+                            b'<KEYBINDING NAME="K%d"><KEYVALUE/></KEYBINDING>'),
 }
 # A quarter of it is for the objects of answers.
 MEMORY = GIB // 2
@@ -296,8 +301,9 @@ for _name, _octets in INSTANCE_PARTS.items():
             raise rows.Skip("takes long: at full effort only")
         need_limits(trial)
         start, part = octets
+        pieces = numbered(part) if b"%d" in part else again(part, 4 * GIB)
         with HostileRun(trial) as run:
-            run.expect(EMPTY, INSTANCES, stream(start, again(part, 4 * GIB), GIB), name,
+            run.expect(EMPTY, INSTANCES, stream(start, pieces, GIB), name,
                        memory=MEMORY * 3 // 4, patience_s=240, limits=[f"--as={MEMORY}"])
         return f"{EMPTY}; next script right; less than {MEMORY * 3 // 4 // MIB} MiB of memory"
 
