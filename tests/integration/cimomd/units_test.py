@@ -1,4 +1,5 @@
-"""The systemd units: systemd finds nothing wrong with them, and they leave little exposed."""
+"""The systemd units: systemd finds nothing wrong with them, they leave little exposed, and they hide
+nothing that an inventory lists."""
 
 import argparse
 import pathlib
@@ -48,6 +49,17 @@ class UnitsTest(unittest.TestCase):
         subprocess.run(["systemd-sysusers", f"--root={users}", USERS], capture_output=True,
                        check=True)
         self.assertRegex((users / "etc" / "passwd").read_text(), r"(?m)^cimomd:x:\d+:\d+:")
+
+    def test_nothing_is_hidden_from_the_inventory(self):
+        # What was mounted below /tmp and /usr/lib/modules was missing from the tables of file systems,
+        # a made-up mount stood there, and a daemon that ran for weeks knew the old host name only.
+        hiding = re.compile(r"(?m)^(PrivateTmp|PrivateDevices|PrivateNetwork|PrivateUsers|ProcSubset"
+                            r"|ProtectProc|ProtectKernelModules|InaccessiblePaths|TemporaryFileSystem"
+                            r"|ProtectHome=(?!read-only$)).*")
+        for name in ("cimomd.service", "sennet@.service"):
+            with self.subTest(unit=name):
+                self.assertIsNone(hiding.search((UNITS / name).read_text()))
+        self.assertNotIn("\nProtectHostname", (UNITS / "cimomd.service").read_text())
 
     def test_the_hardening_that_was_promised_is_there(self):
         lines = (UNITS / "cimomd.service").read_text().splitlines()

@@ -39,6 +39,52 @@ TEST(MountedFileSystem, leavesTheSystemsOwnTemporaryFileSystemsOut) {
               "/runtime;/tmp;");
 }
 
+// Seen in a timer's inventory: the directory of modules, which systemd had made inaccessible, was
+// listed with the size of /run.
+TEST(MountedFileSystem, leavesOutWhatSystemdMakesInaccessible) {
+    EXPECT_EQ(
+        listed("100 1 8:1 / / ro,nosuid shared:1 - ext4 /dev/a rw\n"
+               "114 100 0:48 / /run rw,nosuid shared:114 master:6 - tmpfs tmpfs rw,mode=755\n"
+               "138 100 0:48 /systemd/inaccessible/dir /usr/lib/modules ro,nosuid,nodev,noexec "
+               "shared:138 master:6 - tmpfs tmpfs rw,size=4936820k,mode=755\n"),
+        "/;");
+    // In a container the manager of containers has made the directory.
+    EXPECT_EQ(
+        listed("100 1 8:1 / / ro shared:1 - ext4 /dev/a rw\n"
+               "138 100 0:48 /host/inaccessible/dir /usr/lib/modules ro master:6 - tmpfs tmpfs "
+               "rw,mode=755\n"),
+        "/;");
+    // Of a service of a user.
+    EXPECT_EQ(listed("100 1 8:1 / / ro shared:1 - ext4 /dev/a rw\n"
+                     "139 100 0:52 /systemd/inaccessible/dir /home/mia/secret ro - tmpfs tmpfs "
+                     "rw,uid=1000\n"),
+              "/;");
+    EXPECT_EQ(listed("100 1 8:1 / / ro shared:1 - ext4 /dev/a rw\n"
+                     "139 100 0:53 /inaccessible/dir /srv ro - tmpfs tmpfs rw\n"
+                     "140 100 8:2 /host/inaccessible/dir /data rw - ext4 /dev/b rw\n"),
+              "/;/srv;/data;");
+}
+
+// A service with mounts of its own gets the same mounts in another order.
+TEST(MountedFileSystem, namesAFileSystemAlikeInEveryOrder) {
+    EXPECT_EQ(listed("20 1 8:1 / / rw - ext4 /dev/a rw\n"
+                     "21 20 8:2 / /export rw - ext4 /dev/b rw\n"
+                     "22 20 8:3 / /data rw - ext4 /dev/c rw\n"
+                     "23 21 8:3 / /export/data rw - ext4 /dev/c rw\n"),
+              "/;/export;/data;");
+    EXPECT_EQ(listed("20 1 8:1 / / ro - ext4 /dev/a rw\n"
+                     "21 20 8:2 / /export ro - ext4 /dev/b rw\n"
+                     "23 21 8:3 / /export/data ro - ext4 /dev/c rw\n"
+                     "22 20 8:3 / /data ro - ext4 /dev/c rw\n"),
+              "/;/export;/data;");
+    EXPECT_EQ(listed("20 1 8:1 / / ro - ext4 /dev/a rw\n"
+                     "22 20 8:3 / /two ro - ext4 /dev/c rw\n"
+                     "23 20 8:3 / /one ro - ext4 /dev/c rw\n"
+                     "24 20 8:4 /b /bound/b ro - ext4 /dev/d rw\n"
+                     "25 20 8:4 /a /bound/a ro - ext4 /dev/d rw\n"),
+              "/;/one;/bound/a;");
+}
+
 TEST(MountedFileSystem, leavesOutWhatALaterMountHides) {
     EXPECT_EQ(listed("1 0 8:1 / /mnt rw - ext4 /dev/a rw\n"
                      "2 0 8:2 / /mnt rw - ext4 /dev/b rw\n"),

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <map>
+#include <tuple>
 
 #include "system/storage/MountTree.h"
 
@@ -10,6 +11,9 @@ namespace cimomd {
 namespace {
 
 constexpr std::array<std::string_view, 4> kSystemDirectories{"/dev", "/proc", "/run", "/sys"};
+
+constexpr std::array<std::string_view, 2> kCoverDirectories{"/systemd/inaccessible/",
+                                                            "/host/inaccessible/"};
 
 bool isInSystemDirectory(std::string_view path) {
     return std::any_of(
@@ -19,9 +23,27 @@ bool isInSystemDirectory(std::string_view path) {
         });
 }
 
+// systemd mounts a part of its own temporary file system over what a service shall not see.
+bool coversADirectory(const Mount& mount) {
+    return std::any_of(kCoverDirectories.begin(), kCoverDirectories.end(),
+                       [&mount](std::string_view directory) {
+                           return mount.fileSystemRoot.find(directory) != std::string::npos;
+                       });
+}
+
 bool isListed(const Mount& mount, FileSystemKind kind) {
     return fileSystemKindOf(mount.type) == kind &&
-           !(isTemporary(mount.type) && isInSystemDirectory(mount.mountPoint));
+           !(isTemporary(mount.type) &&
+             (isInSystemDirectory(mount.mountPoint) || coversADirectory(mount)));
+}
+
+// The order of the table is not asked: a service can have its mounts in another one.
+bool namesBetter(const Mount& left, const Mount& right) {
+    const auto rank = [](const Mount& mount) {
+        return std::make_tuple(mount.fileSystemRoot != "/", mount.mountPoint.size(),
+                               std::string_view(mount.mountPoint));
+    };
+    return rank(left) < rank(right);
 }
 
 }  // namespace
@@ -42,7 +64,7 @@ std::vector<MountedFileSystem> mountedFileSystems(const std::vector<Mount>& moun
         const auto [place, isNew] = placeOfDevice.emplace(mount.device, out.size());
         if (isNew)
             out.push_back({mount, mayWait});
-        else if (out[place->second].mount.fileSystemRoot != "/" && mount.fileSystemRoot == "/")
+        else if (namesBetter(mount, out[place->second].mount))
             out[place->second] = {mount, mayWait};
     }
     return out;

@@ -17,9 +17,9 @@ struct MountedFileSystem {
     bool mayWait = false;
 };
 
-/// The file systems of `kind`, each once: its first mount that is no bind mount, else the first.
-/// What another mount hides is left out, so are temporary file systems in the system's own
-/// directories.
+/// The file systems of `kind`, each once: its mount with the shortest path that is no bind mount,
+/// else the shortest of all. What another mount hides is left out, so are temporary file systems in
+/// the system's own directories, and what systemd makes directories inaccessible with.
 std::vector<MountedFileSystem> mountedFileSystems(const std::vector<Mount>& mounts,
                                                   FileSystemKind kind);
 
