@@ -81,11 +81,11 @@ bool has(std::string_view text, std::string_view wanted) {
 }
 
 bool isPlainList(std::string_view properties) {
-    const auto isAscii = [](char c) { return static_cast<unsigned char>(c) < 128; };
+    const auto isPlain = [](char c) { return c >= ' ' && c <= '~'; };
     const auto isNamePart = [](char c) {
         return std::isalpha(static_cast<unsigned char>(c)) || c == '_';
     };
-    return std::all_of(properties.begin(), properties.end(), isAscii) &&
+    return std::all_of(properties.begin(), properties.end(), isPlain) &&
            std::any_of(properties.begin(), properties.end(), isNamePart);
 }
 

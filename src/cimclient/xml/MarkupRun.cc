@@ -44,13 +44,13 @@ std::optional<MarkupRun> MarkupRun::of(std::string_view element, bool hasText) {
         return run.before.size() > kMaxMarkup ? std::nullopt : std::optional(run);
     }
     const std::size_t firstTag = element.find(kStartTag);
-    if (firstTag == kNone) {
+    const std::size_t lastEnd = element.rfind(kEndTag);
+    if (firstTag == kNone || lastEnd == kNone) {
         return std::nullopt;
     }
     const std::size_t firstText = firstTag + kStartTag.size();
     const std::size_t firstEnd = element.find('<', firstText);
     const std::size_t secondTag = element.find(kStartTag, firstEnd);
-    const std::size_t lastEnd = element.rfind(kEndTag);
     run.before = element.substr(0, firstText);
     run.after = element.substr(lastEnd);
     run.textTagSize = kStartTag.size();
@@ -71,7 +71,7 @@ std::optional<MarkupRun> MarkupRun::ofOneText(std::string_view element, std::str
     }
     const std::size_t textEnd = element.find_first_of("<>", tagEnd + 1);
     // A ">" may stand in an attribute's value, too.
-    if (!element.substr(textEnd).starts_with("</" + std::string(leaf))) {
+    if (textEnd == kNone || !element.substr(textEnd).starts_with("</" + std::string(leaf))) {
         return std::nullopt;
     }
     MarkupRun run;

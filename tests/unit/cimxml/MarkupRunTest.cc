@@ -71,7 +71,9 @@ TEST(MarkupRun, IsNotKeptOfValuesThatAreNotSpelledAlike) {
           "<P><VALUE>1</VALUE><VALUE/></P>", "<P><VALUE.NULL/><VALUE>1</VALUE></P>",
           "<P><VALUE>1</VALUE><VALUE.NULL/></P>",
           "<P><VALUE>1</VALUE><VALUE.NULL/><VALUE>2</VALUE></P>",
-          "<P><VALUE>1</VALUE><VALUE /><VALUE>2</VALUE></P>"}) {
+          "<P><VALUE>1</VALUE><VALUE /><VALUE>2</VALUE></P>", "<P><VALUE>1</VALUE ></P>",
+          "<P><VALUE>1</VALUE\r></P>", "<P><VALUE>1</VALUE><VALUE>2</VALUE ></P>",
+          "<P><VALUE >1</VALUE><VALUE>2</VALUE ></P>"}) {
         EXPECT_FALSE(MarkupRun::of(element, true)) << element;
     }
 }

@@ -106,6 +106,14 @@ TEST(RepeatedInstances, HaveTheirReferencesReplaced) {
         (Texts{"p q ", "1> 2 "}));
 }
 
+TEST(RepeatedInstances, MayHaveBlanksInTheirTags) {
+    const auto spaced = [](const std::string& value) {
+        return "<PROPERTY NAME='A' TYPE='uint16'><VALUE>" + value + "</VALUE\t></PROPERTY\n>";
+    };
+    EXPECT_EQ(valuesOf({spaced("1"), spaced("2"), property("A", "uint16", "3"), spaced("4")}),
+              (Texts{"1", "2", "3", "4"}));
+}
+
 TEST(RepeatedInstances, MayBeNullBetweenOthers) {
     EXPECT_EQ(valuesOf({property("A", "uint16", "1"), null("A", "uint16"), null("A", "uint16"),
                         property("A", "uint16", "4"), null("A", "uint16")}),
