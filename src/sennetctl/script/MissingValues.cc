@@ -15,8 +15,14 @@ std::string textIn(const CIMInstance& instance, const char* property) {
                                      : textOf(instance.getProperty(position).getValue().toString());
 }
 
+// Files of a process are for its owner and for root with all privileges, which no service of the
+// packages has.
+bool isOfProcesses(const std::string& className) {
+    return className == "Velmira_UnixProcess";
+}
+
 /// What is to be done about a reason, or why nothing can be; empty for one that is not known here.
-std::string meaningOf(const std::string& reason) {
+std::string meaningOf(const std::string& reason, const std::string& className) {
     static const std::map<std::string, std::string> kMeanings = {
         {"Absent", "the machine does not tell it"},
         {"Needs Root", "run as root or let the service run"},
@@ -24,6 +30,9 @@ std::string meaningOf(const std::string& reason) {
         {"Timed Out", "a file server or a driver does not answer"},
         {"Unreadable", "the source cannot be read or understood"},
     };
+    if (reason == "Needs Root" && isOfProcesses(className)) {
+        return ", run as root by hand, without the service";
+    }
     const auto found = kMeanings.find(reason);
     return found == kMeanings.end() ? std::string() : ", " + found->second;
 }
@@ -40,7 +49,7 @@ std::string reasonIn(const CIMInstance& missing, const CIMClass& definition) {
     AnswerRoom room;
     const std::string name = ValueText(room).shown(missing.getProperty(inInstance).getValue(),
                                                    &declared, kLongestReason);
-    return name + meaningOf(name);
+    return name + meaningOf(name, textIn(missing, "TargetClassName"));
 }
 
 }  // namespace

@@ -41,6 +41,26 @@ class ServerCheckTest : public testing::Test {
         fans.server.onEnumerateInstances(name, Reply::ok(instances));
     }
 
+    /// The server says that the values of the property need root.
+    void addMissing(const std::string& className, const std::string& property) {
+        const std::string definition =
+            R"(<CLASS NAME="Velmira_MissingValue"><PROPERTY NAME="Reason" TYPE="uint16">)"
+            R"(<QUALIFIER NAME="ValueMap" TYPE="string"><VALUE.ARRAY><VALUE>3</VALUE></VALUE.ARRAY>)"
+            R"(</QUALIFIER><QUALIFIER NAME="Values" TYPE="string"><VALUE.ARRAY>)"
+            R"(<VALUE>Needs Root</VALUE></VALUE.ARRAY></QUALIFIER></PROPERTY></CLASS>)";
+        fans.server.onGetClass("Velmira_MissingValue", Reply::ok(definition));
+        fans.server.onEnumerateInstances(
+            "Velmira_MissingValue",
+            Reply::ok(instanceXml(
+                "Velmira_MissingValue", "m",
+                R"(<PROPERTY NAME="TargetClassName" TYPE="string"><VALUE>)" + className +
+                    R"(</VALUE></PROPERTY>)"
+                    R"(<PROPERTY NAME="PropertyName" TYPE="string"><VALUE>)" +
+                    property +
+                    R"(</VALUE></PROPERTY>)"
+                    R"(<PROPERTY NAME="Reason" TYPE="uint16"><VALUE>3</VALUE></PROPERTY>)")));
+    }
+
     FanServer fans;
     Velm::Properties texts;
     bool wantSizes = false;
@@ -255,23 +275,27 @@ TEST_F(ServerCheckTest, EmptyColumnsAndTheirReason) {
     wantNotes = true;
     EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Spare\n"),
               "4:6: note: CIM_Fan: 2 instances\n5:6: note: the column Spare is empty\n");
-    const std::string definition =
-        R"(<CLASS NAME="Velmira_MissingValue"><PROPERTY NAME="Reason" TYPE="uint16">)"
-        R"(<QUALIFIER NAME="ValueMap" TYPE="string"><VALUE.ARRAY><VALUE>3</VALUE></VALUE.ARRAY>)"
-        R"(</QUALIFIER><QUALIFIER NAME="Values" TYPE="string"><VALUE.ARRAY>)"
-        R"(<VALUE>Needs Root</VALUE></VALUE.ARRAY></QUALIFIER></PROPERTY></CLASS>)";
-    fans.server.onGetClass("Velmira_MissingValue", Reply::ok(definition));
-    fans.server.onEnumerateInstances(
-        "Velmira_MissingValue",
-        Reply::ok(instanceXml(
-            "Velmira_MissingValue", "m",
-            R"(<PROPERTY NAME="TargetClassName" TYPE="string"><VALUE>CIM_Fan</VALUE></PROPERTY>)"
-            R"(<PROPERTY NAME="PropertyName" TYPE="string"><VALUE>Spare</VALUE></PROPERTY>)"
-            R"(<PROPERTY NAME="Reason" TYPE="uint16"><VALUE>3</VALUE></PROPERTY>)")));
+    addMissing("CIM_Fan", "Spare");
     EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=Spare\n"),
               "4:6: note: CIM_Fan: 2 instances\n"
               "5:6: note: the column Spare is empty: Needs Root, run as root or let the service "
               "run\n");
+}
+
+// The service may not look into other users' processes, and root through it may not either.
+TEST_F(ServerCheckTest, WhatTheServiceCannotReadIsNotExpectedOfIt) {
+    wantNotes = true;
+    fans.server.onGetClass(
+        "Velmira_UnixProcess",
+        Reply::ok(R"(<CLASS NAME="Velmira_UnixProcess"><PROPERTY NAME="ModulePath" TYPE="string"/>)"
+                  R"(</CLASS>)"));
+    fans.server.onEnumerateInstances("Velmira_UnixProcess",
+                                     Reply::ok(instanceXml("Velmira_UnixProcess", "p", "")));
+    addMissing("Velmira_UnixProcess", "ModulePath");
+    EXPECT_EQ(check("G[0]=Velmira_UnixProcess\nA[0]=ModulePath\n"),
+              "4:6: note: Velmira_UnixProcess: 1 instance\n"
+              "5:6: note: the column ModulePath is empty: Needs Root, run as root by hand, without "
+              "the service\n");
 }
 
 TEST_F(ServerCheckTest, ColumnsWithoutASize) {
