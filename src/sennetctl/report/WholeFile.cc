@@ -3,9 +3,9 @@
 #include <Velm/TextFile.h>
 
 #include <cerrno>
-#include <filesystem>
-#include <fstream>
 #include <system_error>
+
+#include "velmclient/FileDescriptor.h"
 
 namespace sennetctl {
 
@@ -13,30 +13,40 @@ std::string causeOf(int error) {
     return error == 0 ? "input/output error" : std::generic_category().message(error);
 }
 
+namespace {
+
+std::string causeOfRefusal(int error) {
+    switch (error) {
+        case ENOENT:
+        case ENOTDIR:
+            return "there is no such file";
+        case EISDIR:
+        case EINVAL:
+        case ENXIO:  // a socket, which nothing opens
+            return "is no regular file";
+        default:
+            return causeOf(error);
+    }
+}
+
+}  // namespace
+
 std::string readWholeFile(const std::string& path, std::size_t limitOctets) {
-    std::error_code error;
-    const std::filesystem::file_status status = std::filesystem::status(path, error);
-    if (status.type() == std::filesystem::file_type::not_found) {
-        throw CannotRun(path, "there is no such file");
-    }
-    // A pipe or a terminal would keep the command waiting.
-    if (!error && status.type() != std::filesystem::file_type::regular) {
-        throw CannotRun(path, "is no regular file");
-    }
-    std::ifstream file(path, std::ios::binary);
-    if (!file) {
-        throw CannotRun(path, causeOf(errno));
+    const Velm::FileDescriptor file = Velm::FileDescriptor::openRegularFile(path.c_str());
+    if (!file.isOpen()) {
+        throw CannotRun(path, causeOfRefusal(errno));
     }
     std::string octets;
     char piece[64 * 1024];
-    while (file.read(piece, sizeof piece) || file.gcount() > 0) {
-        octets.append(piece, static_cast<std::size_t>(file.gcount()));
+    ssize_t count = 0;
+    while ((count = file.read(piece, sizeof piece)) > 0) {
+        octets.append(piece, static_cast<std::size_t>(count));
         if (octets.size() > limitOctets) {
             throw CannotRun(path, "is larger than " + std::to_string(limitOctets >> 20) +
                                       " MiB, which is the most that sennetctl reads of it");
         }
     }
-    if (file.bad()) {
+    if (count < 0) {
         throw CannotRun(path, causeOf(errno));
     }
     return octets;

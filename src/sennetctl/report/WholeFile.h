@@ -15,8 +15,8 @@ constexpr std::size_t kLargestFileOctets = std::size_t(16) << 20;
 /// The text for an error number that a call has left.
 std::string causeOf(int error);
 
-/// The octets of a regular file, links followed. Throws CannotRun, "PATH: reason", when it cannot
-/// be read or is larger than the limit.
+/// The octets of a regular file, links followed; never waits, whatever stands at the path. Throws
+/// CannotRun, "PATH: reason", when it cannot be read or is larger than the limit.
 std::string readWholeFile(const std::string& path, std::size_t limitOctets = kLargestFileOctets);
 
 /// Throws CannotRun, "PATH: exists already", when anything stands at the path.

@@ -1,10 +1,15 @@
 #include "report/WholeFile.h"
 
+#include <fcntl.h>
 #include <gtest/gtest.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
+#include <atomic>
 #include <csignal>
+#include <cstdio>
+#include <thread>
 
 #include "support/TempDirectory.h"
 
@@ -49,6 +54,63 @@ TEST(WholeFileTest, TellsWhyAFileIsNotRead) {
     const std::string large = directory.write("large", std::string((1 << 20) + 1, 'x'));
     EXPECT_EQ(failureOf(large, 1 << 20),
               large + ": is larger than 1 MiB, which is the most that sennetctl reads of it");
+}
+
+/// Puts a file and a pipe at a path, one after the other, and lets nobody who opens the pipe wait
+/// for good: such a reader finds an empty file.
+class Swapper {
+  public:
+    explicit Swapper(const support::TempDirectory& directory)
+        : file(directory.write("original", "x")),
+          pipe(directory.path("pipe")),
+          spare(directory.path("spare")),
+          path(directory.write("swapped", "x")) {
+        EXPECT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+        thread = std::thread([this] {
+            while (!done) {
+                put(file);
+                put(pipe);
+                ::close(::open(pipe.c_str(), O_WRONLY | O_NONBLOCK | O_CLOEXEC));
+            }
+        });
+    }
+    ~Swapper() {
+        done = true;
+        thread.join();
+    }
+    Swapper(const Swapper&) = delete;
+    Swapper& operator=(const Swapper&) = delete;
+
+    const std::string& place() const { return path; }
+
+  private:
+    void put(const std::string& original) const {
+        ::link(original.c_str(), spare.c_str());
+        ::rename(spare.c_str(), path.c_str());
+    }
+
+    std::string file;
+    std::string pipe;
+    std::string spare;
+    std::string path;
+    std::atomic<bool> done = false;
+    std::thread thread;
+};
+
+TEST(WholeFileTest, APipeThatTakesThePlaceOfAFileIsNotOpened) {
+    const support::TempDirectory directory;
+    const Swapper swapper(directory);
+    int files = 0;
+    int pipes = 0;
+    while (files < 300 || pipes < 300) {
+        try {
+            ASSERT_EQ(readWholeFile(swapper.place()), "x");
+            ++files;
+        } catch (const CannotRun& failure) {
+            ASSERT_EQ(failure.what(), swapper.place() + ": is no regular file");
+            ++pipes;
+        }
+    }
 }
 
 TEST(WholeFileTest, WritesEveryOctet) {
