@@ -77,57 +77,70 @@ bool isDate(std::string_view text) {
 }  // namespace
 
 void ValueChecker::check(const Value& value, const Type& type) const {
+    if (const std::optional<std::string> refusal = refusalOf(value, type)) {
+        throw Error(value.position, *refusal);
+    }
+}
+
+std::optional<std::string> ValueChecker::refusalOf(const Value& value, const Type& type) const {
     if (value.kind != Value::Kind::Integer && value.kind != Value::Kind::Text) {
-        return;
+        return std::nullopt;
     }
     const bool text = value.kind == Value::Kind::Text;
     if (isString(type.base)) {
         if (text) {
-            checkLength(value, type);
-        } else if (!tolerances.has(Tolerance::IntegersAsText)) {
-            throw Error(value.position, "integer where the type is a string");
+            return refusalOfLength(value, type);
         }
-    } else if (type.base == Type::Base::Date) {
-        checkDate(value);
-    } else if (!text) {
-        checkInteger(value, type.base);
-    } else if (!tolerances.has(Tolerance::TextAsIntegers)) {
-        throw Error(value.position, "literal where the type is an integer");
+        return tolerances.has(Tolerance::IntegersAsText)
+                   ? std::nullopt
+                   : std::optional<std::string>("integer where the type is a string");
     }
+    if (type.base == Type::Base::Date) {
+        return refusalOfDate(value);
+    }
+    if (!text) {
+        return refusalOfInteger(value, type.base);
+    }
+    return tolerances.has(Tolerance::TextAsIntegers)
+               ? std::nullopt
+               : std::optional<std::string>("literal where the type is an integer");
 }
 
-void ValueChecker::checkInteger(const Value& value, Type::Base base) const {
+std::optional<std::string> ValueChecker::refusalOfInteger(const Value& value,
+                                                          Type::Base base) const {
     if (base == Type::Base::Integer && tolerances.has(Tolerance::WideIntegers)) {
-        return;
+        return std::nullopt;
     }
     IntegerRange range = rangeOf(base);
     if (base == Type::Base::Integer && tolerances.has(Tolerance::UnsignedIntegers)) {
         range.largest = (1ULL << 32) - 1;
     }
     if (value.magnitude > (value.negative ? range.smallest : range.largest)) {
-        throw Error(value.position, std::string("integer beyond the type ") + range.description);
+        return std::string("integer beyond the type ") + range.description;
     }
+    return std::nullopt;
 }
 
-void ValueChecker::checkLength(const Value& value, const Type& type) const {
+std::optional<std::string> ValueChecker::refusalOfLength(const Value& value,
+                                                         const Type& type) const {
     if (value.text.size() > type.length && !tolerances.has(Tolerance::LongLiterals)) {
-        throw Error(value.position, "literal of " + std::to_string(value.text.size()) +
-                                        " octets where the type allows " +
-                                        std::to_string(type.length));
+        return "literal of " + std::to_string(value.text.size()) +
+               " octets where the type allows " + std::to_string(type.length);
     }
+    return std::nullopt;
 }
 
-void ValueChecker::checkDate(const Value& value) const {
+std::optional<std::string> ValueChecker::refusalOfDate(const Value& value) const {
     if (tolerances.has(Tolerance::AnyDates)) {
-        return;
+        return std::nullopt;
     }
     if (value.kind == Value::Kind::Text) {
         const bool empty = value.text.empty() && tolerances.has(Tolerance::EmptyDates);
         if (empty || isDate(value.text)) {
-            return;
+            return std::nullopt;
         }
     }
-    throw Error(value.position, "no date of the form yyyymmddHHMMSS.uuuuuu+ooo");
+    return "no date of the form yyyymmddHHMMSS.uuuuuu+ooo";
 }
 
 }  // namespace Mif

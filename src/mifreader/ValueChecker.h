@@ -2,6 +2,9 @@
 
 // Checks values against the type of their attribute.
 
+#include <optional>
+#include <string>
+
 #include "mifreader/Document.h"
 #include "mifreader/Tolerance.h"
 
@@ -11,14 +14,17 @@ class ValueChecker {
   public:
     explicit ValueChecker(Tolerances theTolerances) : tolerances(theTolerances) {}
 
-    // Throws Error at the value when it does not fit. Omitted, unsupported and asked values fit
-    // every type.
+    // Throws Error at the value when it does not fit.
     void check(const Value& value, const Type& type) const;
 
+    // Why the value does not fit; none when it does. Omitted, unsupported and asked values fit
+    // every type.
+    std::optional<std::string> refusalOf(const Value& value, const Type& type) const;
+
   private:
-    void checkInteger(const Value& value, Type::Base base) const;
-    void checkLength(const Value& value, const Type& type) const;
-    void checkDate(const Value& value) const;
+    std::optional<std::string> refusalOfInteger(const Value& value, Type::Base base) const;
+    std::optional<std::string> refusalOfLength(const Value& value, const Type& type) const;
+    std::optional<std::string> refusalOfDate(const Value& value) const;
 
     Tolerances tolerances;
 };

@@ -3,13 +3,21 @@
 #include <algorithm>
 #include <tuple>
 
+#include "report/Text.h"
+
 namespace sennetctl {
 
 namespace {
 
 constexpr std::size_t kMostFindings = 1000;
 
+constexpr std::size_t kLongestShown = 255;
+
 }  // namespace
+
+std::string shownInFinding(std::string_view latin1) {
+    return shortened(fromLatin1(latin1.substr(0, kLongestShown + 1)), kLongestShown);
+}
 
 void LintReport::add(LintRule rule, Mif::Position position, const std::string& message) {
     const std::optional<Severity> severity = severityOf(rule, profile);

@@ -3,6 +3,7 @@
 // Collects the findings in one file.
 
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "mif/LintRule.h"
@@ -10,6 +11,10 @@
 #include "report/Finding.h"
 
 namespace sennetctl {
+
+/// Octets of a file as a finding names them: in UTF-8, and of a long text only the first 255
+/// characters, the last of them an ellipsis.
+std::string shownInFinding(std::string_view latin1);
 
 class LintReport {
   public:

@@ -7,6 +7,7 @@
 
 #include "mif/LintReport.h"
 #include "mif/MifText.h"
+#include "mif/RowKeys.h"
 #include "mif/ValueLint.h"
 #include "mifreader/MifReader.h"
 #include "report/Text.h"
@@ -76,15 +77,17 @@ std::string readableOctets(std::string octets, MifProfile profile) {
     return octets;
 }
 
-std::vector<std::string> partsOf(const std::string& className) {
-    std::vector<std::string> parts(1);
-    for (const char c : className) {
-        if (c == '|') {
-            parts.emplace_back();
-        } else {
-            parts.back() += c;
-        }
+/// The texts between the bars; the last of them has all that follows the fourth bar.
+std::vector<std::string> partsOf(std::string_view className) {
+    constexpr std::size_t kMostParts = 5;
+    std::vector<std::string> parts;
+    std::size_t bar = className.find('|');
+    while (bar != std::string_view::npos && parts.size() + 1 < kMostParts) {
+        parts.emplace_back(className.substr(0, bar));
+        className.remove_prefix(bar + 1);
+        bar = className.find('|');
     }
+    parts.emplace_back(className);
     return parts;
 }
 
@@ -104,14 +107,14 @@ void checkClassName(const Group& group, LintReport& report) {
     const bool empty = std::any_of(parts.begin(), parts.end(),
                                    [](const std::string& part) { return part.empty(); });
     if (parts.size() != 3 || empty) {
-        report.add(
-            LintRule::ClassForm, group.classPosition,
-            "the class " + fromLatin1(group.className) + " is not of the form body|name|version");
+        report.add(LintRule::ClassForm, group.classPosition,
+                   "the class " + shownInFinding(group.className) +
+                       " is not of the form body|name|version");
     }
     if (isReserved(group.name) || std::any_of(parts.begin(), parts.end(), isReserved)) {
         report.add(LintRule::ReservedName, group.namePosition,
-                   "the group " + fromLatin1(group.name) + " of class " +
-                       fromLatin1(group.className) + " would alter the machine's own record");
+                   "the group " + shownInFinding(group.name) + " of class " +
+                       shownInFinding(group.className) + " would alter the machine's own record");
     }
     checkText(group.className, "class", group.classPosition, report);
 }
@@ -119,7 +122,7 @@ void checkClassName(const Group& group, LintReport& report) {
 void checkAttribute(const Mif::Attribute& attribute, LintReport& report) {
     if (!attribute.name.empty() && attribute.name.back() == ' ') {
         report.add(LintRule::FragileName, attribute.namePosition,
-                   "trailing blank in the name '" + fromLatin1(attribute.name) +
+                   "trailing blank in the name '" + shownInFinding(attribute.name) +
                        "': old versions refuse the file");
     }
     checkText(attribute.name, "name", attribute.namePosition, report);
@@ -152,36 +155,19 @@ void checkKeys(const Component& component, LintReport& report) {
     for (const Group& group : component.groups) {
         if (group.key.empty() && !withoutKey.insert(group.className).second) {
             report.add(LintRule::NoKey, group.classPosition,
-                       "one more instance of the class " + fromLatin1(group.className) +
+                       "one more instance of the class " + shownInFinding(group.className) +
                            ", which has no Key: it overwrites the others");
         }
     }
 }
 
-std::string keyText(const Mif::Value& value) {
-    return value.kind == Mif::Value::Kind::Integer
-               ? (value.negative ? "-" : "") + std::to_string(value.magnitude)
-               : value.text;
-}
-
-/// What tells a row from the others of its class.
-std::vector<std::string> keyOf(const Mif::Row& row, const Group& group) {
-    std::vector<std::string> key;
-    for (std::size_t place = 0; place < group.attributes.size(); ++place) {
-        const auto& ids = group.key;
-        if (std::find(ids.begin(), ids.end(), group.attributes[place].id) != ids.end()) {
-            key.push_back(keyText(row.at(group, place)));
-        }
-    }
-    return key;
-}
-
 void checkRowKeys(const Component& component, LintReport& report) {
-    std::map<std::size_t, std::set<std::vector<std::string>>> keysOfGroup;
+    std::map<std::size_t, RowKeys> keysOfGroup;
     for (const Table& table : component.tables) {
-        const Group& group = component.groups[table.group];
+        RowKeys& keys =
+            keysOfGroup.try_emplace(table.group, component.groups[table.group]).first->second;
         for (const Mif::Row& row : table.rows) {
-            if (!keysOfGroup[table.group].insert(keyOf(row, group)).second) {
+            if (keys.isRepeated(row)) {
                 report.add(LintRule::RepeatedKey,
                            row.values.empty() ? table.namePosition : row.values[0].position,
                            "one more row with the key of an earlier one: it overwrites that");
@@ -191,12 +177,14 @@ void checkRowKeys(const Component& component, LintReport& report) {
 }
 
 void checkTemplates(const Component& component, LintReport& report) {
+    std::vector<bool> used(component.groups.size());
+    for (const Table& table : component.tables) {
+        used[table.group] = true;
+    }
     for (std::size_t i = 0; i < component.groups.size(); ++i) {
-        const bool used = std::any_of(component.tables.begin(), component.tables.end(),
-                                      [i](const Table& table) { return table.group == i; });
-        if (component.groups[i].isTemplate() && !used) {
+        if (component.groups[i].isTemplate() && !used[i]) {
             report.add(LintRule::UnusedTemplate, component.groups[i].namePosition,
-                       "the group " + fromLatin1(component.groups[i].name) +
+                       "the group " + shownInFinding(component.groups[i].name) +
                            " describes rows, and no table has any");
         }
     }
@@ -252,14 +240,16 @@ std::vector<Finding> MifLint::check(const std::string& file, std::string_view oc
 
 void MifLint::checkAttributesOfClass(const Group& group, LintReport& report) {
     Names names;
+    std::set<std::string_view> present;
     for (const Mif::Attribute& attribute : group.attributes) {
         names.push_back(attribute.name);
+        present.insert(attribute.name);
     }
     for (const std::string& earlier : attributesByClass[group.className]) {
-        if (std::find(names.begin(), names.end(), earlier) == names.end()) {
+        if (present.count(earlier) == 0) {
             report.add(LintRule::LostAttribute, group.namePosition,
-                       "the attribute " + fromLatin1(earlier) + " of the class " +
-                           fromLatin1(group.className) +
+                       "the attribute " + shownInFinding(earlier) + " of the class " +
+                           shownInFinding(group.className) +
                            ", which an earlier file had, is missing: it becomes NULL");
         }
     }

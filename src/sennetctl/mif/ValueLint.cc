@@ -3,7 +3,6 @@
 #include <optional>
 
 #include "mifreader/ValueChecker.h"
-#include "report/Text.h"
 
 namespace sennetctl {
 
@@ -17,16 +16,6 @@ constexpr std::size_t kLongestKeptText = 255;
 bool isString(Type::Base base) {
     return base == Type::Base::String || base == Type::Base::DisplayString ||
            base == Type::Base::OctetString;
-}
-
-/// What the reader has against the value; none when it fits.
-std::optional<std::string> refusalOf(const Value& value, const Type& type) {
-    try {
-        Mif::ValueChecker({}).check(value, type);
-        return std::nullopt;
-    } catch (const Mif::Error& error) {
-        return error.message();
-    }
 }
 
 LintRule ruleFor(const Value& value, const Type& type) {
@@ -48,7 +37,7 @@ void checkValue(const Value& value, const Type& type, LintReport& report) {
                    "'unsupported' as a value: old versions refuse it");
         return;
     }
-    if (const std::optional<std::string> refusal = refusalOf(value, type)) {
+    if (const std::optional<std::string> refusal = Mif::ValueChecker({}).refusalOf(value, type)) {
         const LintRule rule = ruleFor(value, type);
         report.add(
             rule, value.position,
@@ -69,7 +58,7 @@ void checkText(const std::string& text, const std::string& what, Mif::Position p
                LintReport& report) {
     if (text.find('"') != std::string::npos) {
         report.add(LintRule::FragileName, position,
-                   "double quote in the " + what + " " + fromLatin1(text) +
+                   "double quote in the " + what + " " + shownInFinding(text) +
                        ": old versions refuse the file");
     }
 }

@@ -101,6 +101,49 @@ TEST(MifLintTest, RowsWithOneKey) {
     EXPECT_EQ(severities(mifOf(tableMif(2, "Fan", "{ 1, \"a\", 3 }\n{ , \"b\", 4 }\n"))), "EEWW");
 }
 
+// Two texts of which one is the default of the group, an integer and a text of its digits, and keys
+// that only look alike when they are strung together.
+TEST(MifLintTest, KeysOfSeveralAttributes) {
+    const std::string group =
+        "Start Group Name = \"Fan\" Class = \"Own|Fan|001\" Key = 3, 1\n" +
+        attributeMif(1, "Slot", "String(9)", "\"a\"") + attributeMif(2, "Speed", "Integer", "7") +
+        attributeMif(3, "Bus", "String(9)", "\"1\"") +
+        "End Group\nStart Table Name = \"Fan\" Class = \"Own|Fan|001\" Id = 2\n";
+    const auto keys = [&group](const std::string& rows) {
+        return told(check(MifProfile::LanDesk, mifOf(group + rows + "End Table\n")));
+    };
+    const std::string repeated =
+        "21:3: warning: one more row with the key of an earlier one: it overwrites that\n";
+    EXPECT_EQ(keys("{ \"b\" }\n{ \"a\" }\n{ \"b\", 1, \"2\" }\n{ , 1, \"2\" }\n"), "");
+    EXPECT_EQ(keys("{ \"a\", 1, \"1\" }\n{ , 2 }\n"), repeated);
+    EXPECT_EQ(keys("{ , 1, 1 }\n{ \"a\" }\n"), repeated);
+    EXPECT_EQ(keys("{ \"a1\", 1, \"\" }\n{ \"\", 1, \"a1\" }\n"), "");
+    EXPECT_EQ(keys("{ \"x\", 1, \"2:1\" }\n{ \"x2:1\", 1, \"\" }\n"), "");
+}
+
+// Rows of two octets stand for keys of two thousand values, or of one of a million octets.
+TEST(MifLintTest, ShortRowsOfLongKeysTakeNoLongerThanTheirTextIs) {
+    std::string key = "1";
+    std::string attributes =
+        attributeMif(1, "A1", "String(9)", "\"" + std::string(1 << 20, 'x') + "\"");
+    for (int i = 2; i <= 2000; ++i) {
+        key += "," + std::to_string(i);
+        attributes += attributeMif(i, "A" + std::to_string(i), "Integer", "1");
+    }
+    std::string rows;
+    for (int i = 0; i < 20000; ++i) {
+        rows += "{}";
+    }
+    const std::vector<Finding> findings =
+        check(MifProfile::Sms,
+              mifOf("Start Group Name = \"Fan\" Class = \"Own|Fan|001\" Key = " + key + "\n" +
+                    attributes +
+                    "End Group\nStart Table Name = \"Fan\" Class = \"Own|Fan|001\" Id = 2\n" +
+                    rows + "End Table\n"));
+    ASSERT_EQ(findings.size(), 1001U);
+    EXPECT_EQ(findings[1000].message, "there are more findings, which are not told");
+}
+
 TEST(MifLintTest, ClassesOfTheMachinesOwnRecord) {
     const std::string attribute = attributeMif(1, "Speed", "Integer", "7");
     EXPECT_EQ(severities(mifOf(groupMif(2, "ARCHITECTURE", "Own|Fan|001", attribute))), "-E--");
@@ -166,6 +209,17 @@ TEST(MifLintTest, TemplatesWithoutATable) {
               "WWWW");
 }
 
+TEST(MifLintTest, OnlyTheTemplatesWithoutATableAreTold) {
+    const auto group = [](const std::string& name) {
+        return "Start Group Name = \"" + name + "\" Class = \"Own|" + name + "|001\" Key = 1\n" +
+               attributeMif(1, "Index", "Integer", "1") + "End Group\n";
+    };
+    const std::string table = "Start Table Name = \"B\" Class = \"Own|B|001\" Id = 2 End Table\n";
+    EXPECT_EQ(told(check(MifProfile::Sms, mifOf(group("A") + group("B") + group("C") + table))),
+              "14:20: warning: the group A describes rows, and no table has any\n"
+              "20:20: warning: the group C describes rows, and no table has any\n");
+}
+
 TEST(MifLintTest, PlainBackslashesAreForOneProductOnly) {
     EXPECT_EQ(severities(withAttribute("String(9)", "\"C:\\dir\"")), "EE-E");
 }
@@ -188,6 +242,37 @@ TEST(MifLintTest, NobodyReadsMoreThanAThousandFindings) {
     const std::vector<Finding> findings = check(MifProfile::Sms, mifOf(tableMif(2, "Fan", rows)));
     ASSERT_EQ(findings.size(), 1001U);
     EXPECT_EQ(findings.back().message, "there are more findings, which are not told");
+}
+
+TEST(MifLintTest, LongTextsAreToldByTheirBegin) {
+    const auto finding = [](const std::string& name) {
+        return check(MifProfile::Sms, withAttribute("Integer", "7", name)).at(0).message;
+    };
+    EXPECT_EQ(finding("\xE9" + std::string(253, 'x') + " "),
+              "trailing blank in the name '\xC3\xA9" + std::string(253, 'x') +
+                  " ': old versions refuse the file");
+    EXPECT_EQ(finding("\xE9" + std::string(254, 'x') + " "),
+              "trailing blank in the name '\xC3\xA9" + std::string(253, 'x') +
+                  "\xE2\x80\xA6': old versions refuse the file");
+}
+
+// A thousand findings that each tell a class of a million octets, of two thousand that there are.
+TEST(MifLintTest, AClassWithALongNameMayLoseManyAttributes) {
+    LintOptions options;
+    options.profile = MifProfile::Sms;
+    MifLint lint(options);
+    const std::string className = "Own|" + std::string(1 << 20, 'x') + "|001";
+    std::string attributes;
+    for (int i = 1; i <= 2000; ++i) {
+        attributes += attributeMif(i, "A" + std::to_string(i), "Integer", "1");
+    }
+    lint.check("old", mifOf(groupMif(2, "Fan", className, attributes)));
+    const std::vector<Finding> findings = lint.check(
+        "new", mifOf(groupMif(2, "Fan", className, attributeMif(1, "B", "Integer", "1"))));
+    ASSERT_EQ(findings.size(), 1001U);
+    EXPECT_EQ(findings[1].message, "the attribute A1 of the class Own|" + std::string(250, 'x') +
+                                       "\xE2\x80\xA6, which an earlier file had, is missing: it "
+                                       "becomes NULL");
 }
 
 TEST(MifLintTest, LargeFiles) {
