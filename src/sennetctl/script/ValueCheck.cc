@@ -22,6 +22,7 @@ constexpr std::size_t kLongestDate = 8;  // for QVE
 
 /// What the generator keeps to itself.
 struct Rules : SennetConverter {
+    using SennetConverter::escape;
     using SennetConverter::isCalendarDateTime;
 };
 
@@ -154,6 +155,7 @@ struct Losses {
     std::size_t blanked = 0;
     std::size_t quoted = 0;
     std::size_t lineEnds = 0;
+    std::size_t hiddenEnds = 0;  // of literals of CA
     std::size_t wide = 0;
     std::size_t noDates = 0;
     std::size_t missing = 0;
@@ -195,6 +197,14 @@ bool hasAny(const String& text, std::size_t written, Is is) {
     return std::any_of(begin, begin + written, [&](Char16 c) { return is(Uint16(c)); });
 }
 
+/// Whether the quote behind the text is taken for a part of it where CA reads it. References and
+/// the like are cut after they were escaped.
+bool hidesEndForCa(const String& text, std::size_t limit) {
+    const String written = limit == kLongestOther ? Rules::escape(text, "\r\n\"") : text;
+    const std::size_t size = std::min<std::size_t>(written.size(), limit);
+    return size > 0 && Uint16(written[static_cast<Uint32>(size - 1)]) == '\\';
+}
+
 void countText(const String& text, std::size_t limit, const Widths& widths, Losses& losses) {
     const std::size_t written = std::min<std::size_t>(text.size(), limit);
     losses.cut += text.size() > limit ? 1 : 0;
@@ -202,6 +212,7 @@ void countText(const String& text, std::size_t limit, const Widths& widths, Loss
     losses.longerThanSqlColumn += widths.inSql > 0 && written > widths.inSql ? 1 : 0;
     losses.blanked += hasAny(text, written, becomesBlank) ? 1 : 0;
     losses.quoted += hasAny(text, written, [](Uint16 c) { return c == '"'; }) ? 1 : 0;
+    losses.hiddenEnds += hidesEndForCa(text, limit) ? 1 : 0;
     losses.lineEnds +=
         hasAny(text, written, [](Uint16 c) { return c == '\r' || c == '\n'; }) ? 1 : 0;
 }
@@ -296,6 +307,9 @@ std::vector<ValueRemark> remarksOn(const Column& column, const AnsweredClass& an
     add(losses.lineEnds,
         " with a line end, which is written as it is: readers that keep to the standard refuse it",
         Severity::Note);
+    add(losses.hiddenEnds,
+        " with a backslash at the end: the file of all scripts cannot be read by CA",
+        Severity::Error);
     add(losses.wide, " beyond 32 bits with sign: another number is written");
     add(losses.noDates, " no date from 1900 to 2099: " + standIn + " is written");
     if (losses.present > 0 && !standIn.empty()) {

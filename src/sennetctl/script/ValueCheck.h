@@ -18,9 +18,10 @@ struct ValueRemark {
 };
 
 /// A remark for each way in which the files show something else than the values: texts that are cut
-/// or longer than the column, letters that become blanks, double quotes and line ends, numbers that
-/// do not survive 32 bits, dates that are none for the products, what stands for values that are
-/// missing in some rows, and a size that is too little for other values of the type.
+/// or longer than the column, letters that become blanks, double quotes and line ends, backslashes
+/// that hide the end of a literal, numbers that do not survive 32 bits, dates that are none for the
+/// products, what stands for values that are missing in some rows, and a size that is too little
+/// for other values of the type.
 std::vector<ValueRemark> remarksOn(const Column& column, const AnsweredClass& answered,
                                    const Velm::Properties& texts);
 

@@ -30,6 +30,8 @@ COLUMNS = {
     "Tabbed": ("string", r'"a\tb"', "a b", "control characters"),
     "Lines": ("string", r'"a\nb"', "a\\\nb", "1 value of Lines with a line end"),
     "Quoted": ("string", r'"a \"b\""', 'a \\"b\\"', "1 value of Quoted with a double quote"),
+    "Inside": ("string", r'"C:\\Temp"', r"C:\\Temp", None),
+    "Ended": ("string", r'"x\\"', r"x\\", "1 value of Ended with a backslash at the end"),
     "Begun": ("datetime", '"20260102030405.000000+060"', "20260102030405.000000+060", None),
     "Never": ("datetime", None, UNKNOWN, f"the column Never is empty; {UNKNOWN}"),
     "Lasted": ("datetime", '"00000001000000.000000:000"', UNKNOWN, "no date from 1900 to 2099"),
@@ -77,16 +79,16 @@ class ValuesTest(unittest.TestCase):
         cls.texts.write_text("".join(f"Example_Thing.{name}.Size={size}\n"
                                      for name, size in SIZES.items())
                              + "Example_Thing.Label=L\xfcfter\n", encoding="latin-1")
-        programs = installation.programs_of(ARGUMENTS)
-        server = cls.enterClassContext(installation.Cimomd(
-            programs, cls.place, ARGUMENTS.machines.resolve() / "server", own))
-        run = installation.Run(programs, "SMS", cls.place, server.socket, cls.inventory)
+        cls.programs = installation.programs_of(ARGUMENTS)
+        cls.server = cls.enterClassContext(installation.Cimomd(
+            cls.programs, cls.place, ARGUMENTS.machines.resolve() / "server", own))
+        run = installation.Run(cls.programs, "SMS", cls.place, cls.server.socket, cls.inventory)
         file, = run.files()
         cls.mif = file.read_bytes().decode("latin-1").replace("\r\n", "\n")
         result = subprocess.run(
             [ARGUMENTS.programs.resolve() / "sennetctl", "check", "--json",
              "--translations"], capture_output=True, text=True, timeout=60, check=False,
-            env={"CIM_LOCAL_SOCKET": str(server.socket), "PATH": os.environ["PATH"],
+            env={"CIM_LOCAL_SOCKET": str(cls.server.socket), "PATH": os.environ["PATH"],
                  "VELM_CONFIG": str(cls.place / "SMS/velm.properties")})
         cls.document = json.loads(result.stdout)
         cls.found = cls.document["findings"]
@@ -95,6 +97,26 @@ class ValuesTest(unittest.TestCase):
         """What is told of the values of a column."""
         return [each["message"] for each in self.found
                 if re.search(rf"\b(values?|column)\b.* {name}\b", each["message"])]
+
+    def test_backslashes_that_spoil_the_file_of_ca(self):
+        for column, is_told in (("Inside", False), ("Ended", True)):
+            with self.subTest(column=column):
+                place = pathlib.Path(self.enterContext(
+                    tempfile.TemporaryDirectory(prefix="sennet-values-")))
+                inventory = place / "inventory"
+                inventory.mkdir()
+                (inventory / "sennet.properties").touch()
+                (inventory / "thing.script.inv").write_text(
+                    "[DEFAULT]\ntitle=Things\n[CIM]\nG[0]=Example_Thing\nN[0]=root/cimv2\n"
+                    f"A[0]=Label,{column},Odd\n")
+                run = installation.Run(self.programs, "CA", place, self.server.socket, inventory)
+                checked = subprocess.run(
+                    [ARGUMENTS.programs.resolve() / "sennetctl", "mif", "check", "--profile", "ca",
+                     *run.files()], capture_output=True, text=True, timeout=60, check=False)
+                self.assertEqual(": error: " in checked.stdout, is_told, checked.stdout)
+                severities = [each["severity"] for each in self.found
+                              if f" of {column} with a backslash" in each["message"]]
+                self.assertEqual(severities, ["error"] if is_told else [])
 
     def test_cells(self):
         row = re.search(r"^ *\{ 1, (.*)\}$", self.mif, re.M | re.S)[1]

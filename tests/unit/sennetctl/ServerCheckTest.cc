@@ -229,6 +229,27 @@ TEST_F(ServerCheckTest, DoubleQuotesAndLineEndsInValues) {
               "that keep to the standard refuse it\n");
 }
 
+TEST_F(ServerCheckTest, BackslashesAtTheEndOfValues) {
+    const auto told = [](const std::string& count) {
+        return "5:6: error: " + count +
+               " of DeviceID with a backslash at the end: the file of all scripts cannot be read "
+               "by CA\n";
+    };
+    fans.setFans(fanXml("C:\\Temp", "2", "1"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"), "");
+    fans.setFans(fanXml("x\\", "2", "1") + fanXml("y\\\\", "2", "1") + fanXml("z", "2", "1"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"), told("2 values"));
+    texts.set("CIM_Fan.DeviceID.Size", "255");
+    fans.setFans(fanXml(std::string(254, 'x') + "\\", "2", "1"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"), told("1 value"));
+    fans.setFans(fanXml(std::string(254, 'x') + "\\x", "2", "1"));
+    EXPECT_NE(check("G[0]=CIM_Fan\nA[0]=DeviceID\n").find(told("1 value")), std::string::npos)
+        << "the value is cut behind the backslash";
+    fans.setFans(fanXml(std::string(255, 'x') + "\\", "2", "1"));
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n").find("backslash"), std::string::npos)
+        << "the value is cut before it";
+}
+
 TEST_F(ServerCheckTest, SizesThatAreLessThanTheTypeNeeds) {
     wantNotes = true;
     const std::string counted = "4:6: note: CIM_Fan: 2 instances\n";
