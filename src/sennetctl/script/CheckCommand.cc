@@ -102,11 +102,11 @@ class ScriptChecker {
         std::error_code error;
         const std::filesystem::directory_iterator listed(directory, error);
         if (error == std::errc::no_such_file_or_directory) {
-            fail("there is no directory " + directory + " of inventory scripts");
+            fail("there is no directory '" + directory + "' of inventory scripts");
         } else if (error) {
-            fail("the directory " + directory + " of inventory scripts: " + error.message());
+            fail("the directory '" + directory + "' of inventory scripts: " + error.message());
         } else if (scripts.empty()) {
-            fail("there are no inventory scripts in " + directory);
+            fail("there are no inventory scripts in '" + directory + "'");
         }
         return scripts;
     }
@@ -122,7 +122,17 @@ class ScriptChecker {
         result.files.push_back(file);
         std::vector<Finding> found = findingsIn(file, octets);
         takeOver(found);
-        takeOver(foundInKeys);
+    }
+
+    /// To be called behind the last script.
+    void checkKeys() {
+        if (keys) {
+            std::vector<Finding> found;
+            keys->tell(options.scripts.empty() && result.failures.empty() &&
+                           result.server != ServerPart::BrokeDown,
+                       found);
+            takeOver(found);
+        }
     }
 
     /// Returns the exit status, which is kCannotRun where some script was not read.
@@ -158,6 +168,9 @@ class ScriptChecker {
         if (answers && !model.givenUp) {
             askServer(model, found);
         }
+        if (keys && !model.givenUp) {
+            keys->look(model);
+        }
         if (options.translations && keys) {
             checkTranslations(model, texts.getProperties(), found);
         }
@@ -169,9 +182,6 @@ class ScriptChecker {
             ServerCheck(answers->server, answers->missing, texts.getProperties(),
                         {keys && options.translations, keys.has_value()}, found)
                 .check(model);
-            if (keys) {
-                keys->check(model, foundInKeys);
-            }
         } catch (const CannotRun& failure) {
             loseServer(ServerPart::BrokeDown, failure,
                        "from " + model.file + " on only the scripts themselves are checked");
@@ -188,8 +198,7 @@ class ScriptChecker {
 
     const CheckOptions& options;
     Velm::PropertiesFile texts;
-    std::optional<KeySpelling> keys;  // of the texts; without them each name would be told
-    std::vector<Finding> foundInKeys;
+    std::optional<KeySpelling> keys;   // of the texts; without them each name would be told
     std::unique_ptr<Answers> answers;  // none when there is no server
     TitleCheck titles;
     CheckResult result;
@@ -210,6 +219,7 @@ int checkScripts(const CheckOptions& options, const Output& output) {
                           std::to_string(files.size()) + ": " + files[i]);
             checker.check(files[i]);
         }
+        checker.checkKeys();
     }
     return checker.tell(output);
 }

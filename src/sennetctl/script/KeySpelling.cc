@@ -1,20 +1,32 @@
 #include "script/KeySpelling.h"
 
-#include <algorithm>
+#include <map>
 #include <optional>
 #include <utility>
 
 #include "properties/PropertiesEntries.h"
+#include "script/NameCheck.h"
+#include "script/ScriptText.h"
 
 namespace sennetctl {
 
 namespace {
 
-std::string inSmallLetters(std::string text) {
-    std::transform(text.begin(), text.end(), text.begin(), [](char c) {
-        return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-    });
-    return text;
+constexpr std::string_view kTitle = "title.";
+constexpr std::string_view kSize = ".Size";
+
+bool beginsWith(std::string_view text, std::string_view beginning) {
+    return text.substr(0, beginning.size()) == beginning;
+}
+
+bool endsWith(std::string_view text, std::string_view end) {
+    return text.size() >= end.size() && text.substr(text.size() - end.size()) == end;
+}
+
+/// What is wrong with these parts is told of every key.
+bool hasSameParts(std::string_view one, std::string_view other) {
+    return beginsWith(one, kTitle) == beginsWith(other, kTitle) &&
+           endsWith(one, kSize) == endsWith(other, kSize);
 }
 
 }  // namespace
@@ -22,33 +34,38 @@ std::string inSmallLetters(std::string text) {
 KeySpelling::KeySpelling(std::string theFile, std::string_view octets) : file(std::move(theFile)) {
     Velm::PropertiesEntries entries(octets);
     while (const std::optional<Velm::PropertiesEntry> entry = entries.next()) {
-        keys.emplace(inSmallLetters(entry->key), Key{entry->key, entry->line, entry->keyColumn});
+        keys.insert_or_assign(entry->key, Place{entry->line, entry->keyColumn});
     }
 }
 
-void KeySpelling::check(const ScriptModel& model, std::vector<Finding>& findings) {
+void KeySpelling::look(const ScriptModel& model) {
+    wanted.insert(titleKey(ownTitle(model)));
     for (const ScriptSlot& slot : model.slots) {
         if (slot.serverSpelling.empty()) {
             continue;
         }
         for (const ScriptText& property : slot.properties) {
             const std::string key = slot.serverSpelling + "." + property.value;
-            checkKey(key, findings);
-            checkKey(key + ".Size", findings);
+            wanted.insert(key);
+            wanted.insert(key + std::string(kSize));
         }
     }
 }
 
-void KeySpelling::checkKey(const std::string& wanted, std::vector<Finding>& findings) {
-    const auto [first, last] = keys.equal_range(inSmallLetters(wanted));
-    if (std::any_of(first, last, [&](const auto& known) { return known.second.text == wanted; })) {
-        return;
+void KeySpelling::tell(bool areAll, std::vector<Finding>& findings) const {
+    std::map<std::string, std::string> missing;
+    for (const std::string& key : wanted) {
+        if (keys.count(key) == 0) {
+            missing.emplace(inSmallLetters(key), key);
+        }
     }
-    for (auto known = first; known != last; ++known) {
-        Key& key = known->second;
-        if (!std::exchange(key.isTold, true)) {
-            findings.push_back({file, key.line, key.column, Severity::Warning,
-                                "line without effect: sennet looks for " + wanted});
+    const std::string effect =
+        areAll ? "line without effect" : "line without effect on these scripts";
+    for (const auto& [key, place] : keys) {
+        const auto meant = missing.find(inSmallLetters(key));
+        if (meant != missing.end() && wanted.count(key) == 0 && hasSameParts(key, meant->second)) {
+            findings.push_back({file, place.line, place.column, Severity::Warning,
+                                effect + ": sennet looks for " + meant->second});
         }
     }
 }

@@ -3,6 +3,7 @@
 // Keys of the resource properties that miss what sennet looks up by the case of a letter.
 
 #include <map>
+#include <set>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -17,23 +18,24 @@ class KeySpelling {
     /// Takes the keys of the octets of such a file, which is named in the findings.
     KeySpelling(std::string file, std::string_view octets);
 
-    /// Appends a finding for each key that is meant for a column of the script, unless the right
-    /// key is there, too. Each key is told once, also when several scripts have the column. Classes
-    /// are looked up as the server writes them; those that no server told are passed over.
-    void check(const ScriptModel& model, std::vector<Finding>& findings);
+    /// Remembers what sennet looks up for the script: its title, and the columns of the classes
+    /// that the server told, as it writes them.
+    void look(const ScriptModel& model);
+
+    /// Appends a finding for each key that differs from one that a script needs in the case of
+    /// letters only, unless a script needs it as it is or the right key is there, too.
+    /// @param areAll  whether all scripts were looked at, so that no other one may need the key
+    void tell(bool areAll, std::vector<Finding>& findings) const;
 
   private:
-    struct Key {
-        std::string text;
+    struct Place {
         unsigned line = 0;
         unsigned column = 0;
-        bool isTold = false;
     };
 
-    void checkKey(const std::string& wanted, std::vector<Finding>& findings);
-
     std::string file;
-    std::multimap<std::string, Key> keys;  // by their text in small letters
+    std::map<std::string, Place> keys;  // the last of equal ones, which counts
+    std::set<std::string> wanted;
 };
 
 }  // namespace sennetctl

@@ -7,6 +7,7 @@
 #include <map>
 #include <optional>
 #include <system_error>
+#include <utility>
 
 #include "properties/PropertiesEntries.h"
 #include "report/Text.h"
@@ -39,12 +40,23 @@ bool hasBlank(std::string_view text) {
     return text.find_first_of(" \t") != std::string_view::npos;
 }
 
+/// The line of the last entry of each key.
+std::map<std::string, unsigned> lastLinesIn(std::string_view octets) {
+    std::map<std::string, unsigned> lines;
+    Velm::PropertiesEntries entries(octets);
+    while (std::optional<PropertiesEntry> entry = entries.next()) {
+        lines.insert_or_assign(std::move(entry->key), entry->line);
+    }
+    return lines;
+}
+
 class PropertiesLint {
   public:
     PropertiesLint(const std::string& theFile, std::vector<Finding>& theFindings)
         : file(theFile), findings(theFindings) {}
 
-    /// What holds for every such file; `check` is called with each entry that has a key.
+    /// What holds for every such file; `check` is called with each entry that has a key and that no
+    /// later one replaces.
     template <typename Check>
     void run(std::string_view octets, Check check) {
         if (octets.substr(0, 2) == "\xFE\xFF" || octets.substr(0, 2) == "\xFF\xFE") {
@@ -53,16 +65,22 @@ class PropertiesLint {
                 "UTF-8");
             return;
         }
+        const std::map<std::string, unsigned> lastLines = lastLinesIn(octets);
         Velm::PropertiesEntries entries(octets);
         while (const std::optional<PropertiesEntry> entry = entries.next()) {
-            noteEncoding(*entry);
+            const bool isReplaced = entry->line < lastLines.at(entry->key);
+            if (!isReplaced) {
+                noteEncoding(*entry);
+            }
             if (entry->key.empty()) {
                 add(Severity::Warning, entry->line, entry->keyColumn,
                     "line without effect: it has no key");
                 continue;
             }
             tellReplaced(*entry);
-            check(*entry);
+            if (!isReplaced) {
+                check(*entry);
+            }
         }
         tellEncoding();
     }

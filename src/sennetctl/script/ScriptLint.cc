@@ -1,6 +1,9 @@
 #include "script/ScriptLint.h"
 
 #include <algorithm>
+#include <filesystem>
+#include <map>
+#include <utility>
 
 #include "script/ScriptText.h"
 
@@ -77,8 +80,8 @@ class Checker {
 
     void giveUp(const ScriptText& place, const char* kind, bool (*isLegal)(const std::string&)) {
         model.givenUp = true;
-        // What is only blanks has been told where it was read.
-        if (!trimmed(place.value).empty()) {
+        // What is only blanks has been told where it was read, but for what need not be used.
+        if (!trimmed(place.value).empty() || &place == &model.defaultNamespace) {
             add(Severity::Error, place,
                 "'" + place.value + "' is no name of a " + kind + adviceOn(place.value, isLegal) +
                     kGivenUp);
@@ -92,6 +95,10 @@ class Checker {
             !sameIgnoringCase(std::string_view(file).substr(file.size() - length), kSuffix)) {
             add(Severity::Warning, {},
                 "the file's name does not end in .script.inv: sennet does not read it");
+        } else if (std::filesystem::path(file).filename().string().size() == length) {
+            add(Severity::Warning, {},
+                "the file's name has nothing before .script.inv: for SMS and LANDesk sennet writes "
+                "no file");
         }
     }
 
@@ -109,12 +116,11 @@ class Checker {
         }
         checkClass(slot, number);
         checkNamespace(slot);
-        if (slot.propertyList.line == 0) {
-            add(Severity::Warning, slot.className,
-                "slot " + std::to_string(number) +
-                    " has no property list: its rows get an empty cell that no column is for");
+        if (scriptTokens(slot.propertyList.value, ", ").empty()) {
+            tellNoProperties(slot, number);
         }
         readProperties(slot);
+        tellRepeated(slot);
     }
 
     void checkClass(const ScriptSlot& slot, std::size_t number) {
@@ -135,9 +141,17 @@ class Checker {
     void checkNamespace(const ScriptSlot& slot) {
         const bool own = !slot.nameSpace.value.empty();
         const ScriptText& text = own ? slot.nameSpace : model.defaultNamespace;
-        if (!isLegalNamespace(text.value)) {
+        const bool isTold = !own && std::exchange(isDefaultUsed, true);
+        if (!isTold && !isLegalNamespace(text.value)) {
             giveUp(text, "namespace", isLegalNamespace);
         }
+    }
+
+    void tellNoProperties(const ScriptSlot& slot, std::size_t number) {
+        const bool isMissing = slot.propertyList.line == 0;
+        add(Severity::Warning, isMissing ? slot.className : slot.propertyList,
+            "slot " + std::to_string(number) + " has " + (isMissing ? "no" : "an empty") +
+                " property list: its rows get an empty cell that no column is for");
     }
 
     void readProperties(ScriptSlot& slot) {
@@ -171,24 +185,31 @@ class Checker {
                                      : adviceOn(property.value, isLegalName));
             return;
         }
-        const bool repeated = std::any_of(
-            slot.properties.begin(), slot.properties.end(),
-            [&](const ScriptText& other) { return sameIgnoringCase(other.value, property.value); });
-        if (repeated) {
-            add(Severity::Warning, property,
-                "the property " + property.value + " is listed twice, and so gets two columns");
-        }
         slot.properties.push_back(property);
+    }
+
+    /// At its second place, and once however often it is listed.
+    void tellRepeated(const ScriptSlot& slot) {
+        std::map<std::string, std::vector<const ScriptText*>> places;
+        for (const ScriptText& property : slot.properties) {
+            places[inSmallLetters(property.value)].push_back(&property);
+        }
+        for (const auto& [name, same] : places) {
+            if (same.size() > 1) {
+                const std::string count = std::to_string(same.size());
+                add(Severity::Warning, *same[1],
+                    "the property " + same[1]->value + " is listed " +
+                        (same.size() == 2 ? "twice, and so gets two"
+                                          : count + " times, and so gets " + count) +
+                        " columns");
+            }
+        }
     }
 
     ScriptModel& model;
     std::vector<Finding>& findings;
+    bool isDefaultUsed = false;
 };
-
-std::string withUnderscores(std::string text) {
-    std::replace(text.begin(), text.end(), ' ', '_');
-    return text;
-}
 
 }  // namespace
 
@@ -205,7 +226,7 @@ void checkTranslations(const ScriptModel& model, const Velm::Properties& texts,
         }
     };
     if (!model.title.value.empty()) {
-        require(model.title, "title." + withUnderscores(model.title.value));
+        require(model.title, titleKey(model.title.value));
     }
     for (const ScriptSlot& slot : model.slots) {
         // The generator takes the class as the server writes it.

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <utility>
 
 #include "report/Text.h"
 #include "script/ScriptText.h"
@@ -33,6 +34,17 @@ std::size_t columnOf(const std::string& line, const std::string& value) {
     const std::size_t separator = line.find('=');
     const std::size_t begin = line.find(value, separator == std::string::npos ? 0 : separator);
     return begin == std::string::npos ? 1 : begin + 1;
+}
+
+/// The entry of a letter, and what it is called.
+std::pair<ScriptText*, const char*> entryOf(char letter, ScriptSlot& slot) {
+    if (letter == 'G' || letter == 'g') {
+        return {&slot.className, "class"};
+    }
+    if (letter == 'N' || letter == 'n') {
+        return {&slot.nameSpace, "namespace"};
+    }
+    return {&slot.propertyList, "properties"};
 }
 
 bool isLetter(const std::string& text) {
@@ -70,6 +82,7 @@ ScriptModel ScriptReader::read(std::string_view octets) {
         readLine(line);
         begin = end + 1;
     }
+    tellEntries();
     return model;
 }
 
@@ -162,13 +175,16 @@ void ScriptReader::readDefault(const std::string& line) {
                          "; there are title and defaultnamespace");
         return;
     }
+    ScriptText& entry = isTitle ? model.title : model.defaultNamespace;
+    store(entry, line, tokens[1], isTitle ? "title" : "namespace");
     if (tokens.size() > 2) {
-        add(Severity::Warning, "only " + quoted(tokens[1]) +
-                                   " is taken: a second '=' or a tab ends "
-                                   "the value");
+        addToEntry(entry, Severity::Warning,
+                   "only " + quoted(tokens[1]) + " is taken: a second '=' or a tab ends the value");
     }
-    store(isTitle ? model.title : model.defaultNamespace, line, tokens[1],
-          isTitle ? "title" : "namespace");
+    if (isTitle && trimmed(tokens[1]) != tokens[1]) {
+        addToEntry(entry, Severity::Warning,
+                   "the title " + quoted(tokens[1]) + " begins or ends with a blank", entry.column);
+    }
 }
 
 void ScriptReader::readCim(const std::string& line) {
@@ -213,31 +229,25 @@ void ScriptReader::storeCim(const std::string& line, const std::vector<std::stri
         add(Severity::Warning,
             "slot number " + quoted(tokens[1]) + " is read as " + std::to_string(slot), 3);
     }
-    ScriptSlot& target = model.slots[static_cast<std::size_t>(slot)];
+    const auto [entry, kind] = entryOf(tokens[0][0], model.slots[static_cast<std::size_t>(slot)]);
+    store(*entry, line, tokens[2], kind + std::string(" of slot ") + std::to_string(slot));
     if (trimmed(tokens[2]).empty()) {
-        tellBlank(tokens);
+        tellBlank(*entry, tokens);
     } else if (tokens.size() > 3) {
-        add(Severity::Warning, "only " + quoted(tokens[2]) +
-                                   " is taken: a bracket, a second '=' or a tab ends the value");
-    }
-    const char letter = tokens[0][0];
-    if (letter == 'G' || letter == 'g') {
-        store(target.className, line, tokens[2], "class of slot " + std::to_string(slot));
-    } else if (letter == 'N' || letter == 'n') {
-        store(target.nameSpace, line, tokens[2], "namespace of slot " + std::to_string(slot));
-    } else {
-        store(target.propertyList, line, tokens[2], "properties of slot " + std::to_string(slot));
+        addToEntry(*entry, Severity::Warning,
+                   "only " + quoted(tokens[2]) +
+                       " is taken: a bracket, a second '=' or a tab ends the value");
     }
 }
 
 // A blank is no name; of properties it is an empty list.
-void ScriptReader::tellBlank(const std::vector<std::string>& tokens) {
+void ScriptReader::tellBlank(const ScriptText& entry, const std::vector<std::string>& tokens) {
     const bool isList = tokens[0] == "A" || tokens[0] == "a";
     const std::string meant = trimmed(tokens.back());
-    add(Severity::Error,
-        std::string("blanks around '=' are taken for the value") + (isList ? "" : kGivenUp) +
-            (meant.empty() ? std::string()
-                           : "; write " + tokens[0] + "[" + tokens[1] + "]=" + meant));
+    addToEntry(entry, Severity::Error,
+               std::string("blanks around '=' are taken for the value") + (isList ? "" : kGivenUp) +
+                   (meant.empty() ? std::string()
+                                  : "; write " + tokens[0] + "[" + tokens[1] + "]=" + meant));
 }
 
 void ScriptReader::store(ScriptText& text, const std::string& line, const std::string& value,
@@ -246,10 +256,19 @@ void ScriptReader::store(ScriptText& text, const std::string& line, const std::s
         add(Severity::Warning, "replaces the " + what + " of line " + std::to_string(text.line));
     }
     text = {value, lineNumber, static_cast<unsigned>(columnOf(line, value))};
-    if (&text == &model.title && trimmed(value) != value) {
-        add(Severity::Warning, "the title " + quoted(value) + " begins or ends with a blank",
-            text.column);
+    entryFindings[&text].clear();
+}
+
+void ScriptReader::tellEntries() {
+    for (const auto& [entry, found] : entryFindings) {
+        findings.insert(findings.end(), found.begin(), found.end());
     }
+}
+
+void ScriptReader::addToEntry(const ScriptText& entry, Severity severity,
+                              const std::string& message, std::size_t column) {
+    entryFindings[&entry].push_back(
+        {model.file, lineNumber, static_cast<unsigned>(column), severity, message});
 }
 
 // Below a header that is none, the header is the fault.

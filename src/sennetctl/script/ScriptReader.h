@@ -3,6 +3,7 @@
 // Reads an inventory script by the generator's rules and tells every line that these pass over in
 // silence.
 
+#include <map>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -30,14 +31,19 @@ class ScriptReader {
     void readCim(const std::string& line);
     void explainCim(const std::string& line, const std::vector<std::string>& tokens);
     void storeCim(const std::string& line, const std::vector<std::string>& tokens);
-    void tellBlank(const std::vector<std::string>& tokens);
+    void tellBlank(const ScriptText& entry, const std::vector<std::string>& tokens);
     void store(ScriptText& text, const std::string& line, const std::string& value,
                const std::string& what);
+    void addToEntry(const ScriptText& entry, Severity severity, const std::string& message,
+                    std::size_t column = 1);
+    void tellEntries();
     void addWithoutEffect(const std::string& reason);
     void add(Severity severity, const std::string& message, std::size_t column = 1);
 
     std::vector<Finding>& findings;
     ScriptModel model;
+    std::map<const ScriptText*, std::vector<Finding>>
+        entryFindings;  // a later line takes them back
     Section section = Section::None;
     bool isHeaderLost = false;  // what is meant for the next section is in this one
     unsigned lineNumber = 0;

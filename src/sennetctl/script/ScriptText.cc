@@ -44,6 +44,16 @@ bool sameIgnoringCase(std::string_view one, std::string_view other) {
                       [](char a, char b) { return lower(a) == lower(b); });
 }
 
+std::string inSmallLetters(std::string text) {
+    std::transform(text.begin(), text.end(), text.begin(), lower);
+    return text;
+}
+
+std::string titleKey(std::string title) {
+    std::replace(title.begin(), title.end(), ' ', '_');
+    return "title." + title;
+}
+
 bool looksLikeCimEntry(std::string_view line) {
     const std::string text = trimmed(line);
     return text.size() > 1 && std::string_view("GgNnAa").find(text[0]) != std::string_view::npos &&

@@ -17,6 +17,12 @@ std::string trimmed(std::string_view text);
 /// Whether the texts are the same but for the case of ASCII letters.
 bool sameIgnoringCase(std::string_view one, std::string_view other);
 
+/// With the case of ASCII letters taken away.
+std::string inSmallLetters(std::string text);
+
+/// The key of the resource properties under which the generator looks a title up.
+std::string titleKey(std::string title);
+
 /// Whether somebody means an entry of the section [CIM], or of the section [DEFAULT].
 bool looksLikeCimEntry(std::string_view line);
 bool looksLikeDefaultEntry(std::string_view line);

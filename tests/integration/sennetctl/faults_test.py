@@ -139,6 +139,42 @@ class FaultsTest(unittest.TestCase):
             file, = run.files()
             self.assertTrue(run.tables(file))
 
+    def test_what_a_later_line_replaces_is_no_fault(self):
+        text = GOOD.replace("G[0]", "G[0] = CIM_DiskDrive\nG[0]").replace(
+            "A[0]", "A[0]=Na-me,\nA[0]")
+        _, found = self.check(text)
+        self.assertEqual([each["severity"] for each in found if each["severity"] != "note"],
+                         ["warning", "warning"], found)
+        self.assertTrue(all("replaces the" in each["message"] for each in found
+                            if each["severity"] != "note"), found)
+        run = self.run_with("SMS", text)
+        file, = run.files()
+        self.assertTrue(run.tables(file))
+
+    def test_an_empty_list_makes_a_cell_without_a_column(self):
+        text = GOOD.replace("DeviceID,Name", ",")
+        _, found = self.check(text)
+        self.assertIn("7:6 warning slot 0 has an empty property list",
+                      "".join("{line}:{column} {severity} {message}".format(**each)
+                              for each in found))
+        file, = self.run_with("SMS", text).files()
+        self.assertRegex(file.read_text("ascii"), r"\{ *1, *\}")
+
+    def test_a_name_of_the_ending_alone_makes_no_file(self):
+        place = self.place / "nameless"
+        place.mkdir()
+        script = place / ".script.inv"
+        script.write_text(GOOD)
+        (place / "sennet.properties").touch()
+        told = subprocess.run(
+            [ARGUMENTS.programs.resolve() / "sennetctl", "check", "--offline", script],
+            capture_output=True, text=True, timeout=60, check=False)
+        self.assertIn("for SMS and LANDesk sennet writes no file", told.stdout)
+        run = installation.Run(installation.programs_of(ARGUMENTS), "SMS", place,
+                               self.server.socket, place)
+        self.assertIn("Processing ", run.result.stdout)
+        self.assertEqual(list(place.rglob("*.mif")), [])
+
     def test_what_is_given_up_makes_no_file(self):
         for name, (good, bad) in GIVEN_UP.items():
             with self.subTest(fault=name):

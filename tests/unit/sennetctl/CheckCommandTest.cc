@@ -158,12 +158,34 @@ TEST_F(CheckCommandTest, AKeyInOtherLettersIsToldOnceForAllScripts) {
                                             "[DEFAULT]\ntitle=Two\n[CIM]\nG[0]=CIM_Fan\n"
                                             "A[0]=DeviceID\n");
     EXPECT_EQ(checkScripts(wanted({one, two}), output.plain()), 1);
-    EXPECT_EQ(output.text(), one + ":4:6: note: CIM_Fan: 2 instances\n" + places.resources +
-                                 ":2:1: warning: line without effect: sennet looks for "
-                                 "CIM_Fan.DeviceID\n" +
-                                 two +
-                                 ":4:6: note: CIM_Fan: 2 instances\n2 files: 0 errors, 1 "
-                                 "warning\n");
+    EXPECT_EQ(output.text(),
+              one + ":4:6: note: CIM_Fan: 2 instances\n" + two +
+                  ":4:6: note: CIM_Fan: 2 instances\n" + places.resources +
+                  ":2:1: warning: line without effect on these scripts: sennet looks "
+                  "for CIM_Fan.DeviceID\n2 files: 0 errors, 1 warning\n");
+    CapturedOutput all;
+    EXPECT_EQ(checkScripts(wanted({}), all.plain()), 1);
+    EXPECT_THAT(all.text(), HasSubstr(":2:1: warning: line without effect: sennet looks for "
+                                      "CIM_Fan.DeviceID\n"))
+        << "there is no other script";
+}
+
+// CIM leaves the case of letters to each script, the resource properties do not.
+TEST_F(CheckCommandTest, AKeyThatAnotherScriptNeeds) {
+    directory.write("texts", "CIM_Fan.deviceid=Fan\nCIM_Fan.deviceid.Size=10\n");
+    directory.write("one.script.inv", kGood);
+    directory.write("two.script.inv", "[DEFAULT]\ntitle=Two\n[CIM]\nG[0]=CIM_Fan\nA[0]=deviceid\n");
+    EXPECT_EQ(checkScripts(wanted({}), output.plain()), 0);
+    EXPECT_EQ(output.text().find("without effect"), std::string::npos) << output.text();
+}
+
+TEST_F(CheckCommandTest, AKeyOfATitleInOtherLetters) {
+    directory.write("texts", "title.fans=F\ntitle.Other=O\n");
+    directory.write("x.script.inv", kGood);
+    EXPECT_EQ(checkScripts(wanted({}, true), output.plain()), 1);
+    EXPECT_EQ(output.text(), places.resources +
+                                 ":1:1: warning: line without effect: sennet looks for title.Fans\n"
+                                 "1 file: 0 errors, 1 warning (no server was asked)\n");
 }
 
 TEST_F(CheckCommandTest, WhatIsCalledAsAScriptAndIsNone) {
@@ -301,7 +323,7 @@ TEST_F(CheckCommandTest, ADirectoryThatCannotBeListed) {
     places.scriptDirectory = directory.write("file", "");
     EXPECT_EQ(checkScripts(wanted({}, true), output.json()), 2);
     const std::string reason =
-        "the directory " + places.scriptDirectory + " of inventory scripts: Not a directory";
+        "the directory '" + places.scriptDirectory + "' of inventory scripts: Not a directory";
     EXPECT_EQ(output.errors(), "sennetctl: " + reason + "\n");
     EXPECT_EQ(output.document()["error"]["message"], reason);
 }
@@ -309,13 +331,13 @@ TEST_F(CheckCommandTest, ADirectoryThatCannotBeListed) {
 TEST_F(CheckCommandTest, ADirectoryWithoutScripts) {
     EXPECT_EQ(checkScripts(wanted({}, true), output.plain()), 2);
     EXPECT_EQ(output.errors(),
-              "sennetctl: there are no inventory scripts in " + directory.path("") + "\n");
+              "sennetctl: there are no inventory scripts in '" + directory.path("") + "'\n");
     places.scriptDirectory = directory.path("none");
     places.isConfigured = true;
     CapturedOutput later;
     EXPECT_EQ(checkScripts(wanted({}, true), later.plain()), 2);
-    EXPECT_EQ(later.errors(), "sennetctl: there is no directory " + places.scriptDirectory +
-                                  " of inventory scripts\n");
+    EXPECT_EQ(later.errors(), "sennetctl: there is no directory '" + places.scriptDirectory +
+                                  "' of inventory scripts\n");
     EXPECT_THAT(later.text(), HasSubstr("none: error: there is no such file"));
 }
 

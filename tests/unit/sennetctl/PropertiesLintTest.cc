@@ -79,6 +79,18 @@ TEST(PropertiesLintTest, KeysThatStandTwice) {
               "3:1: note: replaces A.B of line 1\n4:3: note: replaces A.B of line 3\n");
 }
 
+TEST(PropertiesLintTest, FaultsOfWhatALaterLineReplaces) {
+    EXPECT_EQ(inResources("A.B.Size=-5\nA.B.Size=10\n"),
+              "2:1: note: replaces A.B.Size of line 1\n");
+    EXPECT_EQ(inResources("A.B=\xFC\nA.B=x\n"), "2:1: note: replaces A.B of line 1\n");
+    EXPECT_EQ(inResources("A.B=x\nA.B\n"),
+              "2:1: note: replaces A.B of line 1\n"
+              "2:1: warning: no '=' behind the key, so an empty text is written\n");
+    EXPECT_EQ(inConfiguration("sennet.dir=/a\nsennet.dir=/b\n"),
+              "2:1: note: replaces sennet.dir of line 1\n"
+              "2:1: warning: line without effect: unknown key sennet.dir\n");
+}
+
 TEST(PropertiesLintTest, Encodings) {
     EXPECT_EQ(inResources("# caf\xE9\nA.B=caf\xC3\xA9\n"), "");
     EXPECT_EQ(inResources("A.B=L\xFC"

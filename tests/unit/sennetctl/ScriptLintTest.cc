@@ -52,6 +52,43 @@ TEST_F(ScriptLintTest, AClassWithoutProperties) {
               "column is for\n");
 }
 
+TEST_F(ScriptLintTest, AListWithoutProperties) {
+    const std::string told =
+        "5:6: warning: slot 0 has an empty property list: its rows get an empty cell that no "
+        "column is for\n";
+    for (const char* list : {",", ",,", " ,", ", "}) {
+        // That the last two have a blank is told where they are read.
+        findings.clear();
+        model = ScriptReader("x.script.inv", findings)
+                    .read(std::string("[DEFAULT]\ntitle=F\n[CIM]\nG[0]=A\nA[0]=") + list + "\n");
+        findings.clear();
+        checkScript(model, findings);
+        EXPECT_EQ(this->told(), told) << "'" << list << "'";
+    }
+    model =
+        ScriptReader("x.script.inv", findings).read("[DEFAULT]\ntitle=F\n[CIM]\nG[0]=A\nA[0]= \n");
+    findings.clear();
+    checkScript(model, findings);
+    EXPECT_EQ(this->told(), told);
+}
+
+TEST_F(ScriptLintTest, ADefaultNamespaceThatIsNoneIsToldOnce) {
+    const auto check = [this](const std::string& nameSpace, const std::string& cim) {
+        findings.clear();
+        model = ScriptReader("x.script.inv", findings)
+                    .read("[DEFAULT]\ntitle=F\ndefaultnamespace=" + nameSpace + "\n[CIM]\n" + cim);
+        checkScript(model, findings);
+        return told();
+    };
+    const std::string used = "G[0]=A\nA[0]=B\nG[1]=C\nA[1]=D\n";
+    EXPECT_EQ(
+        check("root//x", used),
+        "3:18: error: 'root//x' is no name of a namespace: sennet gives the whole script up\n");
+    EXPECT_EQ(check(" ", used),
+              "3:18: error: ' ' is no name of a namespace: sennet gives the whole script up\n");
+    EXPECT_EQ(check("root//x", "G[0]=A\nN[0]=root\nA[0]=B\n"), "") << "nothing needs it";
+}
+
 TEST_F(ScriptLintTest, NamesThatAreNone) {
     EXPECT_EQ(check("G[0]=A-B\nA[0]=C\n"),
               "4:6: error: 'A-B' is no name of a class: sennet gives the whole script up\n");
@@ -112,6 +149,9 @@ TEST_F(ScriptLintTest, PropertiesWithWhatIsNotMeant) {
 TEST_F(ScriptLintTest, WhatIsListedTwice) {
     EXPECT_EQ(check("G[0]=A\nA[0]=B,b\n"),
               "5:8: warning: the property b is listed twice, and so gets two columns\n");
+    EXPECT_EQ(check("G[0]=A\nA[0]=B,C,b,c,B\n"),
+              "5:10: warning: the property b is listed 3 times, and so gets 3 columns\n"
+              "5:12: warning: the property c is listed twice, and so gets two columns\n");
     EXPECT_EQ(check("G[0]=A\nA[0]=B\nG[2]=a\nA[2]=C\n"),
               "6:6: warning: slot 0 has this class, too: its property list is taken for both\n");
 }
@@ -121,6 +161,11 @@ TEST_F(ScriptLintTest, AFileThatIsNotRead) {
               "0:0: warning: the file's name does not end in .script.inv: sennet does not read "
               "it\n");
     EXPECT_EQ(check("G[0]=A\nA[0]=B\n", "X.Script.INV"), "");
+    const std::string nameless =
+        "0:0: warning: the file's name has nothing before .script.inv: for SMS and LANDesk sennet "
+        "writes no file\n";
+    EXPECT_EQ(check("G[0]=A\nA[0]=B\n", ".script.inv"), nameless);
+    EXPECT_EQ(check("G[0]=A\nA[0]=B\n", "/d/.SCRIPT.inv"), nameless);
 }
 
 TEST_F(ScriptLintTest, MissingTranslations) {

@@ -152,6 +152,25 @@ TEST_F(ScriptReaderTest, EntriesThatHaveAnotherEffectThanMeant) {
     EXPECT_EQ(model.slots[3].className.value, "Y");
 }
 
+TEST_F(ScriptReaderTest, FaultsOfWhatALaterLineReplaces) {
+    EXPECT_EQ(inCim("G[0] = X\nG[0]=X"), "3:1: warning: replaces the class of slot 0 of line 2\n");
+    EXPECT_EQ(model.slots[0].className.value, "X");
+    EXPECT_EQ(inCim("A[0]=B=C\nA[0]=D\nA[0]=E"),
+              "3:1: warning: replaces the properties of slot 0 of line 2\n"
+              "4:1: warning: replaces the properties of slot 0 of line 3\n");
+    EXPECT_EQ(
+        inCim("N[0]=root\nN[0] = root"),
+        "3:1: warning: replaces the namespace of slot 0 of line 2\n"
+        "3:1: error: blanks around '=' are taken for the value: sennet gives the whole script "
+        "up; write N[0]=root\n");
+    EXPECT_EQ(inDefault("title= A=B\ntitle=C"), "3:1: warning: replaces the title of line 2\n");
+    EXPECT_EQ(
+        inCim("G[0] = X\nG[1]=X"),
+        "2:1: error: blanks around '=' are taken for the value: sennet gives the whole script "
+        "up; write G[0]=X\n")
+        << "another slot";
+}
+
 TEST_F(ScriptReaderTest, SlotsEndAtNine) {
     EXPECT_EQ(inCim("G[9]=X"), "");
     EXPECT_FALSE(model.givenUp);
