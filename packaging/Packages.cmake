@@ -5,7 +5,6 @@ set(SENNET_PACKAGE_CONTACT "" CACHE STRING
 set(SENNET_PACKAGE_RELEASE 1 CACHE STRING "Release of the packages of this version")
 
 set(debian "${CMAKE_CURRENT_BINARY_DIR}/debian")
-set(scripts "${CMAKE_CURRENT_SOURCE_DIR}/debian")
 set(CPACK_COMPONENTS_ALL sennet cimomd libvelmclient libvelmclient_dev)
 set(names sennet cimomd libvelmclient libvelmclient-dev)
 
@@ -128,18 +127,19 @@ set(CPACK_RPM_EXCLUDE_FROM_AUTO_FILELIST_ADDITION
     "${CMAKE_INSTALL_FULL_INCLUDEDIR}" "${CMAKE_INSTALL_FULL_DATADIR}/bash-completion"
     "${CMAKE_INSTALL_FULL_DATADIR}/bash-completion/completions")
 
-set(reload "${CMAKE_CURRENT_SOURCE_DIR}/rpm/reload-units")
+set(scripts "${CMAKE_CURRENT_SOURCE_DIR}/rpm")
 set(CPACK_RPM_SPEC_MORE_DEFINE "%define _build_id_links none")
 set(CPACK_RPM_LIBVELMCLIENT_DEV_PACKAGE_NAME libvelmclient-devel)
 set(CPACK_RPM_SENNET_PACKAGE_REQUIRES "libvelmclient = ${version}")
 set(CPACK_RPM_SENNET_PACKAGE_SUGGESTS cimomd)
 list(APPEND CPACK_RPM_SENNET_USER_FILELIST
     "%config(noreplace) ${CMAKE_INSTALL_FULL_SYSCONFDIR}/velmira/velm.properties")
-set(CPACK_RPM_SENNET_POST_INSTALL_SCRIPT_FILE "${reload}")
-set(CPACK_RPM_SENNET_POST_UNINSTALL_SCRIPT_FILE "${reload}")
-set(CPACK_RPM_CIMOMD_POST_INSTALL_SCRIPT_FILE
-    "${CMAKE_CURRENT_SOURCE_DIR}/rpm/make-user-and-reload-units")
-set(CPACK_RPM_CIMOMD_POST_UNINSTALL_SCRIPT_FILE "${reload}")
+set(CPACK_RPM_SENNET_POST_INSTALL_SCRIPT_FILE "${scripts}/reload-units")
+set(CPACK_RPM_SENNET_PRE_UNINSTALL_SCRIPT_FILE "${scripts}/stop-timers")
+set(CPACK_RPM_SENNET_POST_UNINSTALL_SCRIPT_FILE "${scripts}/reload-units")
+set(CPACK_RPM_CIMOMD_POST_INSTALL_SCRIPT_FILE "${scripts}/make-user-and-reload-units")
+set(CPACK_RPM_CIMOMD_PRE_UNINSTALL_SCRIPT_FILE "${scripts}/stop-cimomd")
+set(CPACK_RPM_CIMOMD_POST_UNINSTALL_SCRIPT_FILE "${scripts}/reload-units-and-restart")
 set(CPACK_RPM_LIBVELMCLIENT_DEV_PACKAGE_REQUIRES "libvelmclient = ${version}")
 
 include(CPack)
