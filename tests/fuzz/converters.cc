@@ -10,6 +10,7 @@
 #include <cctype>
 #include <cstddef>
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -117,11 +118,16 @@ std::size_t bound(const Input& input, std::size_t rows) {
 class Outputs {
   public:
     explicit Outputs(const Input& theInput)
-        : input(theInput), classes(1, classOf(input)), instances(instancesOf(input)) {
-        script = scripts.write("thing.script.inv",
-                               "[DEFAULT]\ntitle=Thing\n\n[CIM]\nG[0]=T_Thing\n"
-                               "N[0]=root/cimv2\nA[0]=" +
-                                   std::string(input.properties) + "\n");
+        : input(theInput),
+          classes(1, classOf(input)),
+          instances(instancesOf(input)),
+          parser(scripts
+                     .write("thing.script.inv",
+                            "[DEFAULT]\ntitle=Thing\n\n[CIM]\nG[0]=T_Thing\n"
+                            "N[0]=root/cimv2\nA[0]=" +
+                                std::string(input.properties) + "\n")
+                     .c_str()) {
+        parser.parse();
     }
 
     /// Makes a product's files. Where `isRead` is true, its MIF files are read, too.
@@ -139,21 +145,20 @@ class Outputs {
     }
 
   private:
-    // False when the script is abandoned, as one with an impossible name is.
+    // False for a script with a name that is none. Whatever the server says, nothing else may raise
+    // an exception, which would leave half a file.
     bool convert(const char* product, const char* directory) {
         Pegasus::CimInstanceLists lists;
         Array<CIMInstance> list = instances;
         lists.addInstanceList(list);
         const Velm::Properties properties;
         Pegasus::CimConverterList converters;
+        createCimConverters(converters, product, directory, directory, "thing", properties);
         try {
-            Pegasus::CimScriptParser parser{String(script.c_str())};
-            parser.parse();
-            createCimConverters(converters, product, directory, directory, "thing", properties);
             for (int i = 0; i < converters.getNumberOfConverters(); ++i) {
                 converters.getConverter(i)->printOutput(parser, classes, lists);
             }
-        } catch (const Pegasus::Exception&) {
+        } catch (const Pegasus::InvalidNameException&) {
             return false;
         }
         return true;
@@ -176,7 +181,7 @@ class Outputs {
     Array<CIMClass> classes;
     Array<CIMInstance> instances;
     support::TempDirectory scripts;
-    std::string script;
+    Pegasus::CimScriptParser parser;
 };
 
 }  // namespace
@@ -186,15 +191,16 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     input.instances = std::string_view(reinterpret_cast<const char*>(data), size);
     input.properties = takeLine(input.instances);
     input.classMembers = takeLine(input.instances);
+    std::optional<Outputs> outputs;
     try {
-        Outputs outputs(input);
-        const bool isRead = isReadable(input);
-        for (const char* product : {"/SMS", "/LD", "/QVE"}) {
-            outputs.check(product, isRead);
-        }
-        outputs.check("/CA", isRead && !hasBackslashes(input));
+        outputs.emplace(input);
     } catch (const Pegasus::Exception&) {
-        return 0;
+        return 0;  // refused as a whole
     }
+    const bool isRead = isReadable(input);
+    for (const char* product : {"/SMS", "/LD", "/QVE"}) {
+        outputs->check(product, isRead);
+    }
+    outputs->check("/CA", isRead && !hasBackslashes(input));
     return 0;
 }

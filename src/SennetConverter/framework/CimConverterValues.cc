@@ -67,7 +67,12 @@ Sint64 asPrinted(Integer number) {
     }
 }
 
-// The text of the MaxLen qualifier, or "-1". A MaxLen that stands after Values is not seen.
+bool isNumber(const CIMQualifier& qualifier) {
+    return CimConverter::isInteger(qualifier.getType()) && !qualifier.getValue().isArray();
+}
+
+// The text of the MaxLen qualifier, or "-1". A MaxLen that stands after Values is not seen, nor one
+// that is no single number: reading it would leave half a file.
 String readMaxLen(CIMProperty& property, bool& hasValues) {
     String maxLength("-1");
     for (Uint32 i = 0; i < property.getQualifierCount() && !hasValues; ++i) {
@@ -75,7 +80,7 @@ String readMaxLen(CIMProperty& property, bool& hasValues) {
         const String name = qualifier.getName().getString();
         if (String::equalNoCase(name, "values")) {
             hasValues = true;
-        } else if (String::equalNoCase(name, "maxlen")) {
+        } else if (String::equalNoCase(name, "maxlen") && isNumber(qualifier)) {
             maxLength = CimConverter::mapInteger(qualifier.getValue(), qualifier.getType());
         }
     }

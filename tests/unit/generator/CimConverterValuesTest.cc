@@ -159,6 +159,17 @@ TEST_F(CimConverterValuesTest, GivesOtherTypesALength) {
     EXPECT_EQ(lengthOf(null(CIMTYPE_REFERENCE)), "32");
 }
 
+TEST_F(CimConverterValuesTest, PassesOverAMaxLenThatIsNoNumber) {
+    Array<Uint32> numbers;
+    numbers.append(7);
+    const auto with = [](const CIMValue& value) {
+        return property("P", null(CIMTYPE_STRING), {CIMQualifier(CIMName("MaxLen"), value)});
+    };
+    EXPECT_EQ(length(with(CIMValue(numbers))), "255");
+    EXPECT_EQ(length(with(CIMValue(String("12")))), "255");
+    EXPECT_EQ(length(with(CIMValue(Boolean(true)))), "255");
+}
+
 TEST_F(CimConverterValuesTest, GivesStringsTheirMaxLen) {
     EXPECT_EQ(lengthOf(null(CIMTYPE_STRING)), "255");
     EXPECT_EQ(length(property("P", null(CIMTYPE_STRING), {maxLen(64)})), "64");
