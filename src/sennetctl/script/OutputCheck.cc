@@ -5,20 +5,15 @@
 
 #include <cerrno>
 #include <filesystem>
-#include <iterator>
-#include <map>
 #include <optional>
 #include <set>
 #include <system_error>
 
-#include "properties/PropertiesEntries.h"
-#include "script/Places.h"
+#include "script/OutputEntries.h"
 
 namespace sennetctl {
 
 namespace {
-
-using Velm::PropertiesEntry;
 
 struct Fault {
     Severity severity = Severity::Error;
@@ -65,39 +60,20 @@ std::optional<Fault> faultOf(const std::string& directory) {
     return faultOfPresent(place, status);
 }
 
-/// The last entry of each key, empty values left out: they stand for the default.
-std::map<std::string, PropertiesEntry> entriesIn(std::string_view octets) {
-    std::map<std::string, PropertiesEntry> entries;
-    Velm::PropertiesEntries reader(octets);
-    while (std::optional<PropertiesEntry> entry = reader.next()) {
-        const std::string key = entry->key;
-        entries.insert_or_assign(key, std::move(*entry));
-    }
-    for (auto entry = entries.begin(); entry != entries.end();) {
-        entry = entry->second.value.empty() ? entries.erase(entry) : std::next(entry);
-    }
-    return entries;
-}
-
 }  // namespace
 
 void checkOutputDirectories(const std::string& file, std::string_view octets,
                             std::vector<Finding>& findings) {
-    const std::map<std::string, PropertiesEntry> entries = entriesIn(octets);
     std::set<std::string> looked;
-    for (const OutputPlace& output : outputPlaces()) {
-        auto entry = entries.find(output.key());
-        if (entry == entries.end()) {
-            entry = entries.find(output.generalKey);
-        }
-        if (entry == entries.end() || entry->second.value[0] != '/' ||
-            !looked.insert(entry->first).second) {
+    for (const OutputEntry& output : outputEntriesIn(octets)) {
+        const Velm::PropertiesEntry& entry = output.entry;
+        if (!looked.insert(entry.key).second) {
             continue;
         }
-        if (const std::optional<Fault> fault = faultOf(entry->second.value)) {
+        if (const std::optional<Fault> fault = faultOf(entry.value)) {
             findings.push_back(
-                {file, entry->second.line, entry->second.valueColumn, fault->severity,
-                 "sennet writes nothing into " + entry->second.value + ": " + fault->reason});
+                {file, entry.line, entry.valueColumn, fault->severity,
+                 "sennet writes nothing into " + entry.value + ": " + fault->reason});
         }
     }
 }

@@ -12,7 +12,7 @@ namespace sennetctl {
 
 /// Appends a finding for each directory of output files that the octets of the configuration name
 /// for some product, and that sennet could neither use nor make as the user of this process.
-/// Relative paths are passed over: they are those of the directory in which sennet is started.
+/// Relative paths are passed over, which are told as such.
 void checkOutputDirectories(const std::string& file, std::string_view octets,
                             std::vector<Finding>& findings);
 

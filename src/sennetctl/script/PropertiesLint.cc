@@ -1,5 +1,7 @@
 #include "script/PropertiesLint.h"
 
+#include <unistd.h>
+
 #include <algorithm>
 #include <cstdlib>
 #include <filesystem>
@@ -14,6 +16,7 @@
 #include "report/WholeFile.h"
 #include "script/OutputCheck.h"
 #include "script/ScriptText.h"
+#include "script/ServiceCheck.h"
 #include "utf8/Utf8.h"
 
 namespace sennetctl {
@@ -38,6 +41,35 @@ bool isUtf8(std::string_view text) {
 
 bool hasBlank(std::string_view text) {
     return text.find_first_of(" \t") != std::string_view::npos;
+}
+
+/// What somebody probably did not mean by a path, which is taken to the letter. Empty ones stand
+/// for the default.
+std::vector<std::string> pathFaults(const std::string& path) {
+    std::vector<std::string> faults;
+    std::string meant = path;
+    const auto strip = [&](const std::string& text, const char* reason) {
+        if (text != meant) {
+            meant = text;
+            faults.push_back(std::string(reason) + " to the path: write " + meant);
+        }
+    };
+    strip(meant.substr(0, std::min(meant.find(" #"), meant.find("\t#"))),
+          "a comment has a line of its own, here it belongs");
+    strip(trimmed(meant), "blanks at its ends belong");
+    const std::size_t first = meant.find_first_not_of("\"'");
+    if (first != std::string::npos) {
+        strip(meant.substr(first, meant.find_last_not_of("\"'") - first + 1), "quotes belong");
+    }
+    // What is told last is all of it.
+    if (faults.size() > 1) {
+        faults.erase(faults.begin(), faults.end() - 1);
+    }
+    if (!meant.empty() && meant[0] != '/') {
+        faults.emplace_back(
+            "a relative path: sennet takes it from the directory that it is started in");
+    }
+    return faults;
 }
 
 /// The line of the last entry of each key.
@@ -94,6 +126,10 @@ class PropertiesLint {
             atKey(entry, "line without effect: unknown key " + entry.key);
         } else if (!entry.hasSeparator) {
             atKey(entry, "no '=' behind the key, so the default is taken");
+        } else {
+            for (const std::string& fault : pathFaults(entry.value)) {
+                add(Severity::Warning, entry.line, entry.valueColumn, fault);
+            }
         }
     }
 
@@ -237,6 +273,11 @@ void checkConfiguration(const Places& places, std::vector<Finding>& findings) {
             octetsOf(places.configuration, "sennet takes its default places", findings)) {
         checkConfigurationText(places.configuration, *octets, findings);
         checkOutputDirectories(places.configuration, *octets, findings);
+        // Only root reads all that the service's rules depend on; and what VELM_CONFIG names is not
+        // the service's configuration.
+        if (::geteuid() == 0 && !places.isConfigured) {
+            checkServiceOutput(places.configuration, *octets, askServiceRules, findings);
+        }
     }
 }
 

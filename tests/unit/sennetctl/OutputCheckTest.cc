@@ -112,6 +112,7 @@ TEST_F(OutputCheckTest, OneThatServesSeveralProductsIsToldOnce) {
         "1:15: error: sennet writes nothing into " + plain + ": " + plain + " is no directory\n");
 }
 
+// They are told as such.
 TEST_F(OutputCheckTest, RelativePathsArePassedOver) {
     EXPECT_EQ(told("mif.directory=plain/out\n"), "");
 }

@@ -127,6 +127,27 @@ TEST(PropertiesLintTest, Configurations) {
               "3:1: warning: no '=' behind the key, so the default is taken\n");
 }
 
+TEST(PropertiesLintTest, PathsThatAreTakenToTheLetter) {
+    const std::string relative =
+        "1:15: warning: a relative path: sennet takes it from the directory that it is started "
+        "in\n";
+    EXPECT_EQ(inConfiguration("mif.directory=out/mif\n"), relative);
+    EXPECT_EQ(inConfiguration("mif.directory=/tmp/trail \n"),
+              "1:15: warning: blanks at its ends belong to the path: write /tmp/trail\n");
+    EXPECT_EQ(inConfiguration("sql.directory=\"/tmp/x\"\n"),
+              "1:15: warning: quotes belong to the path: write /tmp/x\n");
+    EXPECT_EQ(inConfiguration("mif.directory='out'\n"),
+              "1:15: warning: quotes belong to the path: write out\n" + relative);
+    EXPECT_EQ(inConfiguration("sql.directory=/d/sql # of QVE\n"),
+              "1:15: warning: a comment has a line of its own, here it belongs to the path: write "
+              "/d/sql\n");
+    EXPECT_EQ(inConfiguration("sql.directory=\"/d/sql\" # of QVE\n"),
+              "1:15: warning: quotes belong to the path: write /d/sql\n");
+    EXPECT_EQ(inConfiguration("sennet.directory=/d/a#b c\nsennet.resources=/d/it's\n"), "");
+    EXPECT_EQ(inConfiguration("mif.directory=out\nmif.directory=/out\n"),
+              "2:1: note: replaces mif.directory of line 1\n");
+}
+
 TEST(PropertiesLintTest, FilesThatCannotBeRead) {
     const support::TempDirectory directory;
     Places places{directory.path("none"), false, "", directory.path("")};
