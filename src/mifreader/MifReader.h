@@ -17,7 +17,8 @@ class MifReader {
     explicit MifReader(Tolerances theTolerances = {}) : tolerances(theTolerances) {}
 
     // The component of a whole file, given as octets. Throws Error at the first thing wrong.
-    // Time and memory grow with the length of the text.
+    // Time and memory grow with the length of the text; more than 4,194,304 values in rows, where
+    // that is most, are refused.
     Component read(std::string_view text) const;
 
   private:

@@ -7,6 +7,9 @@ namespace Mif {
 
 namespace {
 
+// A value takes one octet in a file and a hundred here.
+constexpr std::size_t kMostValues = std::size_t(1) << 22;
+
 // What groups of one class promise to have in common.
 bool sameShape(const Attribute& one, const Attribute& other) {
     return one.id == other.id && one.type == other.type && one.access == other.access &&
@@ -455,6 +458,10 @@ std::vector<Value> Parser::rowValues(Position& end) {
     expectSeparator("{");
     std::vector<Value> values;
     do {
+        if (++valuesRead > kMostValues) {
+            throw Error(current.position,
+                        "more than " + std::to_string(kMostValues) + " values in rows");
+        }
         if (current.is(",") || current.is("}")) {
             Value omitted;
             omitted.position = current.position;

@@ -71,6 +71,7 @@ class Parser {
     std::set<std::string> pathNames;
     std::set<std::uint64_t> usedIds;
     std::map<std::string, std::size_t> groupsByClass;
+    std::size_t valuesRead = 0;
 };
 
 }  // namespace Mif

@@ -21,17 +21,19 @@ std::uint64_t rowNumber(const Mif::Value& value) {
 }
 
 std::vector<const Values*> orderedRows(const MifTable& table) {
-    std::vector<const Values*> rows;
-    rows.reserve(table.rows.size());
-    for (const Values& row : table.rows) {
-        rows.push_back(&row);
-    }
     const auto numbers = std::find_if(table.columns.begin(), table.columns.end(), isRowNumber);
-    if (numbers != table.columns.end()) {
-        const auto place = static_cast<std::size_t>(numbers - table.columns.begin());
-        std::stable_sort(rows.begin(), rows.end(), [&](const Values* one, const Values* other) {
-            return rowNumber((*one)[place]) < rowNumber((*other)[place]);
-        });
+    const auto place = static_cast<std::size_t>(numbers - table.columns.begin());
+    std::vector<std::pair<std::uint64_t, const Values*>> numbered;
+    numbered.reserve(table.rows.size());
+    for (const Values& row : table.rows) {
+        numbered.emplace_back(place < row.size() ? rowNumber(row[place]) : 0, &row);
+    }
+    std::stable_sort(numbered.begin(), numbered.end(),
+                     [](const auto& one, const auto& other) { return one.first < other.first; });
+    std::vector<const Values*> rows;
+    rows.reserve(numbered.size());
+    for (const auto& [number, row] : numbered) {
+        rows.push_back(row);
     }
     return rows;
 }

@@ -41,9 +41,12 @@ Json jsonOf(const MifTable& table) {
     }
     one["rows"] = Json::array();
     for (const std::vector<Mif::Value>& values : table.rows) {
+        // No two columns are alike, and to look for the name among the earlier members takes long.
         Json row = Json::object();
+        auto& members = row.get_ref<Json::object_t&>();
+        members.reserve(values.size());
         for (std::size_t i = 0; i < values.size(); ++i) {
-            row[table.columns[i].name] = jsonOf(values[i]);
+            members.emplace_back(table.columns[i].name, jsonOf(values[i]));
         }
         one["rows"].push_back(std::move(row));
     }

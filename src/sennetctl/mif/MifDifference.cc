@@ -4,7 +4,10 @@
 #include <map>
 #include <optional>
 #include <set>
-#include <unordered_map>
+#include <utility>
+
+#include "mif/RowText.h"
+#include "report/Room.h"
 
 namespace sennetctl {
 
@@ -45,15 +48,65 @@ struct ComparedTable {
     }
 
     Texts names;
-    std::unordered_map<std::string, std::size_t> placesByName;
+    std::map<std::string, std::size_t> placesByName;
     std::vector<bool> keys;
     Texts definitions;
     std::vector<Texts> rows;
 };
 
+/// The values of some columns, as one of the tables has them.
+class Selection {
+  public:
+    Selection(const ComparedTable& table, const Texts& columns) {
+        for (std::size_t i = 0; i < columns.size(); ++i) {
+            if (const std::optional<std::size_t> place = table.placeOf(columns[i])) {
+                places.emplace_back(i, *place);
+            }
+        }
+    }
+
+    RowText of(const Texts& row) const {
+        RowText text;
+        for (const auto& [column, place] : places) {
+            if (!row[place].empty()) {
+                text.add(column, row[place]);
+            }
+        }
+        return text;
+    }
+
+  private:
+    std::vector<std::pair<std::size_t, std::size_t>> places;  // of a column, and in a row
+};
+
+/// The changes so far, as many as there is room for.
+class Changes {
+  public:
+    explicit Changes(std::size_t largestOctets)
+        : room(largestOctets,
+               "the differences are larger than " + std::to_string(largestOctets >> 20) + " MiB") {}
+
+    void add(MifChange change) {
+        room.take(sizeof change + change.table.size() + change.row.size() +
+                  change.attribute.size() + change.before.size() + change.after.size());
+        changes.push_back(std::move(change));
+    }
+    void addIfChanged(const std::string& table, const std::string& before,
+                      const std::string& after) {
+        if (before != after) {
+            add({table, MifChange::Kind::Changed, {}, {}, before, after});
+        }
+    }
+    std::vector<MifChange> take() { return std::move(changes); }
+
+  private:
+    Room room;
+    std::vector<MifChange> changes;
+};
+
 class TableComparison {
   public:
-    TableComparison(const MifTable& before, const MifTable& after, std::vector<MifChange>& changes)
+    TableComparison(const MifTable& before, const MifTable& after, Changes& changes)
         : name(after.name), before(before), after(after), changes(changes) {}
 
     void run() {
@@ -69,7 +122,7 @@ class TableComparison {
   private:
     void add(MifChange::Kind kind, const std::string& row, const std::string& attribute = {},
              const std::string& oldValue = {}, const std::string& newValue = {}) {
-        changes.push_back({name, kind, row, attribute, oldValue, newValue});
+        changes.add({name, kind, row, attribute, oldValue, newValue});
     }
 
     void compareColumns() {
@@ -79,9 +132,10 @@ class TableComparison {
             }
         }
         for (const std::string& column : after.names) {
-            if (before.placeOf(column)) {
+            if (const std::optional<std::size_t> oldPlace = before.placeOf(column)) {
                 compareDefinitions(column);
                 common.push_back(column);
+                commonPlaces.emplace_back(*oldPlace, *after.placeOf(column));
             } else {
                 add(MifChange::Kind::Added, {}, column);
             }
@@ -111,103 +165,86 @@ class TableComparison {
         return tellsApart(before, chosen) && tellsApart(after, chosen) ? chosen : Texts();
     }
 
-    static Texts valuesOf(const ComparedTable& table, const Texts& row, const Texts& columns) {
-        Texts values;
-        for (const std::string& column : columns) {
-            const std::optional<std::size_t> place = table.placeOf(column);
-            values.push_back(place ? row[*place] : std::string());
-        }
-        return values;
-    }
-
     static bool tellsApart(const ComparedTable& table, const Texts& columns) {
-        std::set<Texts> seen;
+        const Selection selection(table, columns);
+        std::set<RowText> seen;
         return std::all_of(table.rows.begin(), table.rows.end(), [&](const Texts& row) {
-            const Texts values = valuesOf(table, row, columns);
-            const bool empty = std::all_of(values.begin(), values.end(),
-                                           [](const std::string& value) { return value.empty(); });
-            return !empty && seen.insert(values).second;
+            RowText values = selection.of(row);
+            return !values.empty() && seen.insert(std::move(values)).second;
         });
     }
 
-    static std::string joined(const Texts& values) {
-        std::string text;
-        for (const std::string& value : values) {
-            text += (text.empty() ? "" : ", ") + value;
-        }
-        return text.empty() ? "a row without values" : text;
+    static std::string shown(const RowText& values, const Texts& columns) {
+        return values.empty() ? "a row without values" : values.joined(columns.size());
     }
 
     void compareById() {
-        std::map<Texts, const Texts*> newRows;
+        const Selection oldIds(before, identity);
+        const Selection newIds(after, identity);
+        std::map<RowText, const Texts*> newRows;
         for (const Texts& row : after.rows) {
-            newRows[valuesOf(after, row, identity)] = &row;
+            newRows.emplace(newIds.of(row), &row);
         }
-        std::set<Texts> known;
+        std::set<RowText> known;
         for (const Texts& row : before.rows) {
-            const Texts id = valuesOf(before, row, identity);
-            known.insert(id);
+            const RowText id = oldIds.of(row);
             const auto found = newRows.find(id);
             if (found == newRows.end()) {
-                add(MifChange::Kind::Removed, joined(id));
+                add(MifChange::Kind::Removed, shown(id, identity));
             } else {
-                compareRow(joined(id), row, *found->second);
+                compareRow(id, row, *found->second);
+                known.insert(id);
             }
         }
         for (const Texts& row : after.rows) {
-            const Texts id = valuesOf(after, row, identity);
+            const RowText id = newIds.of(row);
             if (known.count(id) == 0) {
-                add(MifChange::Kind::Added, joined(id));
+                add(MifChange::Kind::Added, shown(id, identity));
             }
         }
     }
 
-    void compareRow(const std::string& id, const Texts& oldRow, const Texts& newRow) {
-        const Texts oldValues = valuesOf(before, oldRow, common);
-        const Texts newValues = valuesOf(after, newRow, common);
-        for (std::size_t i = 0; i < common.size(); ++i) {
-            if (oldValues[i] != newValues[i]) {
-                add(MifChange::Kind::Changed, id, common[i], oldValues[i], newValues[i]);
+    void compareRow(const RowText& id, const Texts& oldRow, const Texts& newRow) {
+        for (const auto& [oldPlace, newPlace] : commonPlaces) {
+            if (oldRow[oldPlace] != newRow[newPlace]) {
+                add(MifChange::Kind::Changed, shown(id, identity), before.names[oldPlace],
+                    oldRow[oldPlace], newRow[newPlace]);
             }
         }
     }
 
     /// Rows that have their like in the other file are no change, however often they occur there.
     void compareWholeRows() {
-        std::multiset<Texts> left;
+        const Selection newValues(after, common);
+        const Selection oldValues(before, common);
+        std::multiset<RowText> left;
         for (const Texts& row : after.rows) {
-            left.insert(valuesOf(after, row, common));
+            left.insert(newValues.of(row));
         }
         for (const Texts& row : before.rows) {
-            const Texts values = valuesOf(before, row, common);
+            const RowText values = oldValues.of(row);
             const auto like = left.find(values);
             if (like == left.end()) {
-                add(MifChange::Kind::Removed, joined(values));
+                add(MifChange::Kind::Removed, shown(values, common));
             } else {
                 left.erase(like);
             }
         }
-        for (const Texts& values : left) {
-            add(MifChange::Kind::Added, joined(values));
+        for (const RowText& values : left) {
+            add(MifChange::Kind::Added, shown(values, common));
         }
     }
 
     std::string name;
     ComparedTable before;
     ComparedTable after;
-    std::vector<MifChange>& changes;
+    Changes& changes;
     Texts common;
+    std::vector<std::pair<std::size_t, std::size_t>> commonPlaces;  // before and after
     Texts identity;
 };
 
-void compareNames(const std::string& table, const std::string& before, const std::string& after,
-                  std::vector<MifChange>& changes) {
-    if (before != after) {
-        changes.push_back({table, MifChange::Kind::Changed, {}, {}, before, after});
-    }
-}
-
-using TablesByClass = std::unordered_map<std::string, const MifTable*>;
+using TablesByClass = std::map<std::string, const MifTable*>;
 
 TablesByClass byClass(const std::vector<MifTable>& tables) {
     TablesByClass found;
@@ -219,26 +256,27 @@ TablesByClass byClass(const std::vector<MifTable>& tables) {
 
 }  // namespace
 
-std::vector<MifChange> differencesOf(const MifContent& before, const MifContent& after) {
+std::vector<MifChange> differencesOf(const MifContent& before, const MifContent& after,
+                                     std::size_t largestOctets) {
     const TablesByClass oldClasses = byClass(before.tables);
     const TablesByClass newClasses = byClass(after.tables);
-    std::vector<MifChange> changes;
-    compareNames({}, before.component, after.component, changes);
+    Changes changes(largestOctets);
+    changes.addIfChanged({}, before.component, after.component);
     for (const MifTable& table : before.tables) {
         const auto like = newClasses.find(table.className);
         if (like != newClasses.end()) {
-            compareNames(like->second->name, table.name, like->second->name, changes);
+            changes.addIfChanged(like->second->name, table.name, like->second->name);
             TableComparison(table, *like->second, changes).run();
         } else {
-            changes.push_back({table.name, MifChange::Kind::Removed, {}, {}, {}, {}});
+            changes.add({table.name, MifChange::Kind::Removed, {}, {}, {}, {}});
         }
     }
     for (const MifTable& table : after.tables) {
         if (oldClasses.count(table.className) == 0) {
-            changes.push_back({table.name, MifChange::Kind::Added, {}, {}, {}, {}});
+            changes.add({table.name, MifChange::Kind::Added, {}, {}, {}, {}});
         }
     }
-    return changes;
+    return changes.take();
 }
 
 }  // namespace sennetctl

@@ -2,6 +2,7 @@
 
 // What changed in an inventory from one MIF file to the next.
 
+#include <cstddef>
 #include <string>
 #include <vector>
 
@@ -20,11 +21,16 @@ struct MifChange {
     std::string after;      // or the name
 };
 
+/// Far more than anybody reads.
+constexpr std::size_t kLargestDifferencesOctets = std::size_t(64) << 20;
+
 /// The changes from the old file to the new one, in the order of the old tables and then of what is
 /// new: names, definitions of attributes (type, size and whether they are keys) and rows. Tables
 /// are the same by their class, rows by their key or, where that only counts rows, by their first
 /// other attribute; rows that this does not tell apart are added or removed as a whole. The order
-/// of rows and their numbers are no change.
-std::vector<MifChange> differencesOf(const MifContent& before, const MifContent& after);
+/// of rows and their numbers are no change. Throws CannotRun when the changes, each with the row
+/// and the table that it is of, take more than so many octets.
+std::vector<MifChange> differencesOf(const MifContent& before, const MifContent& after,
+                                     std::size_t largestOctets = kLargestDifferencesOctets);
 
 }  // namespace sennetctl

@@ -1,12 +1,16 @@
 #include "mif/MifTables.h"
 
+#include <array>
 #include <cstddef>
+#include <cstdint>
 #include <map>
+#include <optional>
 #include <set>
 #include <utility>
 
 #include "mif/MifText.h"
 #include "mifreader/MifReader.h"
+#include "report/Room.h"
 #include "report/Text.h"
 #include "report/WholeFile.h"
 
@@ -18,9 +22,6 @@ using Mif::Attribute;
 using Mif::Group;
 using Mif::Tolerance;
 using Mif::Value;
-
-/// Far more than the file itself may have.
-constexpr std::size_t kLargestTablesOctets = std::size_t(256) << 20;
 
 Mif::Tolerances everyTolerance() {
     return {Tolerance::RawLineEnds,    Tolerance::BareLineEnds, Tolerance::IntegersAsText,
@@ -54,51 +55,101 @@ MifTable emptyTable(const Group& group) {
     return table;
 }
 
-/// Rows take the values that they leave out from their group, so that a short file may have tables
-/// without end.
+/// Of each octet in JSON, HTML or on a terminal, whichever has the longest form.
+constexpr std::array<std::uint8_t, 256> lengthsOfForms() {
+    constexpr std::string_view kEscaped = "\"'&<>\\\x7F";
+    constexpr std::uint8_t kLongestEscape = 6;
+    std::array<std::uint8_t, 256> lengths = {};
+    for (std::size_t code = 0; code < lengths.size(); ++code) {
+        const bool escaped =
+            code < ' ' || kEscaped.find(static_cast<char>(code)) != std::string_view::npos;
+        lengths[code] = escaped ? kLongestEscape : code < 0x80 ? 1 : 2;
+    }
+    return lengths;
+}
+
+std::size_t longestForm(std::string_view text) {
+    static constexpr std::array<std::uint8_t, 256> kLengths = lengthsOfForms();
+    std::size_t octets = 0;
+    for (const char c : text) {
+        octets += kLengths[static_cast<unsigned char>(c)];
+    }
+    return octets;
+}
+
+/// The name of a number; nullptr for what has none.
+const std::string* valueName(const Value& value, const MifColumn& column) {
+    constexpr std::uint64_t kLargest = std::uint64_t(1) << 31;
+    if (value.kind != Value::Kind::Integer || value.magnitude > kLargest) {
+        return nullptr;
+    }
+    const auto magnitude = static_cast<std::int64_t>(value.magnitude);
+    const auto name = column.valueNames.find(value.negative ? -magnitude : magnitude);
+    return name == column.valueNames.end() ? nullptr : &name->second;
+}
+
+/// Rows take the values that they leave out from their group, and numbers refer to their names, so
+/// that a short file may have tables without end.
 class TableFiller {
   public:
+    explicit TableFiller(std::size_t largestOctets)
+        : room(largestOctets,
+               "its tables are larger than " + std::to_string(largestOctets >> 20) + " MiB") {}
+
     std::vector<MifTable> tablesOf(const Mif::Component& component) {
         for (const Group& group : component.groups) {
             const auto [place, added] = places.emplace(group.className, tables.size());
             if (added) {
-                tables.push_back(emptyTable(group));
+                addTable(group);
             }
             if (!group.isTemplate()) {
-                addRow(tables[place->second], group, {});
+                addRow(place->second, group, {});
             }
         }
         for (const Mif::Table& table : component.tables) {
-            MifTable& shown = tables[places.at(table.className)];
+            const std::size_t place = places.at(table.className);
             for (const Mif::Row& row : table.rows) {
-                addRow(shown, component.groups[table.group], row);
+                addRow(place, component.groups[table.group], row);
             }
         }
         return std::move(tables);
     }
 
   private:
-    void addRow(MifTable& table, const Group& group, const Mif::Row& row) {
+    void addTable(const Group& group) {
+        tables.push_back(emptyTable(group));
+        std::vector<std::size_t>& octets = octetsOfNames.emplace_back();
+        for (const MifColumn& column : tables.back().columns) {
+            octets.push_back(longestForm(column.name));
+        }
+    }
+
+    void addRow(std::size_t place, const Group& group, const Mif::Row& row) {
+        MifTable& table = tables[place];
         std::vector<Value> values;
+        room.take(sizeof values);
         for (std::size_t i = 0; i < group.attributes.size(); ++i) {
             const bool given = i < row.values.size() && row.values[i].kind != Value::Kind::Omitted;
-            values.push_back(given ? row.values[i] : group.attributes[i].value.value_or(Value()));
-            octets += sizeof(Value) + values.back().text.size();
-            if (octets > kLargestTablesOctets) {
-                throw CannotRun("its tables are larger than " +
-                                std::to_string(kLargestTablesOctets >> 20) + " MiB");
-            }
+            const std::optional<Value>& usual = group.attributes[i].value;
+            const Value* value = given ? &row.values[i] : usual ? &*usual : &nothing;
+            const std::string* name = valueName(*value, table.columns[i]);
+            room.take(sizeof(Value) + octetsOfNames[place][i] +
+                      longestForm(name != nullptr ? *name : value->text));
+            values.push_back(*value);
         }
+        values.shrink_to_fit();
         table.rows.push_back(std::move(values));
     }
 
     std::vector<MifTable> tables;
+    std::vector<std::vector<std::size_t>> octetsOfNames;  // of the columns of each table
     std::map<std::string, std::size_t> places;
-    std::size_t octets = 0;
+    Room room;
+    const Value nothing;
 };
 
-Mif::Component readComponent(const std::string& path) {
-    const MifText text = mifTextOf(readWholeFile(path));
+Mif::Component componentOf(const std::string& path, std::string_view octets) {
+    const MifText text = mifTextOf(octets);
     Mif::Tolerances tolerances = everyTolerance();
     try {
         return Mif::MifReader(tolerances).read(text.octets);
@@ -117,9 +168,14 @@ Mif::Component readComponent(const std::string& path) {
 }  // namespace
 
 MifContent readMifFile(const std::string& path) {
-    const Mif::Component component = readComponent(path);
+    return mifContentOf(path, readWholeFile(path));
+}
+
+MifContent mifContentOf(const std::string& path, std::string_view octets,
+                        std::size_t largestOctets) {
+    const Mif::Component component = componentOf(path, octets);
     try {
-        return {fromLatin1(component.name), TableFiller().tablesOf(component)};
+        return {fromLatin1(component.name), TableFiller(largestOctets).tablesOf(component)};
     } catch (const CannotRun& failure) {
         throw CannotRun(path, failure.failure().reason);
     }
@@ -154,15 +210,8 @@ std::string shownValue(const Value& value) {
 }
 
 std::string shownValue(const Value& value, const MifColumn& column) {
-    constexpr std::uint64_t kLargest = std::uint64_t(1) << 31;
-    if (value.kind == Value::Kind::Integer && value.magnitude <= kLargest) {
-        const auto magnitude = static_cast<std::int64_t>(value.magnitude);
-        const auto name = column.valueNames.find(value.negative ? -magnitude : magnitude);
-        if (name != column.valueNames.end()) {
-            return name->second;
-        }
-    }
-    return shownValue(value);
+    const std::string* name = valueName(value, column);
+    return name != nullptr ? *name : shownValue(value);
 }
 
 }  // namespace sennetctl

@@ -2,9 +2,11 @@
 
 // The tables of a MIF file as an importing product would keep them.
 
+#include <cstddef>
 #include <cstdint>
 #include <map>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "mifreader/Document.h"
@@ -35,10 +37,19 @@ struct MifContent {
     std::vector<MifTable> tables;
 };
 
+/// What tables may take: far more than any file has that a product takes.
+constexpr std::size_t kLargestTablesOctets = std::size_t(128) << 20;
+
 /// Reads a file with everything tolerated that leaves a meaning. Throws CannotRun,
-/// "PATH:line:column: reason", when there is none, "PATH: reason" when its tables are too large to
-/// be held, and as readWholeFile does.
+/// "PATH:line:column: reason", when there is none, "PATH: reason" when its tables take more than
+/// kLargestTablesOctets, and as readWholeFile does.
 MifContent readMifFile(const std::string& path);
+
+/// The same of the octets of a file, whose path is for messages. Of a value counts what it takes
+/// here, its text or the name of its number in the longest form that a command writes, and the name
+/// of its column, so that what is made of the tables has a bound with them.
+MifContent mifContentOf(const std::string& path, std::string_view octets,
+                        std::size_t largestOctets = kLargestTablesOctets);
 
 /// As a MIF file writes it, in the standard's letters: "Integer", "String(8)".
 std::string shownType(const Mif::Type& type);

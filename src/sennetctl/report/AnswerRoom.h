@@ -2,21 +2,16 @@
 
 // How much of a server's answer a command holds in a form that can be shown.
 
-#include <cstddef>
+#include "report/Room.h"
 
 namespace sennetctl {
 
-/// A short answer may refer to the same long text over and over, as numbers do to their names, so
-/// what is made of an answer has a bound of its own.
-class AnswerRoom {
+/// A short answer may refer to the same long text over and over, as numbers do to their names.
+class AnswerRoom : public Room {
   public:
     static constexpr std::size_t kMostOctets = std::size_t{128} << 20;
 
-    /// Raises CannotRun when the answer, with these octets of memory, becomes too large.
-    void take(std::size_t octets);
-
-  private:
-    std::size_t leftOctets = kMostOctets;
+    AnswerRoom() : Room(kMostOctets, "the answer is too large to show") {}
 };
 
 }  // namespace sennetctl

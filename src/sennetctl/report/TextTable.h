@@ -21,7 +21,8 @@ class TextTable {
     void addRow(std::vector<std::string> row);
 
     /// Titles, in bold where there are colours, and rows; no line ends in blanks. Titles are never
-    /// shortened, and cells not to less than 16 characters.
+    /// shortened, and cells not to less than 16 characters. Where that would fill more than 64 MiB,
+    /// for one long cell among many rows, the cells stand whole and two blanks apart.
     void print(const Output& output) const;
 
   private:

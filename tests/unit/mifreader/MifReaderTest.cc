@@ -361,4 +361,11 @@ TEST(MifReaderTest, ReadsManyAttributesAndShortRowsInLinearTime) {
     EXPECT_EQ(component.tables.at(0).rows.size(), 100000U);
 }
 
+TEST(MifReaderTest, RefusesMoreValuesThanItHolds) {
+    const std::string start = "Start Component Name = \"a\"\n" + kHead + kAttribute +
+                              "\nEnd Group\nStart Table Name = \"t\" Id = 1 Class = \"c\"\n";
+    std::string commas(4194304, ',');
+    EXPECT_EQ(refusal(start + "{" + commas), "6:4194306: more than 4194304 values in rows");
+}
+
 }  // namespace

@@ -120,20 +120,24 @@ TEST_F(MifCommandsTest, NumbersAreShownByTheirNames) {
 // Rows may leave out what the template has, so that a small file can have a huge table.
 TEST_F(MifCommandsTest, TablesThatCannotBeHeldAreRefused) {
     std::string rows;
-    for (int i = 0; i < 300; ++i) {
+    for (int i = 0; i < 25; ++i) {
         rows += "{ }\n";
     }
+    std::string quotes;
+    for (int i = 0; i < 1000000; ++i) {
+        quotes += "\\\"";
+    }
     const std::string className = "\"Own|Big|001\"";
-    const std::string path = file(
-        "big", kMifStart + "Start Group Name = \"Big\" Class = " + className + " Key = 1\n" +
-                   attributeMif(1, "Text", "String(9)", "\"" + std::string(1 << 20, 'x') + "\"") +
-                   "End Group\nStart Table Name = \"Big\" Class = " + className + " Id = 2\n" +
-                   rows + "End Table\n" + kMifEnd);
+    const std::string path =
+        file("big", kMifStart + "Start Group Name = \"Big\" Class = " + className + " Key = 1\n" +
+                        attributeMif(1, "Text", "String(9)", "\"" + quotes + "\"") +
+                        "End Group\nStart Table Name = \"Big\" Class = " + className + " Id = 2\n" +
+                        rows + "End Table\n" + kMifEnd);
     try {
         showMifFile(path, output.plain());
-        ADD_FAILURE() << "300 MiB of values";
+        ADD_FAILURE() << "25 times a million &quot;";
     } catch (const CannotRun& failure) {
-        EXPECT_EQ(failure.what(), path + ": its tables are larger than 256 MiB");
+        EXPECT_EQ(failure.what(), path + ": its tables are larger than 128 MiB");
     }
 }
 
@@ -176,6 +180,17 @@ TEST_F(MifCommandsTest, RowsThatNothingTellsApartAreComparedAsAWhole) {
               "  - a, 3\n"
               "  + a, 4\n"
               "2 differences\n");
+}
+
+TEST_F(MifCommandsTest, RowsComparedAsAWholeShowWhatIsMissingInThem) {
+    EXPECT_EQ(difference(fans("old", "{ 1, \"a\", 3 }\n{ 2, \"a\", 3 }\n{ 3, \"\", 4 }\n"),
+                         fans("new", "{ 1, \"a\", unsupported }\n{ 2, \"a\", 3 }\n{ 3, \"b\" }\n")),
+              "Fan\n"
+              "  - a, 3\n"
+              "  - 4\n"
+              "  + a, unsupported\n"
+              "  + b, 0\n"
+              "4 differences\n");
 }
 
 TEST_F(MifCommandsTest, TablesAndAttributesComeAndGo) {

@@ -27,6 +27,21 @@ TEST(TextTableTest, ForeignTextIsHarmless) {
     EXPECT_EQ(output.text(), "A\n [1m\n");
 }
 
+// Aligned, each of the thousand lines would have a hundred thousand octets.
+TEST(TextTableTest, OneLongCellDoesNotMakeManyLinesLong) {
+    const std::string wide(100000, 'x');
+    TextTable table({"A", "B"});
+    table.addRow({wide, "1"});
+    std::string expected = "A  B\n" + wide + "  1\n";
+    for (int i = 0; i < 1000; ++i) {
+        table.addRow({"four", "2"});
+        expected += "four  2\n";
+    }
+    CapturedOutput output;
+    table.print(output.plain());
+    EXPECT_TRUE(output.text() == expected) << output.text().size() << " octets";
+}
+
 // 26 + 2 + 26 + 2 + 2 are more than the 50 of the terminal: the long cells get 22 each.
 TEST(TextTableTest, LongCellsAreCutToTheWidthOfTheTerminal) {
     const std::string letters = "abcdefghijklmnopqrstuvwxyz";

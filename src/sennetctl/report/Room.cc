@@ -1,12 +1,12 @@
-#include "report/AnswerRoom.h"
+#include "report/Room.h"
 
 #include "report/CannotRun.h"
 
 namespace sennetctl {
 
-void AnswerRoom::take(std::size_t octets) {
+void Room::take(std::size_t octets) {
     if (octets > leftOctets) {
-        throw CannotRun("the answer is too large to show");
+        throw CannotRun(refusal);
     }
     leftOctets -= octets;
 }
