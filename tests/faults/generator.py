@@ -17,6 +17,15 @@ START = "Corvane CIM to MIF Generator, version 5.20\n\nCreating MIF files in {}\
 QUICK = 250
 
 
+def environment_of_faults(binaries, faults):
+    """What makes the library of wrong answers of the system do `faults`; nothing without any."""
+    if not faults:
+        return {}
+    return {"LD_PRELOAD": str(binaries.parent / "faults" / "libsystemfaults.so"),
+            "ASAN_OPTIONS": "verify_asan_link_order=0",
+            **{"FAULTS_" + name: str(value) for name, value in faults.items()}}
+
+
 class Generator:
     """Scripts, output directories and configuration of `sennet` below `place`."""
 
@@ -54,14 +63,8 @@ class Generator:
 
     def environment(self, **faults):
         """`faults` are what the library of wrong answers of the system shall do."""
-        environment = {"VELM_CONFIG": str(self.configuration), "CIM_LOCAL_SOCKET": str(self.socket),
-                       "CIM_EMBEDDED": "never"}
-        if faults:
-            library = self.binaries.parent / "faults" / "libsystemfaults.so"
-            environment["LD_PRELOAD"] = str(library)
-            environment["ASAN_OPTIONS"] = "verify_asan_link_order=0"
-            environment.update({"FAULTS_" + name: str(value) for name, value in faults.items()})
-        return environment
+        return {"VELM_CONFIG": str(self.configuration), "CIM_LOCAL_SOCKET": str(self.socket),
+                "CIM_EMBEDDED": "never", **environment_of_faults(self.binaries, faults)}
 
     def start(self, product, faults=None, limits=(), before=(), **options):
         """`before` is a command that runs the program that follows it."""

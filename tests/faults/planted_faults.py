@@ -1,5 +1,6 @@
 """What another user may leave where root's inventory writes its files."""
 
+import itertools
 import os
 import pathlib
 import signal
@@ -9,6 +10,7 @@ import time
 
 import neighbours
 import rows
+from generator import environment_of_faults
 from neighbours import STRANGER, Deed, Generator, as_stranger
 from rows import expect, expect_equal
 
@@ -50,9 +52,13 @@ class Surroundings:
         self._server.wait()
         self._place.__exit__(*what)
 
-    def run(self):
-        finished = self.generator.run(self._socket, self.product, umask=UMASK)
-        expect_equal(finished.status, 0, f"status of {finished}")
+    def start(self, **faults):
+        environment = self.generator.environment(
+            self._socket, **environment_of_faults(self.trial.bin, faults))
+        return rows.Program(self.generator.command(self.product), environment, umask=UMASK)
+
+    def run(self, **faults):
+        expect_success(self.start(**faults).wait())
 
     def names(self):
         """What is in the output directory, hidden files too."""
@@ -83,6 +89,10 @@ class Surroundings:
         expect(not os.path.lexists(self.absent), f"{what}: a file was made through a link")
 
 
+def expect_success(finished):
+    expect_equal(finished.status, 0, f"status of {finished}")
+
+
 def plant_socket(path):
     with socket.socket(socket.AF_UNIX) as made:
         made.bind(str(path))
@@ -109,10 +119,10 @@ KEPT = {
 }
 
 
-def each_product(trial):
+def each_product(trial, products=PRODUCTS):
     """The surroundings of each product, with the files that it writes there."""
     neighbours.need()
-    for product in PRODUCTS:
+    for product in products:
         with Surroundings(trial, product) as here:
             here.run()
             expected = here.contents()
@@ -177,6 +187,64 @@ def _(trial):
     return "left alone, the run ends and leaves nothing else behind"
 
 
+def replace_hidden(directory, target):
+    """Puts links to `target` in the place of all hidden files; how many."""
+    names = [name for name in os.listdir(directory) if name.startswith(".")]
+    for name in names:
+        (directory / name).unlink()
+        (directory / name).symlink_to(target)
+    return len(names)
+
+
+def replaced_at(here, number, named, target):
+    """How many temporary files were replaced by links to `target` before the run's call of that
+    number on output files; None when it makes fewer."""
+    program = here.start(CALL=number, STOP=1, NAMED=named)
+    try:
+        stopped = program.stops()
+        replaced = as_stranger(replace_hidden, here.generator.output, target) if stopped else None
+    finally:
+        program.signal(signal.SIGCONT)
+        finished = program.wait()
+    expect_success(finished)
+    return replaced
+
+
+def replaced_at_each_call(here, named, targets):
+    """In how many runs a temporary file was replaced."""
+    runs = 0
+    for number in itertools.count(1):
+        for target in targets:
+            replaced = replaced_at(here, number, named, target)
+            if replaced is None:
+                return runs
+            here.expect_precious(f"{here.product}, links to {target.name} before call {number}")
+            runs += replaced > 0
+    raise AssertionError("itertools.count has no end")
+
+
+def replaced_temporary_names(trial, named):
+    for here, expected in each_product(trial, PRODUCTS if trial.full else PRODUCTS[:2]):
+        # Without the sticky bit names can be taken from root.
+        here.generator.output.chmod(0o777)
+        runs = replaced_at_each_call(here, named, trial.some((here.precious, here.absent)))
+        expect(runs > 0, f"{here.product}: no temporary name was ever seen")
+        trial.count(runs)
+        here.run(NAMED=named)
+        expect_own_files(here, expected, f"{here.product}, after links were planted")
+    return "nothing is followed; the files of the next run are whole"
+
+
+@SUITE.case("links put in the place of each named temporary file before each call on it")
+def _(trial):
+    return replaced_temporary_names(trial, 1)
+
+
+@SUITE.case("links put in the place of each nameless temporary file that has just got a name")
+def _(trial):
+    return replaced_temporary_names(trial, 0)
+
+
 def disturb(directory, target, names, end_s):
     """Puts links to `target` at the names of the outputs and at every other that appears. Returns how
     many took the place of a file of root at an output name, and how many that of another."""
@@ -208,9 +276,10 @@ def _(trial):
         neighbour = Deed(disturb, here.generator.output, here.precious, list(expected), end_s)
         while time.monotonic() < end_s:
             trial.count()
-            here.run()
-        outputs, _ = neighbour.result()
+            here.run(NAMED=trial.tried % 2)
+        outputs, others = neighbour.result()
         expect(outputs > 0, "no link was put at the name of an output")
+        expect(others > 0 or not trial.full, "no link was put at the name of a temporary file")
         here.expect_precious("while links were planted")
         here.run()
         expect_own_files(here, expected, "after links were planted")

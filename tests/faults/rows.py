@@ -201,6 +201,17 @@ class Program:
     def is_running(self):
         return self._finished is None and not select.select([self._ended], [], [], 0)[0]
 
+    def stops(self):
+        """Waits until a signal has stopped it, or it has ended; True when stopped."""
+        end_s = time.monotonic() + PATIENCE_S
+        while self.is_running():
+            if os.waitid(os.P_PID, self.pid, os.WSTOPPED | os.WNOHANG | os.WNOWAIT):
+                return True
+            if time.monotonic() > end_s:
+                raise Failure(f"neither stops nor ends: {self.kill()}")
+            time.sleep(0.001)
+        return False
+
     def wait(self, patience_s=PATIENCE_S):
         """Finished, or Failure when it did not end in time; it is killed then."""
         if self._finished:

@@ -1,5 +1,6 @@
 // Put before the C library by LD_PRELOAD, this gives a program a clock that hastens and a system
-// that interrupts, writes little at a time, knows no nameless files or fails at one given call.
+// that interrupts, writes little at a time, knows no nameless files, or fails or stops it at one
+// given call.
 // What it shall do it reads from the environment:
 //   FAULTS_CLOCK=N      N seconds of the monotonic clock pass in one
 //   FAULTS_INTERRUPT=1  every other call that may wait ends with EINTR; writes take 1000 octets
@@ -7,6 +8,7 @@
 //   FAULTS_CALL=N       the N-th call that makes, fills or names a file fails
 //   FAULTS_ERROR=E      ... with this error number
 //   FAULTS_MARK=PATH    ... and writes its name into this new file when it does
+//   FAULTS_STOP=1       ... or rather the program stops before it, until it gets SIGCONT
 
 #include <dlfcn.h>
 #include <fcntl.h>
@@ -18,6 +20,7 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <csignal>
 #include <cstdarg>
 #include <cstdlib>
 #include <cstring>
@@ -54,6 +57,10 @@ bool failsHere(const char* call) {
     static const long wanted = numberOf("FAULTS_CALL");
     static long calls = 0;
     if (wanted == 0 || ++calls != wanted) {
+        return false;
+    }
+    if (numberOf("FAULTS_STOP") != 0) {
+        ::raise(SIGSTOP);
         return false;
     }
     if (const char* mark = ::getenv("FAULTS_MARK")) {
