@@ -4,6 +4,7 @@ them."""
 import collections
 import multiprocessing
 import random
+import re
 import socket
 import threading
 import time
@@ -14,10 +15,17 @@ PATIENCE_S = 60
 PROCESSES = 8
 # How long an unhurried client takes for a request that it never ends.
 _DRIP_S = 0.02
+_STATUS_LINE = re.compile(rb"^HTTP/1\.1 (\d{3}) ", re.MULTILINE)
 
 
 class WrongAnswer(Exception):
     pass
+
+
+def is_refusal(answer):
+    """Whether it begins with a head, and every head says that the request was wrong."""
+    statuses = _STATUS_LINE.findall(answer)
+    return answer.startswith(b"HTTP/1.1 ") and bool(statuses) and min(statuses) >= b"400"
 
 
 class Answers:
@@ -157,7 +165,7 @@ class Client:
         self.send_and_leave(bytes(octets), "malformed")
 
     def send_garbage(self):
-        self.send_and_leave(self.random.choice((
+        self.send_refused(self.random.choice((
             self.random.randbytes(self.random.randrange(1, 3000)),
             b"GET / HTTP/1.1\r\n\r\n",
             b"\r\n" * 3000,
@@ -171,7 +179,7 @@ class Client:
         )), "malformed")
 
     def send_oversized(self):
-        self.send_and_leave(self.random.choice((
+        self.send_refused(self.random.choice((
             post(b"<CIM>" + b" " * (2 << 20)),
             post(b"x", b"X-Long: " + b"y" * 200000 + b"\r\n"),
             post(b"x", b"X-One-Of-Many: y\r\n" * 20000),
@@ -179,17 +187,28 @@ class Client:
         )), "oversized")
 
     def send_and_leave(self, octets, kind):
-        """Whatever the server says to it; it may close before it has read all."""
+        """Whatever the server says to it, that must have an end; it may come before the server has
+        read all. Returns what arrived."""
+        answer = bytearray()
         with self.connected() as connection:
-            connection.settimeout(1)
             try:
                 connection.sendall(octets)
                 connection.shutdown(socket.SHUT_WR)
-                while connection.recv(65536):
-                    pass
-            except (ConnectionError, TimeoutError, OSError):
+                while piece := connection.recv(65536):
+                    answer += piece
+            except TimeoutError as error:
+                raise WrongAnswer(f"no end after {octets[:200]!r}") from error
+            except OSError:
+                # A reset: the server has closed with octets left unread.
                 pass
         self.counts[kind] += 1
+        return bytes(answer)
+
+    def send_refused(self, octets, kind):
+        """What cannot be right: the server must refuse it, or close without a word."""
+        answer = self.send_and_leave(octets, kind)
+        if answer and not is_refusal(answer):
+            raise WrongAnswer(f"to {octets[:200]!r}: {answer[:200]!r}")
 
     def drip(self):
         octets = post(self.request())
