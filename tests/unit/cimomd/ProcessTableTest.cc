@@ -68,6 +68,27 @@ TEST(ProcessTable, takesCommandLinesApart) {
     EXPECT_EQ(parseCommandLine("\0\0\0"sv), Words{});
 }
 
+TEST(ProcessTable, takesTheFirstWordsOfALongCommandLine) {
+    std::string manyWords;
+    for (int i = 0; i < 300; ++i)
+        manyWords += std::string("w") + '\0';
+    EXPECT_EQ(parseCommandLine(manyWords), Words(256, "w"));
+    EXPECT_EQ(parseCommandLine(std::string(16384, '\0') + "x"), Words(256, ""));
+}
+
+TEST(ProcessTable, takesTheFirstCharactersOfALongCommandLine) {
+    using namespace std::string_literals;
+    const std::string path(3000, 'p');
+    EXPECT_EQ(parseCommandLine(path + "\0"s + path + "\0x"s),
+              (Words{path, std::string(1095, 'p')}));
+    EXPECT_EQ(parseCommandLine(path + "\0"s + std::string(1095, 'p') + "\0"s),
+              (Words{path, std::string(1095, 'p')}));
+    const std::string whole(4095, 'p');
+    EXPECT_EQ(parseCommandLine(whole + "\0xy"s), Words{whole});
+    EXPECT_EQ(parseCommandLine(whole + "\u20ac\u20ac"), Words{whole + "\u20ac"});
+    EXPECT_EQ(parseCommandLine(whole + "\U0001f427"), Words{whole});
+}
+
 TEST(ProcessTable, listsProcessesInTheOrderOfTheirNumbers) {
     RecordedTree tree;
     for (const char* name : {"10", "9", "100", "self", "1x", "01", "+2", "99999999999999999999"})

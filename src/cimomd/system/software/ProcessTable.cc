@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cstddef>
 
 #include "files/LinkTarget.h"
 #include "files/TextFields.h"
@@ -52,6 +53,14 @@ class NumberFields {
     bool isComplete = false;
 };
 
+std::string_view beginningOfCommandLine(std::string_view bytes) {
+    std::string_view beginning = firstCharacters(bytes, kMaxCommandLineCharacters);
+    // Of the word behind it nothing is left, which is not the same as an empty word.
+    if (beginning.size() < bytes.size() && beginning.back() == '\0')
+        beginning.remove_suffix(1);
+    return beginning;
+}
+
 }  // namespace
 
 std::optional<ProcessStatus> parseProcessStatus(std::string_view text) {
@@ -94,8 +103,10 @@ std::vector<std::string> parseCommandLine(std::string_view bytes) {
     const std::size_t end = bytes.find_last_not_of('\0');
     if (end == std::string_view::npos)
         return {};
-    const std::vector<std::string_view> words = partsOf(bytes.substr(0, end + 1), '\0');
-    return {words.begin(), words.end()};
+    const std::vector<std::string_view> words =
+        partsOf(beginningOfCommandLine(bytes.substr(0, end + 1)), '\0');
+    const std::size_t count = std::min(words.size(), kMaxCommandLineWords);
+    return {words.begin(), words.begin() + static_cast<std::ptrdiff_t>(count)};
 }
 
 Fact<std::vector<std::uint64_t>> listProcesses(const std::filesystem::path& directory) {

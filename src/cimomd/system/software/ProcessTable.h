@@ -45,8 +45,14 @@ struct ProcessOwnership {
 };
 ProcessOwnership parseProcessOwnership(std::string_view text);
 
-/// The words of /proc/PID/cmdline; none for the kernel's own threads. Some programs replace theirs
-/// by one line of text, with NUL bytes behind it.
+/// Every user chooses the command lines of his processes, which all answers about processes hold.
+inline constexpr std::size_t kMaxCommandLineWords = 256;
+/// In UTF-16 units, the ends of words included.
+inline constexpr std::size_t kMaxCommandLineCharacters = 4096;
+
+/// The words of /proc/PID/cmdline, of a long one the beginning: at most kMaxCommandLineWords, of at
+/// most kMaxCommandLineCharacters together, where the last word may be cut. None for the kernel's
+/// own threads. Some programs replace theirs by one line of text, with NUL bytes behind it.
 std::vector<std::string> parseCommandLine(std::string_view bytes);
 
 struct Process {
