@@ -5,8 +5,9 @@
 
 namespace cimomd {
 
-FileTexts::FileTexts(const std::vector<std::filesystem::path>& files, const SystemCalls& calls) {
-    const std::vector<Fact<std::string>> read = calls.textsInTime(files);
+FileTexts::FileTexts(TextSource source, const std::vector<std::filesystem::path>& files,
+                     const SystemCalls& calls) {
+    const std::vector<Fact<std::string>> read = calls.textsInTime(source, files);
     for (std::size_t i = 0; i < files.size(); ++i)
         texts.emplace(files[i], read[i]);
 }

@@ -15,7 +15,8 @@ namespace cimomd {
 class FileTexts {
   public:
     /// Reads the files, none of which can hang the caller.
-    FileTexts(const std::vector<std::filesystem::path>& files, const SystemCalls& calls);
+    FileTexts(TextSource source, const std::vector<std::filesystem::path>& files,
+              const SystemCalls& calls);
 
     // As readFact, readNumber and readSignedNumber, and a number that is 0 or 1. A file that was
     // not among those to be read is Absent.

@@ -21,6 +21,10 @@ void followZone() {
 
 }  // namespace
 
+LiveSystemCalls::LiveSystemCalls(const SilenceLimits& silence)
+    : files{FileReadGuard(readFileStart, silence), FileReadGuard(readFileStart, silence),
+            FileReadGuard(readFileStart, silence), FileReadGuard(readFileStart, silence)} {}
+
 std::int64_t LiveSystemCalls::now() const {
     return std::time(nullptr);
 }
@@ -46,8 +50,8 @@ Fact<FileSystemSize> LiveSystemCalls::fileSystemSizeInTime(const std::string& mo
 }
 
 std::vector<Fact<std::string>> LiveSystemCalls::textsInTime(
-    const std::vector<std::filesystem::path>& wanted) const {
-    return files.read(wanted);
+    TextSource source, const std::vector<std::filesystem::path>& wanted) const {
+    return files.at(static_cast<std::size_t>(source)).read(wanted);
 }
 
 std::optional<std::string> LiveSystemCalls::machine() const {

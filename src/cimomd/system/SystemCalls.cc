@@ -5,7 +5,7 @@
 namespace cimomd {
 
 std::vector<Fact<std::string>> SystemCalls::textsInTime(
-    const std::vector<std::filesystem::path>& files) const {
+    TextSource /*source*/, const std::vector<std::filesystem::path>& files) const {
     std::vector<Fact<std::string>> texts;
     texts.reserve(files.size());
     for (const std::filesystem::path& file : files) {

@@ -2,6 +2,7 @@
 
 // What only a system call tells, behind an interface, so that tests need no live machine.
 
+#include <cstddef>
 #include <cstdint>
 #include <filesystem>
 #include <optional>
@@ -27,6 +28,10 @@ struct FileSystemSize {
 
 inline constexpr std::size_t kMaxGuardedBytes = std::size_t{32} << 10;
 
+/// What stands behind small files that may never answer.
+enum class TextSource { Processes, NetworkDrivers, Sensors, Batteries };
+inline constexpr std::size_t kTextSourceCount = 4;
+
 class SystemCalls {
   public:
     virtual ~SystemCalls() = default;
@@ -47,9 +52,10 @@ class SystemCalls {
         return fileSystemSize(mountPoint);
     }
     /// The texts of small files behind which a driver or another process stands, in their order,
-    /// of each the first kMaxGuardedBytes. TimedOut: that one did not answer within some seconds.
+    /// of each the first kMaxGuardedBytes. TimedOut: that one did not answer within some seconds,
+    /// or too many others of the same `source` did not lately.
     virtual std::vector<Fact<std::string>> textsInTime(
-        const std::vector<std::filesystem::path>& files) const;
+        TextSource source, const std::vector<std::filesystem::path>& files) const;
     /// The machine's name as uname has it, for example "x86_64".
     virtual std::optional<std::string> machine() const = 0;
     /// The internet addresses of all network interfaces, in any order.

@@ -97,6 +97,7 @@ TEST_F(BatteryTest, isListedWhenItDoesNotAnswer) {
     EXPECT_EQ(battery.name, "BAT0");
     EXPECT_EQ(battery.chargeCycles, 7U);
     EXPECT_TRUE(calls.wasAskedFor("BAT0/cycle_count"));
+    EXPECT_EQ(calls.sources, std::set{TextSource::Batteries});
     calls.silent = tree.root / "power/BAT0/cycle_count";
     EXPECT_FALSE(read().chargeCycles);
     EXPECT_EQ(read().chargeCycles.reason(), Absence::TimedOut);

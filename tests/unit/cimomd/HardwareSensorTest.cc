@@ -153,6 +153,7 @@ TEST(HardwareSensor, asksInTimeForWhatIsThereOnly) {
     EXPECT_EQ((*sensors)[1].reading, std::int64_t{900});
     EXPECT_EQ((*sensors)[1].min.reason(), Absence::Absent);
     EXPECT_EQ(calls.asked.size(), 3U);
+    EXPECT_EQ(calls.sources, std::set{TextSource::Sensors});
 }
 
 TEST(HardwareSensor, asksFansAloneForFans) {

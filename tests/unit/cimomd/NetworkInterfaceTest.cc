@@ -135,6 +135,7 @@ TEST(NetworkInterface, hasNoSpeedWhenTheDriverHangs) {
     EXPECT_EQ((*interfaces)[0].hasCarrier, true);
     EXPECT_EQ((*interfaces)[0].mtuBytes, 1500U);
     EXPECT_TRUE(calls.wasAskedFor("net/a/duplex"));
+    EXPECT_EQ(calls.sources, std::set{TextSource::NetworkDrivers});
 }
 
 TEST(NetworkInterface, takesOnlyWiredHardwareAsEthernetPorts) {

@@ -46,6 +46,7 @@ TEST_F(UnixProcessProviderTest, listsProcessesWhoseCommandLineIsKeptBack) {
         EXPECT_EQ(textOf(instances[i], "Handle"), id);
         EXPECT_EQ(textOf(instances[i], "Parameters"), id == "101" ? "null" : "p" + id + " ");
     }
+    EXPECT_EQ(watched.sources, std::set{TextSource::Processes});
 }
 
 TEST_F(UnixProcessProviderTest, publishesAnOrdinaryProcess) {

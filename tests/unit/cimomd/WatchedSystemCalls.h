@@ -3,6 +3,7 @@
 // System calls that note which files were asked for with a deadline, and keep some of them back.
 
 #include <algorithm>
+#include <set>
 
 #include "FixedSystemCalls.h"
 
@@ -11,8 +12,9 @@ namespace cimomd {
 class WatchedSystemCalls : public FixedSystemCalls {
   public:
     std::vector<Fact<std::string>> textsInTime(
-        const std::vector<std::filesystem::path>& files) const override {
-        std::vector<Fact<std::string>> texts = SystemCalls::textsInTime(files);
+        TextSource source, const std::vector<std::filesystem::path>& files) const override {
+        std::vector<Fact<std::string>> texts = SystemCalls::textsInTime(source, files);
+        sources.insert(source);
         for (std::size_t i = 0; i < files.size(); ++i) {
             asked.push_back(files[i].string());
             if (files[i] == silent)
@@ -32,6 +34,8 @@ class WatchedSystemCalls : public FixedSystemCalls {
     /// A file that never answers.
     std::filesystem::path silent;
     mutable std::vector<std::string> asked;
+    /// What the files were said to belong to.
+    mutable std::set<TextSource> sources;
 };
 
 }  // namespace cimomd

@@ -169,7 +169,7 @@ class ProcessStream : public InstanceStream {
         std::vector<std::filesystem::path> files;
         for (std::size_t i = position; i < ids.size() && files.size() < kProcessesAtOnce; ++i)
             files.push_back(commandLineFile(directory, ids[i]));
-        commandLines = calls.textsInTime(files);
+        commandLines = calls.textsInTime(TextSource::Processes, files);
     }
 
     Fact<std::string> userNameOf(const Process& process) const {

@@ -136,7 +136,7 @@ Fact<std::vector<Battery>> readBatteries(const std::filesystem::path& directory,
         if (isBattery(directory / name))
             directories.push_back(directory / name);
     }
-    const FileTexts texts(filesOf(directories), calls);
+    const FileTexts texts(TextSource::Batteries, filesOf(directories), calls);
     std::vector<Battery> batteries;
     for (const std::filesystem::path& place : directories) {
         const Supply supply{texts, place};

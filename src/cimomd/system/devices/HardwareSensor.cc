@@ -152,7 +152,7 @@ Fact<std::vector<HardwareSensor>> readSensors(const std::filesystem::path& direc
     std::vector<Chip> chips = readChips(directory, *numbers);
     for (Chip& chip : chips)
         listChannels(chip, isWanted);
-    const FileTexts texts(filesOf(chips), calls);
+    const FileTexts texts(TextSource::Sensors, filesOf(chips), calls);
     std::vector<HardwareSensor> sensors;
     for (const Chip& chip : chips) {
         for (const SensorChannel& channel : chip.channels)

@@ -96,7 +96,7 @@ FileTexts readLinks(const std::vector<std::filesystem::path>& interfaces,
         for (const char* name : {"carrier", "speed", "duplex"})
             files.push_back(directory / name);
     }
-    return {files, calls};
+    return {TextSource::NetworkDrivers, files, calls};
 }
 
 }  // namespace
