@@ -65,8 +65,9 @@ bool ColumnNames::isFree(const std::string& name) const {
     const String inQve =
         SennetUtilities::formatPropertyName4quvelle(String(name.c_str()), kLongestName);
     return !sameIgnoringCase(name, "Index") && !isQveColumn(inQve) && !isLumoColumn(written) &&
-           std::none_of(taken.begin(), taken.end(),
-                        [&](const String& other) { return String::equalNoCase(other, written); });
+           !isSqlWord(inQve) && std::none_of(taken.begin(), taken.end(), [&](const String& other) {
+               return String::equalNoCase(other, written);
+           });
 }
 
 bool ColumnNames::take(const std::string& name) {

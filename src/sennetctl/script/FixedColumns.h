@@ -1,7 +1,8 @@
 #pragma once
 
-// Columns that each table has besides those of its script. Databases take no two names that differ
-// in case only, MIF readers do.
+// Names of columns that are taken: each table has columns besides those of its script, and
+// databases have words of their own. Databases take no two names that differ in case only, MIF
+// readers do.
 
 #include <Pegasus/Common/String.h>
 
@@ -15,5 +16,9 @@ bool isQveColumn(const Pegasus::String& name);
 
 /// The same for QVE with Lumo.
 bool isLumoColumn(const Pegasus::String& name);
+
+/// Whether one of Oracle, SQL Server, Sybase, MariaDB and SQLite takes no column of this name when
+/// it has no quotes. Of their words only those that a property may be called.
+bool isSqlWord(const Pegasus::String& name);
 
 }  // namespace sennetctl

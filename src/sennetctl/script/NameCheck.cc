@@ -84,7 +84,8 @@ class NameChecker {
                 tellRepeated(column, "QVE", name, used);
             }
             tellOtherCase(columns, column);
-            tellNoSqlName(column, textOf(name));
+            tellRenamed(column);
+            tellNoSqlName(column, name);
         }
     }
 
@@ -146,7 +147,27 @@ class NameChecker {
         }
     }
 
-    void tellNoSqlName(const NamedColumn& column, const std::string& name) {
+    void tellRenamed(const NamedColumn& column) {
+        const String name =
+            SennetUtilities::formatPropertyName4quvelle(column.name, column.name.size() + 1);
+        String expected = withUnderscores(column.name);
+        for (const char parenthesis : {'(', ')'}) {
+            expected = SennetUtilities::replaceAll(expected, parenthesis, '_');
+        }
+        if (!String::equal(name, expected)) {
+            add(column.place,
+                "the name " + textOf(column.name) + " becomes " + textOf(name) +
+                    " for QVE, for databases have a word that is called so",
+                Severity::Note);
+        }
+    }
+
+    void tellNoSqlName(const NamedColumn& column, const String& inQve) {
+        const std::string name = textOf(inQve);
+        if (isSqlWord(inQve)) {
+            add(column.place, "the name " + textOf(column.name) +
+                                  " is a word of SQL: for QVE some databases refuse the table");
+        }
         for (const NameFault& fault : sqlNameFaults(name)) {
             add(column.place, "the name " + textOf(column.name) + fault.message, fault.severity);
         }

@@ -7,6 +7,7 @@
 #include "cim/LocalServer.h"
 #include "cim/ValueText.h"
 #include "report/AnswerRoom.h"
+#include "report/Finding.h"
 #include "report/Json.h"
 #include "report/Progress.h"
 #include "report/Text.h"
@@ -89,8 +90,32 @@ const CIMProperty* pointerTo(const Column& column) {
     return column.declared ? &*column.declared : nullptr;
 }
 
+/// What is wrong with the properties that were asked for.
+std::vector<std::string> faultsOf(const std::vector<Column>& columns, const ClassContent& content) {
+    std::vector<std::string> faults;
+    for (const Column& column : columns) {
+        if (!column.declared) {
+            faults.push_back(textOf(content.definition.getClassName()) + " declares no property " +
+                             textOf(column.name));
+        }
+    }
+    return faults;
+}
+
+Json findingsJson(const std::vector<std::string>& faults) {
+    Json findings = Json::array();
+    for (const std::string& fault : faults) {
+        Json one = Json::object();
+        one["severity"] = nameOf(Severity::Warning);
+        one["message"] = fault;
+        findings.push_back(std::move(one));
+    }
+    return findings;
+}
+
 void printInstancesJson(const GetOptions& options, const ClassContent& content,
-                        const std::vector<Column>& columns, const Output& output) {
+                        const std::vector<Column>& columns, const std::vector<std::string>& faults,
+                        const Output& output) {
     AnswerRoom room;
     ValueText values(room);
     Json rows = Json::array();
@@ -107,6 +132,7 @@ void printInstancesJson(const GetOptions& options, const ClassContent& content,
     document["class"] = textOf(content.definition.getClassName());
     document["namespace"] = options.nameSpace;
     document["instances"] = std::move(rows);
+    document["findings"] = findingsJson(faults);
     printJson(document, output);
 }
 
@@ -139,20 +165,16 @@ void printTable(const ClassContent& content, const std::vector<Column>& columns,
 int showInstances(const GetOptions& options, const Output& output) {
     const ClassContent content = readClass(options, output);
     const std::vector<Column> columns = chooseColumns(options, content);
+    const std::vector<std::string> faults = faultsOf(columns, content);
     if (output.json) {
-        printInstancesJson(options, content, columns, output);
+        printInstancesJson(options, content, columns, faults, output);
     } else {
         printTable(content, columns, output);
     }
-    int status = content.instances.empty() ? kFindings : kFine;
-    for (const Column& column : columns) {
-        if (!column.declared) {
-            output.err << "sennetctl: " << printable(textOf(content.definition.getClassName()))
-                       << " declares no property " << printable(textOf(column.name)) << '\n';
-            status = kFindings;
-        }
+    for (const std::string& fault : faults) {
+        output.err << "sennetctl: " << printable(fault) << '\n';
     }
-    return status;
+    return content.instances.empty() || !faults.empty() ? kFindings : kFine;
 }
 
 }  // namespace sennetctl

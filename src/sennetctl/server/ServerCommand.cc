@@ -125,6 +125,9 @@ void printFailure(const Pegasus::LocalServerSearch& search, const ServerAnswers&
 Json answersJson(const Pegasus::LocalServerSearch& search, const ServerAnswers& answers) {
     Json document = Json::object();
     document["places"] = placesJson(search);
+    if (isPlaceNamed()) {
+        document["placesReason"] = "CIM_LOCAL_SOCKET names the only place that is tried";
+    }
     if (search.failure.empty()) {
         document["roundTripMilliseconds"] =
             answers.roundTripMilliseconds ? Json(*answers.roundTripMilliseconds) : Json(nullptr);

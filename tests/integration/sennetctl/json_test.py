@@ -34,7 +34,7 @@ instance of Example_Other { Id = "1"; };
 """
 GOOD_SCRIPT = ("[DEFAULT]\ntitle=Things\n[CIM]\nG[0]=Example_Thing\nN[0]=root/cimv2\n"
                "A[0]=Id,Number,State\n")
-TEXTS = "Example_Thing.Id=Id\nExample_Thing.Id.Size=8\nExample_Thing.State.Size=8\n"
+TEXTS = "Example_Thing.Id=Id\nExample_Thing.Number=Count\nExample_Thing.Id.Size=8\nExample_Thing.State.Size=8\n"
 
 
 def mif(table="Fan", size=9, rows='{ "a", 1 } { "b", 2 }'):
@@ -60,6 +60,7 @@ FILES = {
     "broken.mif": "Start Component\n   Nonsense\n",
 }
 REACHED, MISSING, SILENT = "cimomd.socket", "none.socket", "silent.socket"
+UNNAMED = ""  # those of the system
 # What is run: the command, the other words, the status and the socket of the server.
 RUNS = [
     ("check", "good.script.inv", 0, REACHED),
@@ -72,6 +73,7 @@ RUNS = [
     ("server", "--classes -n root/none", 1, REACHED),
     ("server", "", 1, MISSING),
     ("server", "--timeout 1", 1, SILENT),
+    ("server", "", 1, UNNAMED),
     ("server", "-n root//none", 2, REACHED),
     ("get", "Example_Thing", 0, REACHED),
     ("get", "Example_Thing -p Id,Nothing", 1, REACHED),
@@ -146,10 +148,11 @@ class JsonTest(unittest.TestCase):
     @classmethod
     def document_of(cls, command, words, status, server):
         line = [*command.split(), "--json", *words.split()]
+        place = {} if server == UNNAMED else {"CIM_LOCAL_SOCKET": str(cls.place / (server or MISSING))}
         result = subprocess.run(
             [ARGUMENTS.programs.resolve() / "sennetctl", *line], capture_output=True, text=True,
             timeout=60, check=False, cwd=cls.place,
-            env={"PATH": os.environ["PATH"], "CIM_LOCAL_SOCKET": str(cls.place / (server or MISSING)),
+            env={"PATH": os.environ["PATH"], "CIM_EMBEDDED": "never", **place,
                  "VELM_CONFIG": str(cls.place / "velm.properties")})
         if result.returncode != status:
             raise AssertionError(f"{line} ends with status {result.returncode}: {result}")

@@ -177,7 +177,7 @@ class NamesTest(unittest.TestCase):
                 self.assertEqual(outcome.refused_schemas(), dialects)
 
     def test_names_that_differ_in_case_only(self):
-        outcome = self.outcome("Disk", "DISK")
+        outcome = self.outcome("Unit", "UNIT")
         self.assertEqual({tuple(place) for *place, _ in outcome.told()}, {(7, 15, "warning")})
         self.assertTrue(any("differ in case only: for QVE the table has one twice" in message
                             for *_, message in outcome.told()))
@@ -185,9 +185,9 @@ class NamesTest(unittest.TestCase):
         self.assertEqual(outcome.refused_schemas(), set(DIALECTS))
 
     def test_one_name_twice_is_numbered(self):
-        outcome = self.outcome("Disk", "Disk")
+        outcome = self.outcome("Unit", "Unit")
         (*_, message), = outcome.told()
-        self.assertIn("two columns are called Disk: for all products this one becomes Disk3",
+        self.assertIn("two columns are called Unit: for all products this one becomes Unit3",
                       message)
         self.assertEqual(outcome.refused_files(), set())
         self.assertEqual(outcome.refused_schemas(), set())
@@ -230,6 +230,29 @@ class NamesTest(unittest.TestCase):
                                  ["warning"] if part else [])
                 self.assertIn(part or "", "".join(message for *_, message in told))
                 self.assertEqual(outcome.broken_schemas(), set(DIALECTS) if part else set())
+
+    def test_words_of_sql(self):
+        told = "is a word of SQL: for QVE some databases refuse the table"
+        for words, refused in (
+                (("Order", "Group"), True), (("Table", "Values"), True), (("Select", "From"), True),
+                (("Where", "Check"), True), (("Default", "References"), True),
+                (("Primary", "Unique"), True), (("User", "Number"), False)):
+            with self.subTest(words=words):
+                outcome = self.outcome(*words)
+                self.assertEqual(outcome.told(), [
+                    (7, 6, "warning", f"the name {words[0]} {told}"),
+                    (7, 15, "warning", f"the name {words[1]} {told}")])
+                self.assertEqual(outcome.broken_schemas(), set(DIALECTS) if refused else set())
+                for word in words if refused else ():
+                    with self.assertRaisesRegex(sqlite3.Error, f'near "{word}": syntax error'):
+                        sqlite3.connect(":memory:").execute(f"create table t ({word} varchar(9))")
+
+    def test_words_that_qve_writes_otherwise(self):
+        outcome = self.outcome("Level", "Size")
+        self.assertEqual(outcome.told(), [])
+        self.assertEqual(outcome.broken_schemas(), set())
+        text = (outcome.runs["QVE"].sql / "kwv_one_ms_schema.sql").read_text("ascii")
+        self.assertRegex(text, r"(?s) level_ varchar.* siz_ varchar")
 
     def test_a_title_that_the_shell_runs(self):
         outcome = self.outcome("ID", "Name", "x$(touch run)")

@@ -63,6 +63,11 @@ TEST_F(GetCommandTest, APropertyThatTheClassLacksIsAFinding) {
     options.properties = {"DeviceID", "Colour"};
     EXPECT_EQ(showInstances(options, output.plain()), 1);
     EXPECT_EQ(output.errors(), "sennetctl: CIM_Fan declares no property Colour\n");
+    CapturedOutput told;
+    EXPECT_EQ(showInstances(options, told.json()), 1);
+    EXPECT_EQ(told.document()["findings"].dump(),
+              R"([{"severity":"warning","message":"CIM_Fan declares no property Colour"}])");
+    EXPECT_EQ(told.document()["instances"][0]["Colour"], nullptr);
 }
 
 TEST_F(GetCommandTest, NoInstancesAreAFinding) {
@@ -78,7 +83,7 @@ TEST_F(GetCommandTest, JsonHasNumbersAndNames) {
     EXPECT_EQ(output.document().dump(),
               R"({"class":"CIM_Fan","namespace":"root/cimv2","instances":[{"DeviceID":"fan1",)"
               R"("State":{"value":2,"text":"Enabled"},"Bytes":18446744073709551615,)"
-              R"("Spare":null}]})");
+              R"("Spare":null}],"findings":[]})");
 }
 
 TEST_F(GetCommandTest, TellsWhatTheServerRefuses) {

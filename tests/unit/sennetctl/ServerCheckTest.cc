@@ -375,6 +375,30 @@ TEST_F(ServerCheckTest, NamesThatTheScriptsOfQveCannotHave) {
         << "blanks and parentheses are written as underscores";
 }
 
+TEST_F(ServerCheckTest, NamesThatAreWordsOfSql) {
+    texts.set("CIM_Fan.DeviceID", "user");
+    texts.set("CIM_Fan.State", "Order");
+    texts.set("CIM_Fan.Bytes", "Order Number");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State,Bytes\n"),
+              "5:6: warning: the name user is a word of SQL: for QVE some databases refuse the "
+              "table\n"
+              "5:15: warning: the name Order is a word of SQL: for QVE some databases refuse the "
+              "table\n");
+}
+
+TEST_F(ServerCheckTest, NamesThatQveWritesOtherwise) {
+    wantNotes = true;
+    texts.set("CIM_Fan.DeviceID", "Level");
+    texts.set("CIM_Fan.State", "SIZE");
+    texts.set("CIM_Fan.Bytes", "Resource (B) Size");
+    EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID,State,Bytes\n"),
+              "4:6: note: CIM_Fan: 2 instances\n"
+              "5:6: note: the name Level becomes level_ for QVE, for databases have a word that is "
+              "called so\n"
+              "5:15: note: the name SIZE becomes siz_ for QVE, for databases have a word that is "
+              "called so\n");
+}
+
 TEST_F(ServerCheckTest, AColumnCalledAsTheNumbersOfRows) {
     texts.set("CIM_Fan.DeviceID", "Index");
     EXPECT_EQ(check("G[0]=CIM_Fan\nA[0]=DeviceID\n"),

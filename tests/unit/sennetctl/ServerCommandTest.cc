@@ -44,6 +44,7 @@ TEST_F(ServerCommandTest, TellsPlacesNamespacesAndClasses) {
     EXPECT_EQ(document["places"][0]["place"], fans.server.socketPath());
     EXPECT_EQ(document["places"][0]["result"], "connected");
     EXPECT_EQ(document["places"][0]["chosen"], true);
+    EXPECT_EQ(document["placesReason"], "CIM_LOCAL_SOCKET names the only place that is tried");
     EXPECT_EQ(document["namespaces"].dump(),
               R"([{"namespace":"root/cimv2","classes":["CIM_Card","CIM_Fan"]},)"
               R"({"namespace":"root/own","classes":["OWN_Thing"]}])");
