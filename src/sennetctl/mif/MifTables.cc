@@ -127,7 +127,7 @@ class TableFiller {
     void addRow(std::size_t place, const Group& group, const Mif::Row& row) {
         MifTable& table = tables[place];
         std::vector<Value> values;
-        room.take(sizeof values);
+        room.take(sizeof(std::vector<Value>));
         for (std::size_t i = 0; i < group.attributes.size(); ++i) {
             const bool given = i < row.values.size() && row.values[i].kind != Value::Kind::Omitted;
             const std::optional<Value>& usual = group.attributes[i].value;
