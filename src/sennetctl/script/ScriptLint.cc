@@ -197,11 +197,10 @@ class Checker {
         for (const auto& [name, same] : places) {
             if (same.size() > 1) {
                 const std::string count = std::to_string(same.size());
-                add(Severity::Warning, *same[1],
-                    "the property " + same[1]->value + " is listed " +
-                        (same.size() == 2 ? "twice, and so gets two"
-                                          : count + " times, and so gets " + count) +
-                        " columns");
+                std::string message = "the property " + same[1]->value + " is listed ";
+                message.append(same.size() == 2 ? "twice, and so gets two"
+                                                : count + " times, and so gets " + count);
+                add(Severity::Warning, *same[1], message.append(" columns"));
             }
         }
     }

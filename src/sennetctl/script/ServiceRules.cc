@@ -1,16 +1,13 @@
 #include "script/ServiceRules.h"
 
-#include <array>
-#include <cstdio>
 #include <map>
-#include <memory>
 #include <sstream>
+
+#include "script/ProgramOutput.h"
 
 namespace sennetctl {
 
 namespace {
-
-constexpr std::size_t kLongestAnswer = 65536;
 
 /// The first value of each property: the service comes before the timer, of which only
 /// UnitFileState is asked.
@@ -72,22 +69,12 @@ std::optional<ServiceRules> parseServiceRules(std::string_view text) {
 
 std::optional<ServiceRules> askServiceRules(const char* product) {
     const std::string unit = std::string("sennet@") + product;
-    const std::string command =
-        "exec systemctl show -p LoadState,User,ProtectSystem,CapabilityBoundingSet,ReadWritePaths,"
-        "StateDirectory,UnitFileState " +
-        unit + ".service " + unit + ".timer 2>/dev/null";
-    const auto close = [](std::FILE* pipe) { ::pclose(pipe); };
-    const std::unique_ptr<std::FILE, decltype(close)> pipe(::popen(command.c_str(), "re"), close);
-    std::string text;
-    std::array<char, 4096> buffer{};
-    while (pipe && text.size() < kLongestAnswer) {
-        const std::size_t count = std::fread(buffer.data(), 1, buffer.size(), pipe.get());
-        if (count == 0) {
-            break;
-        }
-        text.append(buffer.data(), count);
-    }
-    return parseServiceRules(text);
+    constexpr unsigned kPatienceSeconds = 10;
+    const std::string asked =
+        "LoadState,User,ProtectSystem,CapabilityBoundingSet,ReadWritePaths,StateDirectory,"
+        "UnitFileState";
+    return parseServiceRules(outputOf(
+        {"systemctl", "show", "-p", asked, unit + ".service", unit + ".timer"}, kPatienceSeconds));
 }
 
 }  // namespace sennetctl

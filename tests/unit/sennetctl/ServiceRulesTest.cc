@@ -3,6 +3,11 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <filesystem>
+
+#include "support/ScopedEnvironment.h"
+#include "support/TempDirectory.h"
+
 namespace sennetctl {
 namespace {
 
@@ -42,6 +47,21 @@ TEST(ServiceRulesTest, WhatAnAdministratorChanges) {
     EXPECT_TRUE(parseServiceRules(with("=disabled", "=enabled-runtime"))->isScheduled);
     EXPECT_FALSE(parseServiceRules(with("=static", "=enabled"))->isScheduled)
         << "only the timer runs it";
+}
+
+TEST(ServiceRulesTest, SystemctlIsAskedForServiceAndTimer) {
+    const support::TempDirectory directory;
+    const std::string program = directory.write(
+        "systemctl",
+        "#!/bin/sh\n[ \"$1 $2 $4 $5\" = 'show -p sennet@CA.service sennet@CA.timer' ] || exit 1\n"
+        "printf 'LoadState=loaded\\nReadWritePaths=/srv/a\\n\\nUnitFileState=enabled\\n'\n");
+    std::filesystem::permissions(program, std::filesystem::perms::owner_all);
+    const support::ScopedEnvironment path("PATH", directory.path(""));
+    const std::optional<ServiceRules> rules = askServiceRules("CA");
+    ASSERT_TRUE(rules);
+    EXPECT_TRUE(rules->isScheduled);
+    EXPECT_THAT(rules->writable, ElementsAre("/srv/a"));
+    EXPECT_FALSE(askServiceRules("LD"));
 }
 
 TEST(ServiceRulesTest, NoServiceOrOneOfAnotherUser) {
