@@ -197,9 +197,13 @@ class Checker {
         for (const auto& [name, same] : places) {
             if (same.size() > 1) {
                 const std::string count = std::to_string(same.size());
-                std::string message = "the property " + same[1]->value + " is listed ";
-                message.append(same.size() == 2 ? "twice, and so gets two"
-                                                : count + " times, and so gets " + count);
+                const bool isPair = same.size() == 2;
+                std::string message = "the property ";
+                message.append(same[1]->value)
+                    .append(" is listed ")
+                    .append(isPair ? "twice, and so gets two" : count)
+                    .append(isPair ? "" : " times, and so gets ")
+                    .append(isPair ? "" : count);
                 add(Severity::Warning, *same[1], message.append(" columns"));
             }
         }
