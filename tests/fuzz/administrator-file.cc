@@ -25,18 +25,21 @@ namespace {
 
 std::size_t allocatedOctets = 0;  // since the program began, also of what is free again
 
-void* allocated(std::size_t octets) {
+void* allocated(std::size_t octets) noexcept {
     allocatedOctets += octets;
-    void* memory = std::malloc(octets > 0 ? octets : 1);
-    if (memory == nullptr) {
-        throw std::bad_alloc();
-    }
-    return memory;
+    return std::malloc(octets > 0 ? octets : 1);
 }
 
 }  // namespace
 
 void* operator new(std::size_t octets) {
+    if (void* memory = allocated(octets)) {
+        return memory;
+    }
+    throw std::bad_alloc();
+}
+
+void* operator new(std::size_t octets, const std::nothrow_t&) noexcept {
     return allocated(octets);
 }
 
