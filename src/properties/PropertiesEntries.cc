@@ -3,6 +3,7 @@
 #include <cstdint>
 #include <optional>
 #include <string>
+#include <utility>
 
 #include "utf8/Utf8.h"
 
@@ -204,6 +205,16 @@ std::string_view PropertiesEntries::takeContinuedLine() {
     }
     joined.append(line);
     return joined;
+}
+
+std::map<std::string, PropertiesEntry> lastEntriesIn(std::string_view text) {
+    std::map<std::string, PropertiesEntry> last;
+    PropertiesEntries entries(text);
+    while (std::optional<PropertiesEntry> entry = entries.next()) {
+        const std::string key = entry->key;
+        last.insert_or_assign(key, std::move(*entry));
+    }
+    return last;
 }
 
 }  // namespace Velm

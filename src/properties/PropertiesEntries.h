@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstddef>
+#include <map>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -45,5 +46,8 @@ class PropertiesEntries {
     unsigned lineNumber = 0;
     FirstLine firstLine;  // of the entry
 };
+
+// The entries of the text that count, which are the last ones of their keys.
+std::map<std::string, PropertiesEntry> lastEntriesIn(std::string_view text);
 
 }  // namespace Velm

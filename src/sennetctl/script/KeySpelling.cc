@@ -1,10 +1,8 @@
 #include "script/KeySpelling.h"
 
 #include <map>
-#include <optional>
 #include <utility>
 
-#include "properties/PropertiesEntries.h"
 #include "script/NameCheck.h"
 #include "script/ScriptText.h"
 
@@ -15,28 +13,16 @@ namespace {
 constexpr std::string_view kTitle = "title.";
 constexpr std::string_view kSize = ".Size";
 
-bool beginsWith(std::string_view text, std::string_view beginning) {
-    return text.substr(0, beginning.size()) == beginning;
-}
-
-bool endsWith(std::string_view text, std::string_view end) {
-    return text.size() >= end.size() && text.substr(text.size() - end.size()) == end;
-}
-
 /// What is wrong with these parts is told of every key.
 bool hasSameParts(std::string_view one, std::string_view other) {
-    return beginsWith(one, kTitle) == beginsWith(other, kTitle) &&
-           endsWith(one, kSize) == endsWith(other, kSize);
+    return one.starts_with(kTitle) == other.starts_with(kTitle) &&
+           one.ends_with(kSize) == other.ends_with(kSize);
 }
 
 }  // namespace
 
-KeySpelling::KeySpelling(std::string theFile, std::string_view octets) : file(std::move(theFile)) {
-    Velm::PropertiesEntries entries(octets);
-    while (const std::optional<Velm::PropertiesEntry> entry = entries.next()) {
-        keys.insert_or_assign(entry->key, Place{entry->line, entry->keyColumn});
-    }
-}
+KeySpelling::KeySpelling(std::string theFile, std::string_view octets)
+    : file(std::move(theFile)), keys(Velm::lastEntriesIn(octets)) {}
 
 void KeySpelling::look(const ScriptModel& model) {
     wanted.insert(titleKey(ownTitle(model)));
@@ -61,10 +47,10 @@ void KeySpelling::tell(bool areAll, std::vector<Finding>& findings) const {
     }
     const std::string effect =
         areAll ? "line without effect" : "line without effect on these scripts";
-    for (const auto& [key, place] : keys) {
+    for (const auto& [key, entry] : keys) {
         const auto meant = missing.find(inSmallLetters(key));
         if (meant != missing.end() && wanted.count(key) == 0 && hasSameParts(key, meant->second)) {
-            findings.push_back({file, place.line, place.column, Severity::Warning,
+            findings.push_back({file, entry.line, entry.keyColumn, Severity::Warning,
                                 effect + ": sennet looks for " + meant->second});
         }
     }

@@ -8,6 +8,7 @@
 #include <string_view>
 #include <vector>
 
+#include "properties/PropertiesEntries.h"
 #include "report/Finding.h"
 #include "script/ScriptModel.h"
 
@@ -28,13 +29,8 @@ class KeySpelling {
     void tell(bool areAll, std::vector<Finding>& findings) const;
 
   private:
-    struct Place {
-        unsigned line = 0;
-        unsigned column = 0;
-    };
-
     std::string file;
-    std::map<std::string, Place> keys;  // the last of equal ones, which counts
+    std::map<std::string, Velm::PropertiesEntry> keys;
     std::set<std::string> wanted;
 };
 

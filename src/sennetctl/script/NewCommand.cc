@@ -23,17 +23,17 @@ namespace sennetctl {
 
 namespace {
 
-constexpr std::string_view kSuffix = ".script.inv";
 constexpr std::size_t kLongestTitle = 13;  // what no product shortens
 
 /// The path without .script.inv.
 std::string pathWithoutSuffix(const std::string& script) {
     const std::string name = std::filesystem::path(script).filename().string();
-    if (name.size() <= kSuffix.size() ||
-        name.compare(name.size() - kSuffix.size(), kSuffix.size(), kSuffix) != 0) {
+    if (name.size() <= kScriptSuffix.size() ||
+        name.compare(name.size() - kScriptSuffix.size(), kScriptSuffix.size(), kScriptSuffix) !=
+            0) {
         throw CannotRun(script, "the name of a script ends in .script.inv");
     }
-    return script.substr(0, script.size() - kSuffix.size());
+    return script.substr(0, script.size() - kScriptSuffix.size());
 }
 
 /// What no script can write, or breaks the files that are made of it.

@@ -2,9 +2,7 @@
 
 #include <iterator>
 #include <map>
-#include <optional>
 #include <string>
-#include <utility>
 
 namespace sennetctl {
 
@@ -12,14 +10,9 @@ namespace {
 
 using Velm::PropertiesEntry;
 
-/// The last entry of each key, empty values left out: they stand for the default.
+/// Without empty values, which stand for the default.
 std::map<std::string, PropertiesEntry> entriesIn(std::string_view octets) {
-    std::map<std::string, PropertiesEntry> entries;
-    Velm::PropertiesEntries reader(octets);
-    while (std::optional<PropertiesEntry> entry = reader.next()) {
-        const std::string key = entry->key;
-        entries.insert_or_assign(key, std::move(*entry));
-    }
+    std::map<std::string, PropertiesEntry> entries = Velm::lastEntriesIn(octets);
     for (auto entry = entries.begin(); entry != entries.end();) {
         entry = entry->second.value.empty() ? entries.erase(entry) : std::next(entry);
     }

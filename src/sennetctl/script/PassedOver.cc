@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <filesystem>
-#include <string_view>
 #include <system_error>
 
 #include "script/ScriptText.h"
@@ -12,12 +11,6 @@ namespace sennetctl {
 namespace {
 
 namespace fs = std::filesystem;
-
-bool isCalledAsScript(const std::string& name) {
-    constexpr std::string_view kEnding = ".script.inv";
-    return name.size() >= kEnding.size() &&
-           sameIgnoringCase(std::string_view(name).substr(name.size() - kEnding.size()), kEnding);
-}
 
 /// Null for a file.
 const char* kindOf(const fs::directory_entry& entry) {
@@ -43,7 +36,7 @@ void checkPassedOver(const std::string& directory, std::vector<Finding>& finding
     for (fs::directory_iterator entry(directory, error), end; !error && entry != end;
          entry.increment(error)) {
         const std::string name = entry->path().filename().string();
-        const char* kind = isCalledAsScript(name) ? kindOf(*entry) : nullptr;
+        const char* kind = isCalledScript(name) ? kindOf(*entry) : nullptr;
         if (kind != nullptr) {
             // As the files that are read are named.
             std::string path = directory;

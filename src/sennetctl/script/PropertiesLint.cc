@@ -9,7 +9,6 @@
 #include <map>
 #include <optional>
 #include <system_error>
-#include <utility>
 
 #include "properties/PropertiesEntries.h"
 #include "report/Text.h"
@@ -72,16 +71,6 @@ std::vector<std::string> pathFaults(const std::string& path) {
     return faults;
 }
 
-/// The line of the last entry of each key.
-std::map<std::string, unsigned> lastLinesIn(std::string_view octets) {
-    std::map<std::string, unsigned> lines;
-    Velm::PropertiesEntries entries(octets);
-    while (std::optional<PropertiesEntry> entry = entries.next()) {
-        lines.insert_or_assign(std::move(entry->key), entry->line);
-    }
-    return lines;
-}
-
 class PropertiesLint {
   public:
     PropertiesLint(const std::string& theFile, std::vector<Finding>& theFindings)
@@ -97,10 +86,10 @@ class PropertiesLint {
                 "UTF-8");
             return;
         }
-        const std::map<std::string, unsigned> lastLines = lastLinesIn(octets);
+        const std::map<std::string, PropertiesEntry> last = Velm::lastEntriesIn(octets);
         Velm::PropertiesEntries entries(octets);
         while (const std::optional<PropertiesEntry> entry = entries.next()) {
-            const bool isReplaced = entry->line < lastLines.at(entry->key);
+            const bool isReplaced = entry->line < last.at(entry->key).line;
             if (!isReplaced) {
                 noteEncoding(*entry);
             }

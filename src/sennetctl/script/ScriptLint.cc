@@ -14,7 +14,6 @@ namespace {
 constexpr const char* kGivenUp = ": sennet gives the whole script up";
 constexpr const char* kBrokenOff =
     ": sennet breaks the MIF file off in its middle, for CA and QVE the file of all scripts";
-constexpr const char* kSuffix = ".script.inv";
 
 struct Meaning {
     std::string text;
@@ -90,12 +89,10 @@ class Checker {
 
     void checkFileName() {
         const std::string& file = model.file;
-        const std::size_t length = std::string_view(kSuffix).size();
-        if (file.size() < length ||
-            !sameIgnoringCase(std::string_view(file).substr(file.size() - length), kSuffix)) {
+        if (!isCalledScript(file)) {
             add(Severity::Warning, {},
                 "the file's name does not end in .script.inv: sennet does not read it");
-        } else if (std::filesystem::path(file).filename().string().size() == length) {
+        } else if (std::filesystem::path(file).filename().string().size() == kScriptSuffix.size()) {
             add(Severity::Warning, {},
                 "the file's name has nothing before .script.inv: for SMS and LANDesk sennet writes "
                 "no file");

@@ -49,6 +49,11 @@ std::string inSmallLetters(std::string text) {
     return text;
 }
 
+bool isCalledScript(std::string_view path) {
+    return path.size() >= kScriptSuffix.size() &&
+           sameIgnoringCase(path.substr(path.size() - kScriptSuffix.size()), kScriptSuffix);
+}
+
 std::string titleKey(std::string title) {
     std::replace(title.begin(), title.end(), ' ', '_');
     return "title." + title;

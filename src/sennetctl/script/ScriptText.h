@@ -20,6 +20,10 @@ bool sameIgnoringCase(std::string_view one, std::string_view other);
 /// With the case of ASCII letters taken away.
 std::string inSmallLetters(std::string text);
 
+/// What the names of inventory scripts end in, in any case.
+constexpr std::string_view kScriptSuffix = ".script.inv";
+bool isCalledScript(std::string_view path);
+
 /// The key of the resource properties under which the generator looks a title up.
 std::string titleKey(std::string title);
 

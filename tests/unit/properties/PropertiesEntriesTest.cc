@@ -49,5 +49,14 @@ TEST(PropertiesEntriesTest, EveryTextIsAccepted) {
     EXPECT_EQ(entriesOf("a\xFF=\xFE"), "1:1:4 a\xFF=\xFE\n");
 }
 
+TEST(PropertiesEntriesTest, TheLastEntryOfAKeyCounts) {
+    const auto last = lastEntriesIn("a=b\nc=d\na\n c =e\n");
+    ASSERT_EQ(last.size(), 2U);
+    EXPECT_EQ(last.at("a").line, 3U);
+    EXPECT_FALSE(last.at("a").hasSeparator);
+    EXPECT_EQ(last.at("c").value, "e");
+    EXPECT_EQ(last.at("c").keyColumn, 2U);
+}
+
 }  // namespace
 }  // namespace Velm
